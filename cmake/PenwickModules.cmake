@@ -1,0 +1,34 @@
+# The one way in which folders become targets, and the flags that all of them share.
+
+add_library(penwick_flags INTERFACE)
+target_compile_definitions(
+  penwick_flags INTERFACE QT_NO_KEYWORDS QT_NO_CAST_FROM_ASCII QT_NO_CAST_TO_ASCII
+                          QT_DISABLE_DEPRECATED_BEFORE=0x060400)
+target_compile_options(
+  penwick_flags INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual
+                          -Wcast-qual -Wformat=2)
+if(PENWICK_WARNINGS_AS_ERRORS)
+  target_compile_options(penwick_flags INTERFACE -Werror)
+endif()
+if(PENWICK_SANITIZE)
+  target_compile_options(penwick_flags INTERFACE -fsanitize=address,undefined
+                                                 -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  target_link_options(penwick_flags INTERFACE -fsanitize=address,undefined)
+endif()
+
+# penwick_add_module(NAME SOURCES file... [QT component...] [DEPENDS module...] [LIBRARIES target...])
+#
+# Makes the object library penwick_NAME of one folder under src/. DEPENDS names the modules whose
+# headers the folder may include; a test holds it against the includes.
+function(penwick_add_module name)
+  cmake_parse_arguments(arg "" "" "SOURCES;QT;DEPENDS;LIBRARIES" ${ARGN})
+  add_library(penwick_${name} OBJECT ${arg_SOURCES})
+  target_compile_definitions(penwick_${name} PRIVATE PENWICK_BUILD)
+  target_include_directories(penwick_${name} PUBLIC ${PROJECT_SOURCE_DIR}/include
+                                                    ${PROJECT_SOURCE_DIR}/src)
+  set_target_properties(penwick_${name} PROPERTIES AUTOUIC_SEARCH_PATHS
+                                                   ${PROJECT_SOURCE_DIR}/src/resources/ui)
+  list(TRANSFORM arg_QT PREPEND Qt6::)
+  target_link_libraries(penwick_${name} PUBLIC penwick_flags ${arg_QT} ${arg_LIBRARIES})
+  set_property(GLOBAL APPEND PROPERTY PENWICK_MODULES penwick_${name})
+endfunction()

@@ -1,0 +1,104 @@
+// SPDX-License-Identifier: MIT
+// A path of moves, lines and curves with its own line attributes and an identity.
+#pragma once
+
+#include <penwick/Export.h>
+#include <penwick/platform/Geometry.h>
+
+#include <QPainterPath>
+
+#include <array>
+#include <cstdint>
+#include <initializer_list>
+#include <vector>
+
+namespace penwick::platform {
+
+enum class LineCapStyle
+{
+    Butt = 0,
+    Round = 1,
+    Square = 2
+};
+enum class LineJoinStyle
+{
+    Miter = 0,
+    Round = 1,
+    Bevel = 2
+};
+
+/// A path that is a thing of its own: two paths with the same geometry are still two.
+///
+/// Coordinates are points, y up, in the space of whatever draws it. Never copied; shared by
+/// reference. GUI thread only.
+class PENWICK_EXPORT BezierPath
+{
+public:
+    enum class ElementKind : std::uint8_t
+    {
+        MoveTo,
+        LineTo,
+        CurveTo,
+        ClosePath
+    };
+
+    /// One step of the path. MoveTo and LineTo use points[0]; CurveTo has its two control points
+    /// in points[0] and points[1] and its end in points[2]; ClosePath uses none.
+    struct Element
+    {
+        ElementKind kind = ElementKind::MoveTo;
+        std::array<Point, 3> points {};
+    };
+
+    BezierPath();
+    BezierPath(const BezierPath &) = delete;
+    BezierPath &operator=(const BezierPath &) = delete;
+
+    /// Identity of this object: unique in the process, the same for the object's whole life.
+    [[nodiscard]] std::int64_t hash() const { return m_hash; }
+
+    [[nodiscard]] int elementCount() const { return static_cast<int>(m_elements.size()); }
+    /// The element at `index`, which must be from 0 to elementCount() - 1.
+    [[nodiscard]] Element elementAtIndex(int index) const;
+
+    void moveToPoint(Point point);
+    void lineToPoint(Point point);
+    void curveToPoint(Point end, Point control1, Point control2);
+    void closePath();
+
+    [[nodiscard]] double lineWidth() const { return m_lineWidth; }
+    void setLineWidth(double width) { m_lineWidth = width; } ///< points
+    [[nodiscard]] LineCapStyle lineCapStyle() const { return m_lineCapStyle; }
+    void setLineCapStyle(LineCapStyle style) { m_lineCapStyle = style; }
+    [[nodiscard]] LineJoinStyle lineJoinStyle() const { return m_lineJoinStyle; }
+    void setLineJoinStyle(LineJoinStyle style) { m_lineJoinStyle = style; }
+
+    /// The smallest rectangle that holds every point of the path, control points included, and so
+    /// the path itself, its thickness aside. Empty at the origin for a path without elements.
+    /// Known without a walk over the path.
+    [[nodiscard]] Rect controlPointBounds() const;
+
+    /// A new general path with the same elements in the same order and coordinates; empty for a
+    /// path without elements. Built at every call.
+    [[nodiscard]] QPainterPath CGPath() const; // NOLINT(readability-identifier-naming): fixed name
+
+private:
+    struct Step
+    {
+        ElementKind kind;
+        std::uint32_t firstPoint;
+    };
+
+    void append(ElementKind kind, std::initializer_list<Point> points);
+
+    const std::int64_t m_hash;
+    double m_lineWidth = 1.0;
+    LineCapStyle m_lineCapStyle = LineCapStyle::Butt;
+    LineJoinStyle m_lineJoinStyle = LineJoinStyle::Miter;
+    std::vector<Step> m_elements;
+    std::vector<Point> m_points;
+    Point m_lowest; // corners of the bounds; meaningful once there is a point
+    Point m_highest;
+};
+
+} // namespace penwick::platform

@@ -1,0 +1,102 @@
+// SPDX-License-Identifier: MIT
+#include <penwick/platform/BezierPath.h>
+
+#include "platform/foundation/ObjectIdentifier.h"
+
+#include <algorithm>
+
+namespace penwick::platform {
+
+namespace {
+
+std::size_t pointCount(BezierPath::ElementKind kind)
+{
+    switch (kind) {
+    case BezierPath::ElementKind::MoveTo:
+    case BezierPath::ElementKind::LineTo:
+        return 1;
+    case BezierPath::ElementKind::CurveTo:
+        return 3;
+    case BezierPath::ElementKind::ClosePath:
+        return 0;
+    }
+    return 0;
+}
+
+} // namespace
+
+BezierPath::BezierPath()
+    : m_hash(nextObjectIdentifier())
+{ }
+
+BezierPath::Element BezierPath::elementAtIndex(int index) const
+{
+    const Step step = m_elements.at(static_cast<std::size_t>(index));
+    Element element { step.kind, {} };
+    std::copy_n(m_points.begin() + step.firstPoint, pointCount(step.kind), element.points.begin());
+    return element;
+}
+
+void BezierPath::append(ElementKind kind, std::initializer_list<Point> points)
+{
+    m_elements.push_back({ kind, static_cast<std::uint32_t>(m_points.size()) });
+    for (const Point point : points) {
+        if (m_points.empty())
+            m_lowest = m_highest = point;
+        m_lowest = { std::min(m_lowest.x, point.x), std::min(m_lowest.y, point.y) };
+        m_highest = { std::max(m_highest.x, point.x), std::max(m_highest.y, point.y) };
+        m_points.push_back(point);
+    }
+}
+
+void BezierPath::moveToPoint(Point point)
+{
+    append(ElementKind::MoveTo, { point });
+}
+
+void BezierPath::lineToPoint(Point point)
+{
+    append(ElementKind::LineTo, { point });
+}
+
+void BezierPath::curveToPoint(Point end, Point control1, Point control2)
+{
+    append(ElementKind::CurveTo, { control1, control2, end });
+}
+
+void BezierPath::closePath()
+{
+    append(ElementKind::ClosePath, {});
+}
+
+Rect BezierPath::controlPointBounds() const
+{
+    return Rect::spanning(m_lowest, m_highest);
+}
+
+QPainterPath BezierPath::CGPath() const
+{
+    const auto toQt = [](Point point) { return QPointF(point.x, point.y); };
+
+    QPainterPath path;
+    for (int index = 0; index < elementCount(); ++index) {
+        const Element element = elementAtIndex(index);
+        switch (element.kind) {
+        case ElementKind::MoveTo:
+            path.moveTo(toQt(element.points[0]));
+            break;
+        case ElementKind::LineTo:
+            path.lineTo(toQt(element.points[0]));
+            break;
+        case ElementKind::CurveTo:
+            path.cubicTo(toQt(element.points[0]), toQt(element.points[1]), toQt(element.points[2]));
+            break;
+        case ElementKind::ClosePath:
+            path.closeSubpath();
+            break;
+        }
+    }
+    return path;
+}
+
+} // namespace penwick::platform

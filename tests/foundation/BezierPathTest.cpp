@@ -1,0 +1,148 @@
+// SPDX-License-Identifier: MIT
+// Elements in, elements out, and the general path made of them.
+#include <penwick/platform/BezierPath.h>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using penwick::platform::BezierPath;
+using penwick::platform::Point;
+using penwick::platform::Rect;
+using Kind = BezierPath::ElementKind;
+
+void expectElement(
+    const QPainterPath &path, int index, QPainterPath::ElementType type, double x, double y)
+{
+    const QPainterPath::Element element = path.elementAt(index);
+    EXPECT_EQ(element.type, type) << "element " << index;
+    EXPECT_EQ(element.x, x) << "element " << index;
+    EXPECT_EQ(element.y, y) << "element " << index;
+}
+
+TEST(BezierPath, newPathHasNoElementsAndPlainLineAttributes)
+{
+    const BezierPath path;
+
+    EXPECT_EQ(path.elementCount(), 0);
+    EXPECT_EQ(path.lineWidth(), 1.0);
+    EXPECT_EQ(path.lineCapStyle(), penwick::platform::LineCapStyle::Butt);
+    EXPECT_EQ(path.lineJoinStyle(), penwick::platform::LineJoinStyle::Miter);
+    EXPECT_EQ(static_cast<int>(penwick::platform::LineCapStyle::Round), 1);
+    EXPECT_EQ(static_cast<int>(penwick::platform::LineJoinStyle::Round), 1);
+}
+
+TEST(BezierPath, elementsComeBackInTheOrderInWhichTheyWereAppended)
+{
+    BezierPath path;
+    path.moveToPoint({ 1, 2 });
+    path.lineToPoint({ 3, 4 });
+    path.curveToPoint({ 9, 10 }, { 5, 6 }, { 7, 8 });
+    path.closePath();
+
+    ASSERT_EQ(path.elementCount(), 4);
+    EXPECT_EQ(path.elementAtIndex(0).kind, Kind::MoveTo);
+    EXPECT_EQ(path.elementAtIndex(0).points[0], (Point { 1, 2 }));
+    EXPECT_EQ(path.elementAtIndex(1).kind, Kind::LineTo);
+    EXPECT_EQ(path.elementAtIndex(1).points[0], (Point { 3, 4 }));
+    EXPECT_EQ(path.elementAtIndex(2).kind, Kind::CurveTo);
+    EXPECT_EQ(path.elementAtIndex(2).points[0], (Point { 5, 6 }));
+    EXPECT_EQ(path.elementAtIndex(2).points[1], (Point { 7, 8 }));
+    EXPECT_EQ(path.elementAtIndex(2).points[2], (Point { 9, 10 }));
+    EXPECT_EQ(path.elementAtIndex(3).kind, Kind::ClosePath);
+}
+
+TEST(BezierPath, generalPathOfNothingIsEmpty)
+{
+    EXPECT_EQ(BezierPath().CGPath().elementCount(), 0);
+}
+
+TEST(BezierPath, generalPathOfOneCurveIsOneMoveAndOneCurveWithControlPointsInOrder)
+{
+    BezierPath path;
+    path.moveToPoint({ 0, 1 });
+    path.curveToPoint({ 60, 70 }, { 20, 30 }, { 40, 50 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 4); // a curve takes three: two controls and the end
+    expectElement(general, 0, QPainterPath::MoveToElement, 0, 1);
+    expectElement(general, 1, QPainterPath::CurveToElement, 20, 30);
+    expectElement(general, 2, QPainterPath::CurveToDataElement, 40, 50);
+    expectElement(general, 3, QPainterPath::CurveToDataElement, 60, 70);
+}
+
+TEST(BezierPath, generalPathKeepsEverySubpathApart)
+{
+    BezierPath path;
+    path.moveToPoint({ 0, 0 });
+    path.lineToPoint({ 10, 0 });
+    path.moveToPoint({ 10, 0 });
+    path.lineToPoint({ 10, 10 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 4);
+    expectElement(general, 0, QPainterPath::MoveToElement, 0, 0);
+    expectElement(general, 1, QPainterPath::LineToElement, 10, 0);
+    expectElement(general, 2, QPainterPath::MoveToElement, 10, 0);
+    expectElement(general, 3, QPainterPath::LineToElement, 10, 10);
+}
+
+TEST(BezierPath, closingLeadsTheGeneralPathBackToTheStartOfItsSubpath)
+{
+    BezierPath path;
+    path.moveToPoint({ 1, 1 });
+    path.lineToPoint({ 5, 1 });
+    path.lineToPoint({ 5, 5 });
+    path.closePath();
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 4);
+    expectElement(general, 3, QPainterPath::LineToElement, 1, 1);
+}
+
+TEST(BezierPath, generalPathIsMadeAnewAndDoesNotFollowThePath)
+{
+    BezierPath path;
+    path.moveToPoint({ 0, 0 });
+    path.lineToPoint({ 1, 1 });
+    const QPainterPath before = path.CGPath();
+
+    path.lineToPoint({ 2, 2 });
+
+    EXPECT_EQ(before.elementCount(), 2);
+    EXPECT_EQ(path.CGPath().elementCount(), 3);
+}
+
+TEST(BezierPath, boundsHoldEveryPointOfThePath)
+{
+    BezierPath path;
+    EXPECT_EQ(path.controlPointBounds(), (Rect { 0, 0, 0, 0 }));
+
+    path.moveToPoint({ 10, 20 });
+    EXPECT_EQ(path.controlPointBounds(), (Rect { 10, 20, 0, 0 }));
+
+    path.lineToPoint({ 4, 25 });
+    EXPECT_EQ(path.controlPointBounds(), (Rect { 4, 20, 6, 5 }));
+
+    path.curveToPoint({ 5, 21 }, { 30, 0 }, { 0, 22 });
+    path.closePath();
+    EXPECT_EQ(path.controlPointBounds(), (Rect { 0, 0, 30, 25 }));
+}
+
+TEST(BezierPath, equalPathsHaveDifferentHashesThatStay)
+{
+    BezierPath first;
+    const BezierPath second;
+    const std::int64_t hash = first.hash();
+
+    first.moveToPoint({ 1, 1 });
+    first.setLineWidth(7.0);
+
+    EXPECT_EQ(first.hash(), hash);
+    EXPECT_NE(first.hash(), second.hash());
+}
+
+} // namespace
