@@ -1,0 +1,167 @@
+// SPDX-License-Identifier: MIT
+// A top-level window placed by its outer frame.
+#pragma once
+
+#include <penwick/Export.h>
+#include <penwick/platform/Geometry.h>
+
+#include <QColor>
+#include <QPointer>
+#include <QWidget>
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+class QScreen;
+
+namespace penwick::platform {
+
+class View;
+class ViewController;
+class WindowController;
+
+/// Bits of a window's style mask.
+namespace StyleMask {
+constexpr unsigned titled = 1;
+constexpr unsigned closable = 2;
+constexpr unsigned miniaturizable = 4;
+constexpr unsigned resizable = 8;
+constexpr unsigned unifiedTitleAndToolbar = 4096;
+constexpr unsigned fullSizeContentView = 32768;
+} // namespace StyleMask
+
+/// What a window is like. Each value is kept as it is set; what the desktop has no notion of has
+/// no effect there.
+struct WindowAttributes
+{
+    unsigned styleMask = StyleMask::titled | StyleMask::closable | StyleMask::miniaturizable;
+    unsigned collectionBehavior = 0; ///< 1: on all virtual desktops; 256: beside full screen
+    int level = 0; ///< 0: an ordinary window; above 0: over those
+    unsigned sharingType = 1; ///< 0: not to be seen by a capture of the screen
+    unsigned titleVisibility = 0; ///< 1: hidden
+    int animationBehavior = 0;
+    bool titlebarAppearsTransparent = false;
+    bool hasShadow = true;
+    bool isOpaque = true;
+    bool ignoresMouseEvents = false;
+    QColor backgroundColor = Qt::white;
+    std::optional<Size> aspectRatio; ///< of the frame, kept while the user resizes
+
+    friend bool operator==(const WindowAttributes &, const WindowAttributes &) = default;
+};
+
+/// Told of what happens to a window, once for each thing that happened. A delegate is a QObject.
+class PENWICK_EXPORT WindowDelegate
+{
+public:
+    virtual ~WindowDelegate();
+    virtual void windowDidMove() { }
+    virtual void windowWillClose() { }
+};
+
+enum class Animate
+{
+    No,
+    Yes
+};
+
+/// A window whose frame is its outer one, title bar included, in points, y up, from the primary
+/// screen's bottom left corner. Inside it, views have frames from the content's bottom left.
+///
+/// It never ends the host by being the last one closed. GUI thread only.
+class PENWICK_EXPORT Window : public QWidget
+{
+    Q_OBJECT
+
+public:
+    explicit Window(QWidget *parent = nullptr);
+    ~Window() override;
+
+    // Frame
+
+    /// Where the window is; what was asked last, until the desktop has granted something else.
+    [[nodiscard]] Rect frame() const;
+    /// Asks for `frame` and returns at once. With Animate::Yes a window on the screen glides
+    /// there; frame() answers the target meanwhile.
+    void setFrame(const Rect &frame, Animate animate = Animate::No);
+    void setFrameOrigin(Point origin);
+
+    // Attributes
+
+    [[nodiscard]] const WindowAttributes &attributes() const { return m_attributes; }
+    void setAttributes(const WindowAttributes &attributes);
+
+    // Child windows
+
+    /// Makes `child` stand above this window: it moves with it, stays where it is when this one is
+    /// resized, and is on the screen only while this one is. Puts it on the screen if it can be
+    /// there. A child of this window already is only brought to the front.
+    void addChildWindow(Window &child);
+    /// The window whose child this is; null without one.
+    [[nodiscard]] Window *parentWindow() const;
+    [[nodiscard]] std::vector<Window *> childWindows() const; ///< in the order of adding
+
+    // Content
+
+    [[nodiscard]] View *contentView() const { return m_contentView; }
+    /// Lets `view`, one of this window's own widgets, fill the window's content.
+    void setContentView(View *view);
+    [[nodiscard]] ViewController *contentViewController() const;
+    /// Takes `controller`, whose view must be one of this window's own.
+    void setContentViewController(std::unique_ptr<ViewController> controller);
+    [[nodiscard]] WindowController *windowController() const;
+    void setWindowController(WindowController *controller);
+    void setDelegate(WindowDelegate *delegate); ///< weak
+
+    // Responders
+
+    /// Who gets the keys. Null: the window itself. Kept while the window is not active.
+    [[nodiscard]] View *firstResponder() const { return m_firstResponder; }
+    /// Makes `view` (null: the window itself) the first responder after the present one resigned.
+    /// Answers whether it is the first responder now.
+    bool makeFirstResponder(View *view);
+    /// Whether this is the window that gets the keys.
+    [[nodiscard]] bool isKeyWindow() const { return isActiveWindow(); }
+    void forgetView(const View &view); ///< `view` is being destroyed
+    /// Makes views of the widgets that a scene built in this window.
+    void adoptScene();
+
+    /// Takes the cursors of `view` as it declares them now.
+    void invalidateCursorRects(View &view);
+
+    /// Puts the window in front of the others without making it the key window. A child of a
+    /// window that is not on the screen comes up together with that one.
+    void orderFront();
+    /// Takes the window and its children off the screen without closing it.
+    void orderOut();
+
+    void setVisible(bool visible) override;
+
+protected:
+    void changeEvent(QEvent *event) override;
+    void closeEvent(QCloseEvent *event) override;
+    void paintEvent(QPaintEvent *event) override;
+    void resizeEvent(QResizeEvent *event) override;
+
+private:
+    void applyAttributes();
+    [[nodiscard]] bool canShow() const;
+    void showFamily();
+    void hideFamily();
+    void takeChildrenAlong(QPoint delta);
+    [[nodiscard]] std::vector<View *> topViews() const;
+
+    class Private;
+    const std::unique_ptr<Private> d; // keeps native headers out of this file
+    WindowAttributes m_attributes;
+    QPointer<QObject> m_delegateObject;
+    WindowDelegate *m_delegate = nullptr;
+    View *m_contentView = nullptr;
+    View *m_firstResponder = nullptr;
+};
+
+/// `screen`'s area, in points, y up, from the primary screen's bottom left corner.
+[[nodiscard]] PENWICK_EXPORT Rect frameOfScreen(const QScreen &screen);
+
+} // namespace penwick::platform

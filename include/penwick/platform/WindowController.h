@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: MIT
+// The owner of a window.
+#pragma once
+
+#include <penwick/Export.h>
+
+#include <QObject>
+
+#include <memory>
+
+namespace penwick::platform {
+
+class Window;
+
+/// Holds a window and keeps it alive; the window goes with its controller. GUI thread only.
+class PENWICK_EXPORT WindowController : public QObject
+{
+    Q_OBJECT
+
+public:
+    WindowController();
+    ~WindowController() override;
+
+    /// The window; null before it was loaded.
+    [[nodiscard]] Window *window() const;
+    /// Takes `window` and runs windowDidLoad(). Called once.
+    void setWindow(std::unique_ptr<Window> window);
+
+    /// Shows the window in front of the others and makes it the key window, if it is one that can
+    /// be. `sender` is whoever asks; it is not used.
+    Q_INVOKABLE void showWindow(QObject *sender);
+
+    /// Takes the window, and the windows that belong to it, off the screen. No end is announced.
+    void retire();
+
+    /// The window has been loaded.
+    virtual void windowDidLoad() { }
+
+private:
+    std::unique_ptr<Window> m_window;
+};
+
+} // namespace penwick::platform

@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+#include "platform/Bundle.h"
+
+#include "platform/SvgIconEngine.h"
+
+#include <QFile>
+
+namespace penwick::platform {
+
+Bundle::Bundle(const QString &imagePath)
+    : m_imagePath(imagePath)
+{ }
+
+QIcon Bundle::imageForResource(const QString &name) const
+{
+    const QString file = m_imagePath + QLatin1Char('/') + name + QStringLiteral(".svg");
+    return QFile::exists(file) ? QIcon(new SvgIconEngine(file)) : QIcon();
+}
+
+void Bundle::addScene(const QString &storyboard, const QString &identifier, SceneMaker maker)
+{
+    m_storyboards[storyboard].insert(identifier, std::move(maker));
+}
+
+Bundle::SceneMaker Bundle::scene(const QString &storyboard, const QString &identifier) const
+{
+    return m_storyboards.value(storyboard).value(identifier);
+}
+
+} // namespace penwick::platform

@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: MIT
+#include "platform/Cursor.h"
+
+#include "platform/View.h"
+
+#include <QGuiApplication>
+#include <QPixmap>
+#include <QWidget>
+
+#include <cmath>
+
+namespace penwick::platform {
+
+namespace {
+
+constexpr int largestCursor = 128; // points; more than any cursor's own size
+
+// X11 takes the hot spot in device pixels and Qt hands it on as it is given; elsewhere Qt scales.
+double hotSpotScale(double devicePixelRatio)
+{
+    return QGuiApplication::platformName() == QStringLiteral("xcb") ? devicePixelRatio : 1.0;
+}
+
+} // namespace
+
+struct Cursor::Data
+{
+    QIcon image;
+    Point hotSpot;
+};
+
+Cursor::Cursor(std::shared_ptr<const Data> data)
+    : m_data(std::move(data))
+{ }
+
+Cursor::Cursor(const QIcon &image, Point hotSpot)
+    : Cursor(std::make_shared<const Data>(Data { image, hotSpot }))
+{ }
+
+Cursor Cursor::arrow()
+{
+    static const auto data = std::make_shared<const Data>();
+    return Cursor(data);
+}
+
+Cursor &Cursor::current()
+{
+    static Cursor cursor = arrow();
+    return cursor;
+}
+
+Point Cursor::hotSpot() const
+{
+    return m_data->hotSpot;
+}
+
+QIcon Cursor::image() const
+{
+    return m_data->image;
+}
+
+QCursor Cursor::forScale(double devicePixelRatio) const
+{
+    if (m_data->image.isNull())
+        return QCursor(Qt::ArrowCursor);
+    const QSize size = m_data->image.actualSize(QSize(largestCursor, largestCursor));
+    const QPixmap pixmap = m_data->image.pixmap(size, devicePixelRatio);
+    const double scale = hotSpotScale(devicePixelRatio);
+    return QCursor(pixmap, static_cast<int>(std::lround(m_data->hotSpot.x * scale)),
+        static_cast<int>(std::lround(m_data->hotSpot.y * scale)));
+}
+
+void Cursor::set(View &view) const
+{
+    current() = *this;
+    view.surface().setCursor(forScale(view.widget().devicePixelRatioF()));
+}
+
+Cursor Cursor::currentCursor()
+{
+    return current();
+}
+
+} // namespace penwick::platform

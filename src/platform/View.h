@@ -1,0 +1,178 @@
+// SPDX-License-Identifier: MIT
+// A widget with a view's meaning: frames from the bottom left, ordered subviews that are shared
+// rather than owned, an optional layer, and events by the names under which classes override them.
+// What turns a widget class into a view is ViewOf.h.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+#include "platform/Cursor.h"
+#include "platform/Layer.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <vector>
+
+class QWidget;
+
+namespace penwick::platform {
+
+class Window;
+
+/// One press, drag, release or move of the left button's pointer.
+struct MouseEvent
+{
+    Point locationInWindow; ///< points from the bottom left corner of the window's content
+    int clickCount = 0; ///< 1 for a click, 2 for the second of a double click
+};
+
+/// One key going down or up.
+struct KeyEvent
+{
+    /// The key at the place of a keyboard's own Backspace.
+    static constexpr int backspaceKeyCode = 51;
+
+    int keyCode = 0; ///< 0 for every key that no view asks about
+};
+
+/// The view's half of a widget.
+///
+/// A subview that somebody else holds outlives its superview; one that a scene built belongs to
+/// its superview. A view that removes itself while it handles an event stays valid until the event
+/// is over. GUI thread only.
+class View
+{
+public:
+    View(const View &) = delete;
+    View &operator=(const View &) = delete;
+    virtual ~View();
+
+    /// The widget that this view is.
+    [[nodiscard]] QWidget &widget() const { return m_widget; }
+    /// The widget that shows the view's content: itself, or the viewport of a scrolling widget.
+    [[nodiscard]] virtual QWidget &surface() const = 0;
+
+    /// Identity: unique in the process, the same for the view's whole life.
+    [[nodiscard]] std::int64_t hash() const { return m_hash; }
+
+    // Geometry. Points; frames are in the superview's coordinates, or the window's content for a
+    // view that has no superview, with the origin at the bottom left. A frame is kept when the
+    // superview is resized.
+
+    [[nodiscard]] Rect frame() const { return m_frame; }
+    void setFrame(const Rect &frame);
+    void setFrameOrigin(Point origin);
+    [[nodiscard]] Rect bounds() const { return { 0.0, 0.0, m_frame.width, m_frame.height }; }
+    /// Whether the view's own coordinates run downwards from its top left corner.
+    [[nodiscard]] virtual bool isFlipped() const { return false; }
+    /// `point`, of this view's coordinates, in those of `view`; of the window where it is null.
+    [[nodiscard]] Point convertTo(Point point, const View *view) const;
+    /// `point`, of the coordinates of `view` (of the window where it is null), in this view's.
+    [[nodiscard]] Point convertFrom(Point point, const View *view) const;
+
+    // The tree.
+
+    [[nodiscard]] View *superview() const { return m_superview; }
+    [[nodiscard]] std::vector<View *> subviews() const; ///< the lowest first
+    /// Puts `view` on top of the other subviews; one that is a subview already stays where it is.
+    void addSubview(const std::shared_ptr<View> &view);
+    /// Keeps exactly `views`, which are subviews now, in that order, and removes the others.
+    void setSubviews(const std::vector<View *> &views);
+    /// Takes the view out of its superview. If it, or a view in it, is its window's first
+    /// responder, it resigns first. Without a superview nothing happens.
+    void removeFromSuperview();
+    /// The window that the view is in; null outside of one.
+    [[nodiscard]] Window *window() const;
+    [[nodiscard]] bool isHidden() const { return m_isHidden; }
+    void setHidden(bool hidden);
+
+    // Appearance.
+
+    /// Whether this view asked for a layer.
+    [[nodiscard]] bool wantsLayer() const { return m_wantsLayer; }
+    void setWantsLayer(bool wantsLayer);
+    /// The layer; null unless the view or a view around it asked for one.
+    [[nodiscard]] Layer *layer();
+    /// Paints the view again before the next event is waited for.
+    void setNeedsDisplay();
+    /// The same for a part of it, in the view's own coordinates.
+    void setNeedsDisplay(const Rect &rect);
+    /// Shows `cursor` while the pointer is over `rect`. Only the whole bounds are supported.
+    void addCursorRect(const Rect &rect, const Cursor &cursor);
+
+    // What classes override.
+
+    /// Paints the content; `dirtyRect` is in the view's own coordinates.
+    virtual void draw(const Rect &dirtyRect) = 0;
+    virtual void mouseDown(const MouseEvent &event) = 0;
+    virtual void mouseDragged(const MouseEvent &event) = 0; ///< only after a mouseDown()
+    virtual void mouseUp(const MouseEvent &event) = 0; ///< only after a mouseDown()
+    virtual void mouseMoved(const MouseEvent &event) = 0;
+    virtual void mouseEntered() { }
+    virtual void mouseExited() { }
+    virtual void keyUp(const KeyEvent &event) = 0;
+    /// Declares the view's cursors with addCursorRect().
+    virtual void resetCursorRects() { }
+    /// The view came into a window or left one.
+    virtual void viewDidMoveToWindow() { }
+    /// Answers whether the view gives the first responder up.
+    virtual bool resignFirstResponder() { return true; }
+
+    /// Makes views of the widgets that a scene built below this one: takes the frames from the
+    /// widgets' places and enters them as subviews, the lowest first.
+    void adoptScene();
+    /// Tells this view and those in it that they came into their window or left it.
+    void announceWindow();
+    /// Takes the cursors as resetCursorRects() declares them now.
+    void refreshCursorRects();
+    /// Puts the widget where the frame says; called when what is around it was resized.
+    void place();
+
+protected:
+    explicit View(QWidget &widget);
+
+    void widgetResized();
+    void pointerEntered();
+    /// `position`, of the surface's pixels from its top left corner, in window coordinates.
+    [[nodiscard]] Point locationInWindow(double x, double y) const;
+    /// The widget's area that `rect` covers, as Qt counts.
+    [[nodiscard]] QRectF toSurface(const Rect &rect) const;
+    [[nodiscard]] Rect fromSurface(const QRectF &rect) const;
+
+private:
+    struct Subview
+    {
+        View *view = nullptr;
+        std::shared_ptr<View> strong; // empty for what a scene built
+    };
+
+    void detachFrom(View &superview);
+    void resignInside();
+    [[nodiscard]] Point toWindow(Point point) const;
+    [[nodiscard]] Point fromWindow(Point point) const;
+
+    QWidget &m_widget;
+    const std::int64_t m_hash;
+    Rect m_frame;
+    View *m_superview = nullptr;
+    std::vector<Subview> m_subviews;
+    bool m_isHidden = false;
+    bool m_wantsLayer = false;
+    Layer m_layer;
+    std::optional<Cursor> m_cursor;
+};
+
+/// Makes a view that is held by reference: it is deleted from the event loop after the last
+/// reference is gone, so that it may drop that reference while it handles an event.
+template <class ViewClass, class... Arguments>
+std::shared_ptr<ViewClass> makeView(Arguments &&...arguments)
+{
+    return std::shared_ptr<ViewClass>(
+        new ViewClass(std::forward<Arguments>(arguments)...), [](ViewClass *view) {
+            view->widget().hide();
+            view->deleteLater();
+        });
+}
+
+} // namespace penwick::platform

@@ -1,0 +1,179 @@
+// SPDX-License-Identifier: MIT
+// Makes a view of any widget class: Qt's events go in, the view's operations come out.
+#pragma once
+
+#include "platform/View.h"
+
+#include <QAbstractScrollArea>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPaintEvent>
+#include <QPainter>
+
+#include <type_traits>
+
+namespace penwick::platform {
+
+/// `Base` as a view. What a class does not override does what `Base` does; a plain widget then
+/// hands the event on to the view around it.
+///
+/// Only the left button is the pointer here. The others are taken and ignored, so that a press of
+/// the wheel in the middle of a stroke neither draws nor reaches what lies below.
+template <class Base>
+class ViewOf : public Base, public View
+{
+public:
+    // Where both have the word, the view's meaning is meant.
+    using View::isHidden;
+    using View::setHidden;
+    using View::window;
+
+    explicit ViewOf(QWidget *parent = nullptr)
+        : Base(parent)
+        , View(static_cast<QWidget &>(*this))
+    {
+        this->setMouseTracking(true);
+    }
+
+    [[nodiscard]] QWidget &surface() const final
+    {
+        if constexpr (std::is_base_of_v<QAbstractScrollArea, Base>)
+            return *this->viewport();
+        else
+            return this->View::widget();
+    }
+
+    void draw(const Rect &) override { Base::paintEvent(m_paintEvent); }
+    void mouseDown(const MouseEvent &) override { Base::mousePressEvent(m_mouseEvent); }
+    void mouseDragged(const MouseEvent &) override { Base::mouseMoveEvent(m_mouseEvent); }
+    void mouseUp(const MouseEvent &) override { Base::mouseReleaseEvent(m_mouseEvent); }
+    void mouseMoved(const MouseEvent &) override { Base::mouseMoveEvent(m_mouseEvent); }
+    void keyUp(const KeyEvent &) override { Base::keyReleaseEvent(m_keyEvent); }
+
+protected:
+    /// A painter on the view in the view's own coordinates, with smooth edges. Only inside draw().
+    class Painter : public QPainter
+    {
+    public:
+        explicit Painter(const ViewOf &view)
+            : QPainter(&view.surface())
+        {
+            setRenderHint(QPainter::Antialiasing);
+            if (!view.isFlipped()) {
+                translate(0.0, view.View::widget().height());
+                scale(1.0, -1.0);
+            }
+        }
+    };
+
+    void paintEvent(QPaintEvent *event) override
+    {
+        Layer *const ownLayer = layer();
+        const QRectF area(surface().rect());
+        if (ownLayer) {
+            QPainter painter(&surface());
+            ownLayer->paintBackground(painter, area);
+        }
+        m_paintEvent = event;
+        draw(fromSurface(event->region().boundingRect()));
+        m_paintEvent = nullptr;
+        if (ownLayer) {
+            QPainter painter(&surface());
+            ownLayer->paintBorder(painter, area);
+        }
+    }
+
+    void mousePressEvent(QMouseEvent *event) override { press(event, 1); }
+    void mouseDoubleClickEvent(QMouseEvent *event) override { press(event, 2); }
+
+    void mouseMoveEvent(QMouseEvent *event) override
+    {
+        event->accept();
+        m_mouseEvent = event;
+        if (event->buttons() == Qt::NoButton)
+            mouseMoved(translated(event, 0));
+        else if (m_isPressed && event->buttons().testFlag(Qt::LeftButton))
+            mouseDragged(translated(event, m_clickCount));
+        m_mouseEvent = nullptr;
+    }
+
+    void mouseReleaseEvent(QMouseEvent *event) override
+    {
+        event->accept();
+        if (event->button() != Qt::LeftButton || !m_isPressed)
+            return;
+        m_isPressed = false;
+        m_mouseEvent = event;
+        mouseUp(translated(event, m_clickCount));
+        m_mouseEvent = nullptr;
+    }
+
+    void enterEvent(QEnterEvent *event) override
+    {
+        Base::enterEvent(event);
+        pointerEntered();
+        mouseEntered();
+    }
+
+    void leaveEvent(QEvent *event) override
+    {
+        Base::leaveEvent(event);
+        mouseExited();
+    }
+
+    void keyReleaseEvent(QKeyEvent *event) override
+    {
+        if (event->isAutoRepeat()) // the key is still down
+            return;
+        m_keyEvent = event;
+        keyUp({ event->key() == Qt::Key_Backspace ? KeyEvent::backspaceKeyCode : 0 });
+        m_keyEvent = nullptr;
+    }
+
+    // A plain widget would paint itself again whenever the keys come or go.
+    void focusInEvent(QFocusEvent *event) override
+    {
+        if constexpr (!std::is_same_v<Base, QWidget>)
+            Base::focusInEvent(event);
+    }
+
+    void focusOutEvent(QFocusEvent *event) override
+    {
+        if constexpr (!std::is_same_v<Base, QWidget>)
+            Base::focusOutEvent(event);
+    }
+
+    void resizeEvent(QResizeEvent *event) override
+    {
+        Base::resizeEvent(event);
+        widgetResized();
+    }
+
+private:
+    void press(QMouseEvent *event, int clickCount)
+    {
+        event->accept();
+        if (event->button() != Qt::LeftButton)
+            return;
+        m_isPressed = true;
+        m_clickCount = clickCount;
+        m_mouseEvent = event;
+        mouseDown(translated(event, clickCount));
+        m_mouseEvent = nullptr;
+    }
+
+    [[nodiscard]] MouseEvent translated(const QMouseEvent *event, int clickCount) const
+    {
+        const QPointF position = event->position();
+        return { locationInWindow(position.x(), position.y()), clickCount };
+    }
+
+    // The event being handled, for the operations that a class leaves to Base.
+    QPaintEvent *m_paintEvent = nullptr;
+    QMouseEvent *m_mouseEvent = nullptr;
+    QKeyEvent *m_keyEvent = nullptr;
+    bool m_isPressed = false;
+    int m_clickCount = 0;
+};
+
+} // namespace penwick::platform

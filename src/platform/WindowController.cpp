@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: MIT
+#include <penwick/platform/WindowController.h>
+
+#include <penwick/platform/Window.h>
+
+namespace penwick::platform {
+
+WindowController::WindowController() = default;
+WindowController::~WindowController() = default;
+
+Window *WindowController::window() const
+{
+    return m_window.get();
+}
+
+void WindowController::setWindow(std::unique_ptr<Window> window)
+{
+    m_window = std::move(window);
+    m_window->setWindowController(this);
+    windowDidLoad();
+}
+
+void WindowController::showWindow(QObject *)
+{
+    if (!m_window)
+        return;
+    m_window->show();
+    m_window->raise();
+    m_window->activateWindow();
+}
+
+void WindowController::retire()
+{
+    if (m_window)
+        m_window->orderOut();
+}
+
+} // namespace penwick::platform

@@ -1,0 +1,125 @@
+// SPDX-License-Identifier: MIT
+// X11, through Qt's own connection.
+#include "platform/native/NativeDesktop.h"
+
+#include <QElapsedTimer>
+#include <QGuiApplication>
+#include <QThread>
+#include <QWindow>
+
+#include <xcb/xcb.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <cstring>
+#include <string_view>
+#include <vector>
+
+namespace penwick::platform {
+
+namespace {
+
+// A window manager answers within a millisecond; one that does not is not waited for.
+constexpr int longestWait = 50; // ms
+
+template <class Reply>
+std::unique_ptr<Reply, decltype(&std::free)> owned(Reply *reply)
+{
+    return { reply, &std::free };
+}
+
+class NativeDesktopX11 final : public NativeDesktop
+{
+public:
+    explicit NativeDesktopX11(xcb_connection_t *connection)
+        : m_connection(connection)
+        , m_root(xcb_setup_roots_iterator(xcb_get_setup(connection)).data->root)
+        , m_supported(atom("_NET_SUPPORTED"))
+        , m_frameExtents(atom("_NET_FRAME_EXTENTS"))
+        , m_requestFrameExtents(atom("_NET_REQUEST_FRAME_EXTENTS"))
+    { }
+
+    std::optional<QMargins> frameMarginsBeforeShow(QWindow &window) override
+    {
+        if (!windowManagerSupports(m_requestFrameExtents))
+            return std::nullopt;
+        const auto id = static_cast<xcb_window_t>(window.winId());
+        // What an earlier showing left behind would be taken for the answer.
+        xcb_delete_property(m_connection, id, m_frameExtents);
+        askForFrameExtents(id);
+        QElapsedTimer clock;
+        clock.start();
+        while (clock.elapsed() < longestWait) {
+            const auto extents = numbers(id, m_frameExtents, XCB_ATOM_CARDINAL, 4);
+            if (extents.size() == 4) {
+                return QMargins(static_cast<int>(extents[0]), static_cast<int>(extents[2]),
+                    static_cast<int>(extents[1]), static_cast<int>(extents[3]));
+            }
+            QThread::usleep(200);
+        }
+        return std::nullopt;
+    }
+
+private:
+    [[nodiscard]] xcb_atom_t atom(std::string_view name) const
+    {
+        const auto cookie = xcb_intern_atom(
+            m_connection, 0, static_cast<std::uint16_t>(name.size()), name.data());
+        const auto reply = owned(xcb_intern_atom_reply(m_connection, cookie, nullptr));
+        return reply ? reply->atom : static_cast<xcb_atom_t>(XCB_ATOM_NONE);
+    }
+
+    [[nodiscard]] std::vector<std::uint32_t> numbers(
+        xcb_window_t window, xcb_atom_t property, xcb_atom_t type, std::uint32_t most) const
+    {
+        const auto cookie = xcb_get_property(m_connection, 0, window, property, type, 0, most);
+        const auto reply = owned(xcb_get_property_reply(m_connection, cookie, nullptr));
+        if (!reply || reply->format != 32)
+            return {};
+        std::vector<std::uint32_t> values(reply->value_len);
+        std::memcpy(values.data(), xcb_get_property_value(reply.get()), values.size() * 4);
+        return values;
+    }
+
+    [[nodiscard]] bool windowManagerSupports(xcb_atom_t feature) const
+    {
+        constexpr std::uint32_t moreThanAnyManagerHas = 1024;
+        const auto features = numbers(m_root, m_supported, XCB_ATOM_ATOM, moreThanAnyManagerHas);
+        return std::find(features.begin(), features.end(), feature) != features.end();
+    }
+
+    void askForFrameExtents(xcb_window_t window) const
+    {
+        xcb_client_message_event_t message {};
+        message.response_type = XCB_CLIENT_MESSAGE;
+        message.format = 32;
+        message.window = window;
+        message.type = m_requestFrameExtents;
+        xcb_send_event(m_connection, 0, m_root,
+            XCB_EVENT_MASK_SUBSTRUCTURE_NOTIFY | XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT,
+            reinterpret_cast<const char *>(&message));
+        xcb_flush(m_connection);
+    }
+
+    xcb_connection_t *const m_connection;
+    const xcb_window_t m_root;
+    const xcb_atom_t m_supported;
+    const xcb_atom_t m_frameExtents;
+    const xcb_atom_t m_requestFrameExtents;
+};
+
+} // namespace
+
+std::unique_ptr<NativeDesktop> makeNativeDesktop()
+{
+    // Qt's windowless platform has this interface too: without a connection, or with one on which
+    // none of our windows is.
+    if (QGuiApplication::platformName() != QStringLiteral("xcb"))
+        return nullptr;
+    auto *const x11 = qGuiApp->nativeInterface<QNativeInterface::QX11Application>();
+    if (!x11 || !x11->connection())
+        return nullptr;
+    return std::make_unique<NativeDesktopX11>(x11->connection());
+}
+
+} // namespace penwick::platform
