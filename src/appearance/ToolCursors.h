@@ -1,0 +1,15 @@
+// SPDX-License-Identifier: MIT
+// The cursors of the tools.
+#pragma once
+
+#include "platform/Cursor.h"
+
+#include <QString>
+
+namespace penwick {
+
+/// A new cursor of the bundle's image called `cursor_type`, with the hot spot of the four tool
+/// cursors, (0, 0) for any other image. Without a bundle or without that image the process stops.
+[[nodiscard]] platform::Cursor getCursorOfType(const QString &cursor_type);
+
+} // namespace penwick
