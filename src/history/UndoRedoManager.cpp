@@ -1,0 +1,278 @@
+// SPDX-License-Identifier: MIT
+#include "history/UndoRedoManager.h"
+
+#include "history/NotificationNames.h"
+#include "history/SubviewOperation.h"
+#include "platform/foundation/FatalError.h"
+#include "platform/foundation/StandardOutput.h"
+
+#include <penwick/platform/NotificationCenter.h>
+
+#include <limits>
+#include <utility>
+
+namespace penwick {
+
+namespace {
+
+// So many undo steps in a row, or undone records, are offered to the user.
+constexpr int offeredSteps = 5;
+
+void post(const QString &name, const QVariant &object = QVariant())
+{
+    platform::NotificationCenter::defaultCenter().postNotification(name, object);
+}
+
+void postButtonState(const QString &key, bool enabled)
+{
+    post(penwickNotificationKey(), QVariantMap { { key, enabled } });
+}
+
+void postEnableUndo(bool enabled)
+{
+    postButtonState(QStringLiteral("enableUndo"), enabled);
+}
+
+void postTextBoxLeaves(std::int64_t textId)
+{
+    post(drawingCanvasSubviewUpdateNotification(),
+        SubviewOperation::removeWithId(textId).toVariant());
+    post(drawingViewUpdatedNotification());
+}
+
+bool isStroke(const UndoRedoState &record)
+{
+    return std::holds_alternative<StrokeEntry>(record.element);
+}
+
+void appendElement(
+    const Element &element, EntryList<StrokeEntry> &strokes, EntryList<TextBoxEntry> &textBoxes)
+{
+    if (const auto *stroke = std::get_if<StrokeEntry>(&element))
+        strokes.append(*stroke);
+    else
+        textBoxes.append(std::get<TextBoxEntry>(element));
+}
+
+void removeFirstStroke(EntryList<StrokeEntry> &strokes, std::int64_t pathId)
+{
+    const auto index = strokes.firstIndexWhere(
+        [pathId](const StrokeEntry &entry) { return entry.pathId == pathId; });
+    if (index)
+        strokes.removeAt(*index);
+}
+
+void removeFirstTextBox(EntryList<TextBoxEntry> &textBoxes, std::int64_t textId)
+{
+    const auto index = textBoxes.firstIndexWhere(
+        [textId](const TextBoxEntry &entry) { return entry.textId == textId; });
+    if (!index)
+        return;
+    textBoxes.removeAt(*index);
+    postTextBoxLeaves(textId);
+}
+
+void printNotAvailable()
+{
+    platform::printLine("Undo Not Available!"); // the same text for redo is intended
+}
+
+} // namespace
+
+void UndoRedoManager::setDrawingCanvasModel(std::weak_ptr<CanvasContent> model)
+{
+    m_drawingCanvasModel = std::move(model);
+}
+
+void UndoRedoManager::setUndoStack(RecordStack stack)
+{
+    if (stack.isEmpty())
+        postEnableUndo(false);
+    m_undoStack = std::move(stack);
+}
+
+void UndoRedoManager::pushUndo(const UndoRedoState &record)
+{
+    m_undoStack.append(record); // never empty then: the rule has nothing to post
+}
+
+void UndoRedoManager::popUndo()
+{
+    if (m_undoStack.size() == 1)
+        setUndoStack({});
+    else
+        m_undoStack.removeLast();
+}
+
+void UndoRedoManager::setRedoStack(RecordStack stack)
+{
+    m_redoStack = std::move(stack);
+    announceRedoState();
+}
+
+void UndoRedoManager::pushRedo(const UndoRedoState &record)
+{
+    m_redoStack.append(record);
+    announceRedoState();
+}
+
+void UndoRedoManager::popRedo()
+{
+    m_redoStack.removeLast();
+    announceRedoState();
+}
+
+void UndoRedoManager::announceRedoState() const
+{
+    if (m_redoStack.size() <= offeredSteps)
+        postButtonState(QStringLiteral("enableRedo"), !m_redoStack.isEmpty());
+}
+
+void UndoRedoManager::setUndoCount(std::int64_t count)
+{
+    if (count == 0)
+        postEnableUndo(true);
+    else if (count == offeredSteps)
+        postEnableUndo(false);
+    m_undoCount = count;
+}
+
+CanvasContent &UndoRedoManager::requireContent() const
+{
+    // A plain reference will do: the content owns this history and so outlives the command.
+    return *platform::require(m_drawingCanvasModel.lock(), "the history's canvas model is gone");
+}
+
+void UndoRedoManager::undoAction()
+{
+    if (m_undoStack.isEmpty())
+        return;
+    if (m_undoCount == std::numeric_limits<std::int64_t>::max())
+        platform::fatalError("the number of undo steps overflows");
+    setUndoCount(m_undoCount + 1);
+
+    const UndoRedoState record = m_undoStack.last();
+    switch (record.actionAssociated) {
+    case ActionType::draw:
+        undoDraw(record);
+        break;
+    case ActionType::erase:
+        undoErase(record);
+        break;
+    case ActionType::clear:
+        undoClear();
+        break;
+    case ActionType::undo:
+    case ActionType::redo:
+        printNotAvailable();
+        return;
+    }
+    post(drawingViewUpdatedNotification());
+}
+
+void UndoRedoManager::undoDraw(const UndoRedoState &record)
+{
+    CanvasContent &content = requireContent();
+    if (isStroke(record))
+        removeFirstStroke(content.mutablePathArray(), record.elementId);
+    else
+        removeFirstTextBox(content.mutableTextBoxArray(), record.elementId);
+    pushRedo(record);
+    popUndo();
+}
+
+void UndoRedoManager::undoErase(const UndoRedoState &record)
+{
+    // At the end, not where it was: what comes back lies on top of what was drawn meanwhile.
+    CanvasContent &content = requireContent();
+    appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+    pushRedo(record);
+    popUndo();
+}
+
+void UndoRedoManager::undoClear()
+{
+    CanvasContent &content = requireContent();
+    content.mutablePathArray().clear();
+    content.mutableTextBoxArray().clear();
+
+    const RecordStack records = m_undoStack;
+    for (int index = records.size() - 1; index >= 0; --index) {
+        const UndoRedoState &record = records[index];
+        if (record.actionAssociated != ActionType::clear)
+            break;
+        appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+        pushRedo(record);
+        popUndo();
+    }
+}
+
+void UndoRedoManager::redoAction()
+{
+    if (m_redoStack.isEmpty())
+        return;
+    setUndoCount(0);
+
+    const UndoRedoState record = m_redoStack.last();
+    switch (record.actionAssociated) {
+    case ActionType::draw:
+        redoDraw(record);
+        break;
+    case ActionType::erase:
+        redoErase(record);
+        break;
+    case ActionType::clear:
+        redoClear();
+        break;
+    case ActionType::undo:
+    case ActionType::redo:
+        printNotAvailable();
+        return;
+    }
+    post(drawingViewUpdatedNotification());
+}
+
+void UndoRedoManager::redoDraw(const UndoRedoState &record)
+{
+    CanvasContent &content = requireContent();
+    appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+    pushUndo(record);
+    popRedo();
+}
+
+void UndoRedoManager::redoErase(const UndoRedoState &record)
+{
+    CanvasContent &content = requireContent();
+    if (isStroke(record))
+        removeFirstStroke(content.mutablePathArray(), record.elementId);
+    else
+        removeFirstTextBox(content.mutableTextBoxArray(), record.elementId);
+    pushUndo(record);
+    popRedo();
+}
+
+void UndoRedoManager::redoClear()
+{
+    const RecordStack records = m_redoStack;
+    for (int index = records.size() - 1; index >= 0; --index) {
+        if (records[index].actionAssociated != ActionType::clear)
+            break;
+        redoClearOf(records[index]);
+    }
+}
+
+void UndoRedoManager::redoClearOf(const UndoRedoState &record)
+{
+    // By position, not by identifier: undo put the group at the end in this very order.
+    CanvasContent &content = requireContent();
+    if (isStroke(record) && !content.pathArray().isEmpty()) {
+        content.mutablePathArray().removeLast();
+    } else if (!content.textBoxArray().isEmpty()) {
+        content.mutableTextBoxArray().removeLast();
+        postTextBoxLeaves(m_redoStack.last().elementId);
+    }
+    pushUndo(record);
+    popRedo();
+}
+
+} // namespace penwick
