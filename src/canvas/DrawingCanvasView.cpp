@@ -1,0 +1,201 @@
+// SPDX-License-Identifier: MIT
+#include "canvas/DrawingCanvasView.h"
+
+#include "appearance/Theme.h"
+#include "canvas/DrawingCanvasModel.h"
+#include "canvas/StrokePainter.h"
+#include "platform/foundation/FatalError.h"
+#include "textbox/TnTextBox.h"
+
+namespace penwick {
+
+namespace {
+
+using platform::Point;
+using platform::require;
+
+const QString brush = QStringLiteral("brush");
+const QString eraser = QStringLiteral("eraser");
+const QString text = QStringLiteral("text");
+
+constexpr double initialThickness = 5.0; // points
+constexpr double initialFontSize = 24.0; // points
+constexpr float strokeOpacity = 0.7F; // of every stroke, whatever its colour
+
+} // namespace
+
+DrawingCanvasView::DrawingCanvasView(QWidget *parent)
+    : ViewOf(parent)
+    , m_brushThickness(initialThickness)
+    , m_textFontSize(initialFontSize)
+    , m_brushColor(TnhColors::blackColor)
+    , m_currentSelectedTool(brush)
+    , m_lastSelecedTool(brush)
+{ }
+
+DrawingCanvasView::DrawingCanvasView(const platform::Rect &frame)
+    : DrawingCanvasView(nullptr)
+{
+    setFrame(frame);
+}
+
+DrawingCanvasView::~DrawingCanvasView() = default;
+
+void DrawingCanvasView::setPathArray(const EntryList<StrokeEntry> &strokes)
+{
+    m_pathArray = strokes;
+    m_hasDroppedEntry = false;
+}
+
+void DrawingCanvasView::setTextBoxArray(const EntryList<TextBoxEntry> &boxes)
+{
+    m_textBoxArray = boxes;
+}
+
+DrawingCanvasDelegate *DrawingCanvasView::drawingCanvasDelegate() const
+{
+    return m_drawingCanvasDelegate.get();
+}
+
+void DrawingCanvasView::setDrawingCanvasDelegate(DrawingCanvasDelegate *delegate)
+{
+    m_drawingCanvasDelegate = delegate;
+}
+
+DrawingCanvasDelegate &DrawingCanvasView::controller() const
+{
+    return *require(m_drawingCanvasDelegate.get(), "the canvas has no delegate");
+}
+
+DrawingCanvasModel &DrawingCanvasView::model() const
+{
+    return *require(controller().drawingCanvasModel(), "the canvas's controller has no model");
+}
+
+void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
+{
+    platform::Window &ownWindow = *require(window(), "a canvas was pressed outside a window");
+    if (ownWindow.isKeyWindow() && m_popoverWindow) {
+        m_popoverWindow->orderOut();
+        m_currentSelectedTool = m_lastSelecedTool; // a colour that was not chosen is given up
+    }
+    if (m_currentSelectedTool != brush)
+        return;
+    ownWindow.makeFirstResponder(this);
+    m_startPoint = convertTo(event.locationInWindow, nullptr);
+    beginStroke();
+}
+
+void DrawingCanvasView::beginStroke()
+{
+    QColor color = m_brushColor;
+    color.setAlphaF(strokeOpacity);
+    model().createPathWithParam(color, m_brushThickness, m_startPoint);
+}
+
+void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
+{
+    if (window())
+        window()->makeFirstResponder(this);
+    const Point point = convertFrom(event.locationInWindow, this);
+    if (bounds().contains(point) && !(platform::Cursor::currentCursor() == m_cursorType))
+        m_cursorType.set(*this);
+    if (m_currentSelectedTool == brush) {
+        m_lastPoint = point;
+        m_isDragged = true;
+        if (DrawingCanvasDelegate *const delegate = m_drawingCanvasDelegate.get())
+            delegate->didBeginDrawing(m_lastPoint);
+        m_startPoint = m_lastPoint;
+    } else if (m_currentSelectedTool == eraser) {
+        eraseAt(point);
+    }
+}
+
+bool DrawingCanvasView::eraseAt(Point point)
+{
+    if (!model().performEraseOperationAtLocation(point))
+        return false;
+    controller().updateDrawingCanvasElements();
+    require(controller().drawingView(), "the canvas's controller has no canvas")->setNeedsDisplay();
+    return true;
+}
+
+void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
+{
+    const Point point = convertTo(event.locationInWindow, nullptr);
+    if (!bounds().contains(point) && platform::Cursor::currentCursor() == m_cursorType)
+        platform::Cursor::arrow().set(*this);
+    if (m_currentSelectedTool == brush) {
+        endStroke(point);
+    } else if (m_currentSelectedTool == eraser) {
+        eraseAt(point);
+        setNeedsDisplay();
+    } else if (m_currentSelectedTool == text) {
+        placeTextBox(point);
+    }
+}
+
+void DrawingCanvasView::endStroke(Point point)
+{
+    m_lastPoint = point;
+    if (m_startPoint == point && !m_isDragged) {
+        dropEntryOfClick();
+        return;
+    }
+    m_isDragged = false;
+    setNeedsDisplay();
+}
+
+// The model keeps the click's empty stroke. The copy here may not have had it yet, and then what
+// is dropped is an earlier stroke: that one must not vanish, so draw() takes the arrays anew.
+void DrawingCanvasView::dropEntryOfClick()
+{
+    if (m_pathArray.isEmpty())
+        return;
+    m_pathArray.removeLast();
+    m_hasDroppedEntry = true;
+    QMetaObject::invokeMethod(this, &DrawingCanvasView::takeArraysAnew, Qt::QueuedConnection);
+}
+
+void DrawingCanvasView::takeArraysAnew()
+{
+    if (m_hasDroppedEntry && m_drawingCanvasDelegate.get())
+        m_drawingCanvasDelegate.get()->updateDrawingCanvasElements();
+}
+
+void DrawingCanvasView::placeTextBox(Point point)
+{
+    platform::Window *const ownWindow = window();
+    if (!ownWindow || ownWindow->firstResponder() != this) {
+        if (ownWindow)
+            ownWindow->makeFirstResponder(this); // the click only ends the editing
+        return;
+    }
+    auto *const owner = dynamic_cast<QObject *>(&controller());
+    model().createTextBox(point, m_brushColor, m_textFontSize, owner);
+    controller().createTextBoxOnCanvas(point);
+    if (m_textBoxArray.isEmpty())
+        platform::fatalError("a new text box has not reached the canvas");
+    const auto box = m_textBoxArray.last().textBox;
+    addSubview(box);
+    ownWindow->makeFirstResponder(box.get());
+}
+
+void DrawingCanvasView::resetCursorRects()
+{
+    addCursorRect(bounds(), m_cursorType);
+}
+
+void DrawingCanvasView::draw(const platform::Rect &dirtyRect)
+{
+    takeArraysAnew();
+    {
+        Painter painter(*this);
+        paintStrokes(painter, m_pathArray, dirtyRect);
+    }
+    // So text boxes that undo brought back appear again.
+    for (const TextBoxEntry &entry : m_textBoxArray)
+        addSubview(entry.textBox);
+}
+
+} // namespace penwick

@@ -1,0 +1,96 @@
+// SPDX-License-Identifier: MIT
+// The surface that is drawn on.
+#pragma once
+
+#include "canvas/DrawingCanvasDelegate.h"
+#include "history/CanvasContent.h"
+#include "platform/ViewOf.h"
+#include "platform/WeakReference.h"
+
+#include <penwick/platform/Window.h>
+
+#include <QColor>
+#include <QPointer>
+#include <QWidget>
+
+namespace penwick {
+
+/// Turns the pointer into canvas operations, as the current tool says, and shows the strokes and
+/// text boxes of its copies of the content. The content itself is the model's; the controller
+/// copies it over after every change.
+class DrawingCanvasView final : public platform::ViewOf<QWidget>
+{
+    Q_OBJECT
+
+public:
+    explicit DrawingCanvasView(QWidget *parent = nullptr);
+    explicit DrawingCanvasView(const platform::Rect &frame);
+    ~DrawingCanvasView() override;
+
+    [[nodiscard]] platform::Point lastPoint() const { return m_lastPoint; }
+    [[nodiscard]] platform::Point startPoint() const { return m_startPoint; }
+    [[nodiscard]] bool isDragged() const { return m_isDragged; }
+
+    [[nodiscard]] double brushThickness() const { return m_brushThickness; } ///< points
+    void setBrushThickness(double thickness) { m_brushThickness = thickness; }
+    [[nodiscard]] double textFontSize() const { return m_textFontSize; } ///< points
+    void setTextFontSize(double size) { m_textFontSize = size; }
+    /// Colour of new strokes, which are painted at alpha 0.7, and of new text boxes.
+    [[nodiscard]] const QColor &brushColor() const { return m_brushColor; }
+    void setBrushColor(const QColor &color) { m_brushColor = color; }
+
+    /// Copies of the model's arrays, oldest first.
+    [[nodiscard]] const EntryList<StrokeEntry> &pathArray() const { return m_pathArray; }
+    void setPathArray(const EntryList<StrokeEntry> &strokes);
+    [[nodiscard]] const EntryList<TextBoxEntry> &textBoxArray() const { return m_textBoxArray; }
+    void setTextBoxArray(const EntryList<TextBoxEntry> &boxes);
+
+    /// The tool that the pointer obeys. "brush", "eraser" and "text" do something.
+    [[nodiscard]] const QString &currentSelectedTool() const { return m_currentSelectedTool; }
+    void setCurrentSelectedTool(const QString &tool) { m_currentSelectedTool = tool; }
+    /// The drawing tool that a momentary one gives way to again. The spelling is fixed.
+    [[nodiscard]] const QString &lastSelecedTool() const { return m_lastSelecedTool; }
+    void setLastSelecedTool(const QString &tool) { m_lastSelecedTool = tool; }
+    /// The cursor over the whole canvas.
+    [[nodiscard]] const platform::Cursor &cursorType() const { return m_cursorType; }
+    void setCursorType(const platform::Cursor &cursor) { m_cursorType = cursor; }
+
+    /// The window in which the tool bar shows its options; null where there is none. Weak.
+    [[nodiscard]] platform::Window *popoverWindow() const { return m_popoverWindow; }
+    void setPopoverWindow(platform::Window *window) { m_popoverWindow = window; }
+    [[nodiscard]] DrawingCanvasDelegate *drawingCanvasDelegate() const;
+    void setDrawingCanvasDelegate(DrawingCanvasDelegate *delegate);
+
+    void mouseDown(const platform::MouseEvent &event) override;
+    void mouseDragged(const platform::MouseEvent &event) override;
+    void mouseUp(const platform::MouseEvent &event) override;
+    void resetCursorRects() override;
+    void draw(const platform::Rect &dirtyRect) override;
+
+private:
+    void beginStroke();
+    void endStroke(platform::Point point);
+    bool eraseAt(platform::Point point);
+    void placeTextBox(platform::Point point);
+    [[nodiscard]] DrawingCanvasDelegate &controller() const;
+    [[nodiscard]] DrawingCanvasModel &model() const;
+    void dropEntryOfClick();
+    void takeArraysAnew();
+
+    platform::Point m_lastPoint;
+    platform::Point m_startPoint;
+    bool m_isDragged = false;
+    double m_brushThickness;
+    EntryList<StrokeEntry> m_pathArray;
+    EntryList<TextBoxEntry> m_textBoxArray;
+    double m_textFontSize;
+    QColor m_brushColor;
+    QString m_currentSelectedTool;
+    QString m_lastSelecedTool;
+    platform::Cursor m_cursorType = platform::Cursor::arrow();
+    QPointer<platform::Window> m_popoverWindow;
+    platform::WeakReference<DrawingCanvasDelegate> m_drawingCanvasDelegate;
+    bool m_hasDroppedEntry = false; // the copy lacks what a click without a drag dropped
+};
+
+} // namespace penwick

@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: MIT
+// Whether a point lies on a stroke.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+namespace penwick::platform {
+class BezierPath;
+}
+
+namespace penwick {
+
+/// Whether `point` is at most half the path's line width away from its centre line, round ends and
+/// joins included; exactly half is a hit. A line to where it began is a dot and has ends; a path
+/// without lines and curves is hit nowhere.
+/// Cheap enough to be asked of every stroke on every pointer event.
+[[nodiscard]] bool strokeContains(const platform::BezierPath &path, platform::Point point);
+
+} // namespace penwick
