@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: MIT
+// The controller of one drawing window, as a host sees it.
+#pragma once
+
+#include <penwick/Export.h>
+#include <penwick/WindowType.h>
+#include <penwick/platform/Geometry.h>
+#include <penwick/platform/Window.h>
+#include <penwick/platform/WindowController.h>
+
+#include <QImage>
+#include <QPointer>
+#include <QString>
+
+#include <optional>
+
+class QScreen;
+
+namespace penwick {
+
+/// Builds and places the drawing window and announces the end of the session when it closes.
+///
+/// Penwick::createDrawingWindowController() makes it; the window lives as long as this object.
+/// GUI thread only.
+class PENWICK_EXPORT DrawingWindowController final : public platform::WindowController,
+                                                     public platform::WindowDelegate
+{
+    Q_OBJECT
+
+public:
+    /// Needs a primary screen: without one the process stops.
+    DrawingWindowController();
+    ~DrawingWindowController() override;
+
+    /// Bottom left corner of the drawing window's frame as last recorded, in points, y up, from
+    /// the primary screen's bottom left corner; nothing before the window was placed.
+    [[nodiscard]] std::optional<platform::Point> drawingWindowOrigin() const;
+    /// The kind of window; nothing before the window was placed.
+    [[nodiscard]] std::optional<WindowType> mWindowType() const;
+    /// The drawing window; null once it is gone. Owned by this controller.
+    [[nodiscard]] platform::Window *drawingWindow() const;
+    void setDrawingWindow(platform::Window *window);
+    /// Two thirds of the screen's width, in points: the width of a whiteboard window.
+    [[nodiscard]] double minWindowWidth() const;
+    /// Two thirds of the screen's height, in points.
+    [[nodiscard]] double minWindowHeight() const;
+
+    /// Sets the window up as `win_type` and places it on `screen`. A drawing window that is gone
+    /// stops the process.
+    void createWindowForApplication(WindowType win_type, QScreen &screen,
+        const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle);
+
+    void windowDidLoad() override;
+    /// Records where the window is now.
+    void windowDidMove() override;
+    /// Posts penwickSessionEndNotificationKey().
+    void windowWillClose() override;
+
+private:
+    void placeOnWhiteboard(const QScreen &screen);
+
+    std::optional<platform::Point> m_drawingWindowOrigin;
+    std::optional<WindowType> m_windowType;
+    QPointer<platform::Window> m_drawingWindow;
+    double m_minWindowWidth;
+    double m_minWindowHeight;
+};
+
+} // namespace penwick

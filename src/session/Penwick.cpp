@@ -1,0 +1,68 @@
+// SPDX-License-Identifier: MIT
+#include <penwick/Penwick.h>
+
+#include "appearance/PenwickBundle.h"
+#include "history/NotificationNames.h"
+#include "platform/Storyboard.h"
+#include "platform/foundation/FatalError.h"
+#include "platform/foundation/StandardOutput.h"
+#include "session/ComponentBundle.h"
+
+namespace penwick {
+
+namespace {
+
+// A controller is often let go of inside one of its own window's events, so it leaves the screen
+// now and dies from the event loop.
+std::shared_ptr<DrawingWindowController> shared(std::unique_ptr<DrawingWindowController> controller)
+{
+    if (!controller)
+        return nullptr;
+    return { controller.release(), [](DrawingWindowController *last) {
+                last->retire();
+                last->deleteLater();
+            } };
+}
+
+} // namespace
+
+const QString &penwickSessionEndNotificationKey()
+{
+    static const auto *const name
+        = new QString(notificationPrefix() + QStringLiteral(".penwick.session.end"));
+    return *name;
+}
+
+Penwick::Penwick()
+{
+    setPenwickBundle(makeComponentBundle());
+}
+
+Penwick::~Penwick() = default;
+
+std::shared_ptr<DrawingWindowController> Penwick::penwickWindowController() const
+{
+    return m_penwickWindowController;
+}
+
+std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
+    WindowType windowType, QScreen *drawScreen, const std::optional<QImage> &annotatedImage,
+    const std::optional<QString> &windowTitle)
+{
+    const auto &bundle = platform::require(penwickBundle(), "the resource bundle is not set");
+    const platform::Storyboard storyboard(QStringLiteral("Main"), *bundle);
+    m_penwickWindowController = shared(
+        storyboard.instantiate<DrawingWindowController>(QStringLiteral("DrawingWindowController")));
+    if (!m_penwickWindowController) {
+        platform::printLine("Not able to create Penwick WindowController!");
+        return nullptr;
+    }
+    QScreen &screen = *platform::require(drawScreen, "a drawing window needs a screen");
+    m_penwickWindowController->createWindowForApplication(
+        windowType, screen, annotatedImage, windowTitle);
+    return m_penwickWindowController;
+}
+
+void Penwick::showWindowSharingNotification() { }
+
+} // namespace penwick

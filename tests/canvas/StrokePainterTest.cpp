@@ -1,0 +1,179 @@
+// SPDX-License-Identifier: MIT
+// The one way of painting a stroke, on a picture of its own.
+#include "canvas/StrokePainter.h"
+
+#include <gtest/gtest.h>
+
+#include <QImage>
+#include <QPainter>
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace penwick::test {
+namespace {
+
+using platform::BezierPath;
+using platform::Point;
+using platform::Rect;
+
+constexpr int side = 60;
+constexpr Rect everything { 0, 0, side, side };
+
+/// A stroke that goes through `points`, built segment by segment.
+StrokeEntry strokeThrough(
+    const std::vector<Point> &points, std::optional<QColor> color, double width = 5.0)
+{
+    auto path = std::make_shared<BezierPath>();
+    path->setLineWidth(width);
+    for (std::size_t index = 1; index < points.size(); ++index) {
+        path->moveToPoint(points[index - 1]);
+        path->lineToPoint(points[index]);
+    }
+    const std::int64_t id = path->hash();
+    return { path, { points.back(), std::nullopt, color }, id };
+}
+
+EntryList<StrokeEntry> listOf(const std::vector<StrokeEntry> &strokes)
+{
+    EntryList<StrokeEntry> list;
+    for (const StrokeEntry &entry : strokes)
+        list.append(entry);
+    return list;
+}
+
+QImage paper()
+{
+    QImage picture(side, side, QImage::Format_ARGB32_Premultiplied);
+    picture.fill(Qt::white);
+    return picture;
+}
+
+/// `strokes` on white, painted as a canvas paints them; only inside `clip` where there is one.
+QImage painted(const std::vector<StrokeEntry> &strokes, const Rect &dirtyRect = everything,
+    const std::optional<QRect> &clip = std::nullopt)
+{
+    QImage picture = paper();
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    if (clip)
+        painter.setClipRect(*clip);
+    painter.translate(0.0, side);
+    painter.scale(1.0, -1.0);
+    paintStrokes(painter, listOf(strokes), dirtyRect);
+    return picture;
+}
+
+QColor at(const QImage &picture, int x, int y)
+{
+    return picture.pixelColor(x, side - 1 - y);
+}
+
+TEST(StrokePainter, nothingIsPaintedWithoutStrokesOrForAStrokeWithoutSegments)
+{
+    EXPECT_EQ(painted({}), paper());
+    EXPECT_EQ(painted({ strokeThrough({ { 30, 30 } }, Qt::black) }), paper());
+}
+
+TEST(StrokePainter, strokeHasItsColourItsWidthAndRoundEnds)
+{
+    const QImage picture = painted({ strokeThrough({ { 20, 30.5 }, { 40, 30.5 } }, Qt::red) });
+
+    for (int y = 28; y <= 32; ++y)
+        EXPECT_EQ(at(picture, 30, y), QColor(Qt::red)) << y;
+    EXPECT_EQ(at(picture, 30, 27), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 30, 33), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 18, 30), QColor(Qt::red));
+    EXPECT_EQ(at(picture, 16, 30), QColor(Qt::white));
+    EXPECT_NE(at(picture, 17, 28), QColor(Qt::red));
+}
+
+TEST(StrokePainter, strokeWithoutAColourTakesThatOfTheStrokeBeforeIt)
+{
+    const QImage picture = painted({ strokeThrough({ { 10, 10.5 }, { 50, 10.5 } }, Qt::green),
+        strokeThrough({ { 10, 30.5 }, { 50, 30.5 } }, std::nullopt) });
+
+    EXPECT_EQ(at(picture, 30, 30), QColor(Qt::green));
+}
+
+TEST(StrokePainter, strokeWithoutAColourTakesThatOfTheStrokeBeforeItThoughThatIsNotPainted)
+{
+    const QImage picture
+        = painted({ strokeThrough({ { 10, 10.5 }, { 50, 10.5 } }, Qt::green),
+                      strokeThrough({ { 10, 30.5 }, { 50, 30.5 } }, std::nullopt) },
+            { 0, 20, side, side });
+
+    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 30, 30), QColor(Qt::green));
+}
+
+TEST(StrokePainter, transparentStrokeIsOneShapeAndBlendedOnce)
+{
+    const QColor half(0, 0, 0, 128);
+    const QImage picture = painted({ strokeThrough(
+        { { 10, 10 }, { 50, 50 }, { 10, 50 }, { 50, 10 }, { 30, 30 }, { 30, 31 } }, half, 9.0) });
+
+    for (int y = 0; y < side; ++y) {
+        for (int x = 0; x < side; ++x)
+            EXPECT_GE(at(picture, x, y).red(), 127);
+    }
+    EXPECT_EQ(at(picture, 30, 30).red(), 127);
+}
+
+TEST(StrokePainter, eachStrokeIsBlendedByItself)
+{
+    const QColor half(0, 0, 0, 128);
+    const QImage picture = painted({ strokeThrough({ { 10, 30 }, { 50, 30 } }, half, 9.0),
+        strokeThrough({ { 30, 10 }, { 30, 50 } }, half, 9.0) });
+
+    EXPECT_EQ(at(picture, 20, 30).red(), 127);
+    EXPECT_EQ(at(picture, 30, 30).red(), 63);
+}
+
+TEST(StrokePainter, segmentThatLeadsNowhereIsADot)
+{
+    const QImage picture
+        = painted({ strokeThrough({ { 30.5, 30.5 }, { 30.5, 30.5 } }, Qt::black, 9.0) });
+
+    for (int x = 27; x <= 33; ++x)
+        EXPECT_EQ(at(picture, x, 30), QColor(Qt::black)) << x;
+    EXPECT_EQ(at(picture, 25, 30), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 35, 30), QColor(Qt::white));
+}
+
+TEST(StrokePainter, curveIsPaintedToo)
+{
+    auto path = std::make_shared<BezierPath>();
+    path->setLineWidth(5.0);
+    path->moveToPoint({ 10, 10 });
+    path->curveToPoint({ 50, 10 }, { 10, 50 }, { 50, 50 });
+    const std::int64_t id = path->hash();
+
+    const QImage picture = painted({ { path, { std::nullopt, std::nullopt, Qt::black }, id } });
+
+    EXPECT_EQ(at(picture, 30, 40), QColor(Qt::black)); // its top: a quarter of 10 + 50 + 50 + 10
+    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::white)); // no line from end to end
+}
+
+TEST(StrokePainter, partIsPixelForPixelWhatTheWholeHasThere)
+{
+    const std::vector<StrokeEntry> strokes {
+        strokeThrough(
+            { { 5, 5 }, { 55, 20 }, { 8, 33 }, { 52, 48 }, { 52, 48 } }, QColor(0, 0, 0, 178)),
+        strokeThrough({ { 50, 2 }, { 3, 51 } }, QColor(200, 0, 0, 178), 11.0),
+    };
+    const QImage whole = painted(strokes);
+
+    for (int x = 0; x < side; x += 7) {
+        for (int y = 0; y < side; y += 7) {
+            const QRect part(x, side - y - 7, 7, 7);
+            const QImage picture
+                = painted(strokes, { static_cast<double>(x), static_cast<double>(y), 7, 7 }, part);
+            ASSERT_EQ(picture.copy(part), whole.copy(part)) << x << ' ' << y;
+        }
+    }
+}
+
+} // namespace
+} // namespace penwick::test
