@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: MIT
+#include "Session.h"
+
+#include <penwick/platform/NotificationCenter.h>
+
+#include <QCoreApplication>
+#include <QEvent>
+#include <QScreen>
+#include <QWindow>
+
+namespace penwick::host {
+
+using platform::NotificationCenter;
+
+Session::Session()
+    : m_penwick(std::make_unique<Penwick>())
+{
+    // Later, not now: the window is still closing and would be destroyed under its own feet.
+    NotificationCenter::defaultCenter().addObserver(
+        this, penwickSessionEndNotificationKey(), [this](const platform::Notification &) {
+            QMetaObject::invokeMethod(
+                this, [this] { end(); }, Qt::QueuedConnection);
+        });
+}
+
+Session::~Session()
+{
+    NotificationCenter::defaultCenter().removeObserver(this);
+}
+
+bool Session::open(const Options &options, QScreen &screen, const std::optional<QImage> &image)
+{
+    m_controller = m_penwick->createDrawingWindowController(
+        options.windowType, &screen, image, options.title);
+    if (!m_controller)
+        return false;
+    m_announcesSharing = options.announcesSharing;
+    m_controller->showWindow(this);
+    if (QWindow *const window = m_controller->drawingWindow()->windowHandle())
+        window->installEventFilter(this);
+    for (const StartCall &startCall : options.startCalls)
+        call(startCall);
+    return true;
+}
+
+void Session::call(const StartCall &call)
+{
+    QObject *const window = m_controller ? m_controller->drawingWindow() : nullptr;
+    QObject *const controller
+        = window ? window->findChild<QObject *>(QStringLiteral("drawViewController")) : nullptr;
+    if (!controller) {
+        qWarning("penwick-host: there is no draw view controller to call");
+        return;
+    }
+    const char *const operation = call.operation == StartCall::Operation::ToolSelection
+        ? "handleToolSelection"
+        : "handleToolOptionSelection";
+    QMetaObject::invokeMethod(controller, operation, Q_ARG(QString, call.argument));
+}
+
+bool Session::eventFilter(QObject *watched, QEvent *event)
+{
+    // The first exposure: from now on the window can be seen, and so can a banner over it.
+    if (event->type() == QEvent::Expose && m_announcesSharing) {
+        m_announcesSharing = false;
+        QMetaObject::invokeMethod(
+            this,
+            [this] {
+                if (m_penwick)
+                    m_penwick->showWindowSharingNotification();
+            },
+            Qt::QueuedConnection);
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+void Session::end()
+{
+    m_controller.reset();
+    m_penwick.reset();
+    QCoreApplication::quit();
+}
+
+} // namespace penwick::host

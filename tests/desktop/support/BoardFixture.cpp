@@ -1,0 +1,117 @@
+// SPDX-License-Identifier: MIT
+#include "desktop/support/BoardFixture.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <stdexcept>
+
+namespace penwick::desktop {
+
+namespace {
+
+constexpr int borderWidth = 3;
+
+} // namespace
+
+void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments)
+{
+    m_host = std::make_unique<HostProcess>(m_desktop, arguments, program);
+    m_host->waitForWindow(QStringLiteral("drawing"));
+    waitForLevel(canvas().center() - canvas().topLeft(), 255);
+}
+
+WindowId BoardTest::window()
+{
+    const Windows &windows = m_desktop.windows();
+    WindowId found = 0;
+    require(
+        [&] {
+            const QRect frame = m_host->waitForWindow(QStringLiteral("drawing")).frame;
+            for (const WindowId window : windows.ofProcess(m_host->processId())) {
+                if (windows.outerFrame(window) == frame)
+                    found = window;
+            }
+            return found != 0;
+        },
+        "a window to stand where the log says the board is");
+    return found;
+}
+
+QRect BoardTest::canvas()
+{
+    return m_desktop.windows().clientArea(window());
+}
+
+void BoardTest::drag(const std::vector<QPoint> &places, MouseButton button)
+{
+    std::vector<QPoint> screenPlaces;
+    const QPoint corner = canvas().topLeft();
+    for (const QPoint place : places)
+        screenPlaces.push_back(corner + place);
+    m_desktop.pointer().drag(screenPlaces, button);
+}
+
+void BoardTest::click(QPoint place, MouseButton button)
+{
+    m_desktop.pointer().click(onScreen(place), button);
+}
+
+QImage BoardTest::picture()
+{
+    return m_desktop.screen().picture(
+        canvas().adjusted(borderWidth, borderWidth, -borderWidth, -borderWidth));
+}
+
+int BoardTest::level(QPoint place)
+{
+    return m_desktop.screen().pixel(onScreen(place)).green();
+}
+
+void BoardTest::waitForLevel(QPoint place, int wanted)
+{
+    const QPoint screenPlace = onScreen(place);
+    int seen = -1;
+    const bool came = waitUntil([&] {
+        const QColor colour = m_desktop.screen().pixel(screenPlace);
+        seen = colour.green();
+        return colour.red() == seen && colour.blue() == seen && std::abs(seen - wanted) <= 1;
+    });
+    if (!came) {
+        throw std::runtime_error("the board shows level " + std::to_string(seen) + " instead of "
+            + std::to_string(wanted) + " at " + std::to_string(place.x()) + ", "
+            + std::to_string(place.y()) + "; errors: " + m_host->errorOutput().toStdString());
+    }
+}
+
+void BoardTest::settle()
+{
+    constexpr int distance = 12;
+    const QPoint start = settlingArea.topLeft() + QPoint(10, 10 + distance * m_settlingStrokes++);
+    const QPoint end = start + QPoint(40, 0);
+    drag({ start, end });
+    waitForLevel(end, inkOnWhite);
+}
+
+QRect BoardTest::difference(const QImage &one, const QImage &other)
+{
+    QRect area;
+    for (int y = 0; y < one.height(); ++y) {
+        for (int x = 0; x < one.width(); ++x) {
+            if (one.pixel(x, y) != other.pixel(x, y))
+                area |= QRect(x, y, 1, 1);
+        }
+    }
+    return area;
+}
+
+int BoardTest::darkest(const QImage &image)
+{
+    int level = 255;
+    for (int y = 0; y < image.height(); ++y) {
+        for (int x = 0; x < image.width(); ++x)
+            level = std::min(level, qGray(image.pixel(x, y)));
+    }
+    return level;
+}
+
+} // namespace penwick::desktop

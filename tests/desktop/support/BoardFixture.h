@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+// A white board open on a private desktop, for tests that draw on it.
+#pragma once
+
+#include "desktop/support/Desktop.h"
+#include "desktop/support/HostProcess.h"
+#include "desktop/support/Printing.h"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace penwick::desktop {
+
+/// Base of the tests that use a white board. Places on the board are canvas pixels from the top
+/// left corner of the window's content, at scale factor 1.
+class BoardTest : public testing::Test
+{
+protected:
+    /// What the brush leaves on white: (41, 41, 41) at alpha 0.7, in each channel.
+    static constexpr int inkOnWhite = 105;
+    /// The same where two strokes cross.
+    static constexpr int inkOnInk = 60;
+
+    /// Opens a white board and returns once it can be seen.
+    void open(HostProgram program = HostProgram::AsShipped,
+        const std::vector<std::string> &arguments = {});
+
+    Desktop &desktop() { return m_desktop; }
+    HostProcess &host() { return *m_host; }
+    /// The board's window.
+    [[nodiscard]] WindowId window();
+    /// The window's content on the screen.
+    [[nodiscard]] QRect canvas();
+    /// The screen's place of a place on the board.
+    [[nodiscard]] QPoint onScreen(QPoint place) { return canvas().topLeft() + place; }
+
+    /// Draws, or erases, along `places` on the board.
+    void drag(const std::vector<QPoint> &places, MouseButton button = MouseButton::Left);
+    void click(QPoint place, MouseButton button = MouseButton::Left);
+
+    /// The board without its coloured border, which alone is not in shades of grey.
+    [[nodiscard]] QImage picture();
+    /// The grey level at a place on the board.
+    [[nodiscard]] int level(QPoint place);
+    /// Waits until the board shows `wanted` there, one level more or less; throws if it does not.
+    void waitForLevel(QPoint place, int wanted);
+    /// Draws a short stroke near the lower left corner, each time in another place, and waits for
+    /// it: whatever was done before has then been dealt with and painted.
+    void settle();
+    /// Where settle() draws.
+    static constexpr QRect settlingArea { 20, 280, 80, 160 };
+
+    /// The smallest rectangle that holds all pixels in which the two differ; null if none does.
+    [[nodiscard]] static QRect difference(const QImage &one, const QImage &other);
+    /// The darkest level in `image`.
+    [[nodiscard]] static int darkest(const QImage &image);
+
+private:
+    Desktop m_desktop;
+    std::unique_ptr<HostProcess> m_host;
+    int m_settlingStrokes = 0;
+};
+
+} // namespace penwick::desktop

@@ -1,0 +1,138 @@
+// SPDX-License-Identifier: MIT
+#include "desktop/support/Desktop.h"
+
+#include "desktop/support/WaitUntil.h"
+#include "desktop/support/XConnection.h"
+
+#include <QDir>
+#include <QFile>
+
+#include <array>
+#include <cstdlib>
+#include <stdexcept>
+
+namespace penwick::desktop {
+
+namespace {
+
+// What passes from the test's own surroundings; everything else could make two runs differ.
+constexpr std::array passedOn { "PATH", "LD_LIBRARY_PATH", "TMPDIR", "ASAN_OPTIONS",
+    "UBSAN_OPTIONS", "LSAN_OPTIONS" };
+
+} // namespace
+
+Desktop::Desktop(WindowManager windowManager, QSize screenSize)
+{
+    if (!m_folder.isValid())
+        throw std::runtime_error("no temporary folder: " + m_folder.errorString().toStdString());
+    for (const char *name : { "home", "run" }) {
+        const QString path = m_folder.filePath(QLatin1String(name));
+        QDir().mkdir(path);
+        QFile::setPermissions(path, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    }
+    startServer(screenSize);
+    m_connection = std::make_unique<XConnection>(m_displayName);
+    m_pointer = std::make_unique<Pointer>(*m_connection);
+    m_keyboard = std::make_unique<Keyboard>(*m_connection);
+    m_screen = std::make_unique<Screen>(*m_connection);
+    m_windows = std::make_unique<Windows>(*m_connection);
+    startWindowManager(windowManager);
+}
+
+Desktop::~Desktop()
+{
+    // The server last: a client that loses its server complains.
+    m_windowManager.reset();
+    m_bus.reset();
+    m_connection.reset();
+    m_server.reset();
+}
+
+std::vector<std::string> Desktop::environment() const
+{
+    // A bus that is not there, said outright: without an address one would be started, and stay.
+    return environmentWithBus("unix:path=" + file("no-bus"));
+}
+
+std::vector<std::string> Desktop::environmentWithBus(const std::string &address) const
+{
+    std::vector<std::string> variables {
+        "HOME=" + file("home"),
+        "XDG_RUNTIME_DIR=" + file("run"),
+        "LANG=C.UTF-8",
+        "DBUS_SESSION_BUS_ADDRESS=" + address,
+        "NO_AT_BRIDGE=1",
+    };
+    if (!m_displayName.empty())
+        variables.push_back("DISPLAY=" + m_displayName);
+    for (const char *name : passedOn) {
+        if (const char *const value = std::getenv(name))
+            variables.push_back(std::string(name) + '=' + value);
+    }
+    return variables;
+}
+
+std::string Desktop::file(const std::string &name) const
+{
+    return m_folder.filePath(QString::fromStdString(name)).toStdString();
+}
+
+void Desktop::startServer(QSize screenSize)
+{
+    const std::string size
+        = std::to_string(screenSize.width()) + 'x' + std::to_string(screenSize.height()) + "x24";
+    m_server = std::make_unique<ChildProcess>(
+        ChildProcess::Command { { "Xvfb", "-displayfd", "1", "-screen", "0", size, "-dpi", "96",
+                                    "-nolisten", "tcp", "-noreset" },
+            environment(), file("Xvfb.log") });
+    std::optional<std::string> number;
+    require([&] { return (number = m_server->takeLine()) || m_server->exitStatus(); },
+        "the X server to say its display number");
+    if (!number)
+        throw std::runtime_error("the X server ended at once");
+    m_displayName = ':' + *number;
+}
+
+std::string Desktop::startBus()
+{
+    m_bus = std::make_unique<ChildProcess>(
+        ChildProcess::Command { { "dbus-daemon", "--session", "--nofork", "--nopidfile",
+                                    "--print-address=1", "--address=unix:path=" + file("bus") },
+            environment(), file("bus.log") });
+    std::optional<std::string> address;
+    require([&] { return (address = m_bus->takeLine()) || m_bus->exitStatus(); },
+        "the session bus to say its address");
+    if (!address)
+        throw std::runtime_error("the session bus ended at once");
+    return *address;
+}
+
+void Desktop::startWindowManager(WindowManager windowManager)
+{
+    if (windowManager == WindowManager::None)
+        return;
+    const std::vector<std::string> command = windowManager == WindowManager::Openbox
+        ? std::vector<std::string> { "openbox", "--sm-disable" }
+        : std::vector<std::string> { "xfwm4", "--compositor=off" };
+    // Xfwm4 reads its settings over a bus, or does not start.
+    m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command { command,
+        windowManager == WindowManager::Xfwm4 ? environmentWithBus(startBus()) : environment(),
+        file("window-manager.log") });
+
+    // It is up when the window that it announces itself by names itself too.
+    const char *const announcement = "_NET_SUPPORTING_WM_CHECK";
+    require(
+        [&] {
+            const std::vector<unsigned long> check
+                = m_windows->numbers(m_windows->root(), announcement);
+            return m_windowManager->exitStatus()
+                || (check.size() == 1 && m_windows->numbers(check.front(), announcement) == check
+                    && !m_windows->numbers(m_windows->root(), "_NET_SUPPORTED").empty());
+        },
+        command.front() + " to manage the display");
+    if (m_windowManager->exitStatus())
+        throw std::runtime_error(command.front() + " ended at once");
+    m_connection->awaitWindowManager();
+}
+
+} // namespace penwick::desktop

@@ -1,0 +1,168 @@
+// SPDX-License-Identifier: MIT
+#include "desktop/support/Windows.h"
+
+#include "desktop/support/XConnection.h"
+
+#include <X11/Xlib.h>
+
+#include <X11/Xatom.h>
+
+#include <algorithm>
+#include <memory>
+
+namespace penwick::desktop {
+
+namespace {
+
+struct Property
+{
+    std::unique_ptr<unsigned char, int (*)(void *)> data { nullptr, &XFree };
+    unsigned long count = 0;
+};
+
+Property read(const XConnection &connection, Window window, const char *name, int wantedFormat)
+{
+    constexpr long enough = 1 << 16; // in units of 4 bytes
+    Atom type = 0;
+    int format = 0;
+    unsigned long count = 0;
+    unsigned long left = 0;
+    unsigned char *data = nullptr;
+    const int status = XGetWindowProperty(connection.display(), window, connection.atom(name), 0,
+        enough, False, AnyPropertyType, &type, &format, &count, &left, &data);
+    Property property;
+    property.data.reset(data);
+    if (status == Success && format == wantedFormat)
+        property.count = count;
+    return property;
+}
+
+struct Family
+{
+    Window parent = 0;
+    std::vector<Window> children; // the undermost first
+};
+
+Family familyOf(const XConnection &connection, Window window)
+{
+    Window root = 0;
+    Window *children = nullptr;
+    unsigned int count = 0;
+    Family family;
+    if (!XQueryTree(connection.display(), window, &root, &family.parent, &children, &count))
+        return family;
+    const std::unique_ptr<Window, int (*)(void *)> owner(children, &XFree);
+    family.children.assign(children, children + count);
+    return family;
+}
+
+// The child of the root that holds `window`: the window manager's frame, or the window itself.
+Window frameOf(const XConnection &connection, Window window)
+{
+    Window current = window;
+    for (;;) {
+        const Window parent = familyOf(connection, current).parent;
+        if (parent == connection.root() || parent == 0)
+            return current;
+        current = parent;
+    }
+}
+
+QRect rectangleOf(const XConnection &connection, Window window)
+{
+    XWindowAttributes attributes {};
+    if (!XGetWindowAttributes(connection.display(), window, &attributes))
+        return {};
+    int x = 0;
+    int y = 0;
+    Window child = 0;
+    const int border = attributes.border_width;
+    XTranslateCoordinates(
+        connection.display(), window, connection.root(), -border, -border, &x, &y, &child);
+    return { x, y, attributes.width + 2 * border, attributes.height + 2 * border };
+}
+
+} // namespace
+
+Windows::Windows(const XConnection &connection)
+    : m_connection(connection)
+{ }
+
+std::vector<WindowId> Windows::stackingOrder() const
+{
+    // Not the window manager's own list: some set it only when the order changes.
+    const std::vector<Window> frames = familyOf(m_connection, root()).children;
+    std::vector<WindowId> windows = numbers(root(), "_NET_CLIENT_LIST");
+    const auto height = [&](Window window) {
+        return std::find(frames.begin(), frames.end(), frameOf(m_connection, window));
+    };
+    std::sort(windows.begin(), windows.end(),
+        [&](Window one, Window other) { return height(one) < height(other); });
+    return windows;
+}
+
+std::vector<WindowId> Windows::ofProcess(int processId) const
+{
+    const std::vector<unsigned long> owner { static_cast<unsigned long>(processId) };
+    std::vector<WindowId> windows = stackingOrder();
+    std::erase_if(
+        windows, [&](WindowId window) { return numbers(window, "_NET_WM_PID") != owner; });
+    return windows;
+}
+
+WindowId Windows::active() const
+{
+    const std::vector<unsigned long> windows = numbers(root(), "_NET_ACTIVE_WINDOW");
+    return windows.empty() ? 0 : windows.front();
+}
+
+QString Windows::title(WindowId window) const
+{
+    return text(window, "_NET_WM_NAME").value_or(QString());
+}
+
+QRect Windows::clientArea(WindowId window) const
+{
+    return rectangleOf(m_connection, window);
+}
+
+QRect Windows::outerFrame(WindowId window) const
+{
+    return rectangleOf(m_connection, frameOf(m_connection, window));
+}
+
+std::vector<unsigned long> Windows::numbers(WindowId window, const char *property) const
+{
+    const Property found = read(m_connection, window, property, 32);
+    const auto *const first = reinterpret_cast<const unsigned long *>(found.data.get());
+    return { first, first + found.count };
+}
+
+std::optional<QString> Windows::text(WindowId window, const char *property) const
+{
+    const Property found = read(m_connection, window, property, 8);
+    if (!found.data)
+        return std::nullopt;
+    return QString::fromUtf8(
+        reinterpret_cast<const char *>(found.data.get()), static_cast<qsizetype>(found.count));
+}
+
+WindowId Windows::root() const
+{
+    return m_connection.root();
+}
+
+void Windows::close(WindowId window)
+{
+    XEvent event {};
+    event.xclient.type = ClientMessage;
+    event.xclient.window = window;
+    event.xclient.message_type = m_connection.atom("_NET_CLOSE_WINDOW");
+    event.xclient.format = 32;
+    event.xclient.data.l[1] = 2; // asked by the user, as a task bar does
+    XSendEvent(m_connection.display(), root(), False,
+        SubstructureRedirectMask | SubstructureNotifyMask, &event);
+    m_connection.finish();
+}
+
+} // namespace penwick::desktop

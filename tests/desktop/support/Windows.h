@@ -1,0 +1,48 @@
+// SPDX-License-Identifier: MIT
+// What the window manager and everybody else sees of the windows.
+#pragma once
+
+#include <QRect>
+#include <QString>
+
+#include <optional>
+#include <vector>
+
+namespace penwick::desktop {
+
+class XConnection;
+
+using WindowId = unsigned long;
+
+/// Window properties, frames and order, read from the server at each call, and the requests that a
+/// task bar would send. A window that is gone has empty answers.
+class Windows final
+{
+public:
+    /// Borrows `connection`, which must live longer.
+    explicit Windows(const XConnection &connection);
+
+    /// Windows that the window manager manages, the undermost first.
+    [[nodiscard]] std::vector<WindowId> stackingOrder() const;
+    /// Those of process `processId`, the undermost first.
+    [[nodiscard]] std::vector<WindowId> ofProcess(int processId) const;
+    [[nodiscard]] WindowId active() const; ///< 0 if there is none
+
+    [[nodiscard]] QString title(WindowId window) const;
+    [[nodiscard]] QRect clientArea(WindowId window) const; ///< screen pixels from the top left
+    [[nodiscard]] QRect outerFrame(WindowId window) const; ///< with the title bar, likewise
+
+    /// The 32-bit numbers (or atoms, or windows) of a property, empty if it is not set.
+    [[nodiscard]] std::vector<unsigned long> numbers(WindowId window, const char *property) const;
+    /// The same as text, for an 8-bit property.
+    [[nodiscard]] std::optional<QString> text(WindowId window, const char *property) const;
+    [[nodiscard]] WindowId root() const;
+
+    /// What a press on the title bar's close button asks for.
+    void close(WindowId window);
+
+private:
+    const XConnection &m_connection;
+};
+
+} // namespace penwick::desktop

@@ -1,0 +1,96 @@
+// SPDX-License-Identifier: MIT
+#include "desktop/support/XConnection.h"
+
+#include "desktop/support/WaitUntil.h"
+
+#include <X11/Xlib.h>
+
+#include <stdexcept>
+
+namespace penwick::desktop {
+
+XConnection::XConnection(const std::string &displayName)
+    : m_display(XOpenDisplay(displayName.c_str()))
+{
+    if (!m_display)
+        throw std::runtime_error("the display " + displayName + " does not answer");
+    XSetErrorHandler([](Display *, XErrorEvent *) { return 0; });
+}
+
+XConnection::~XConnection()
+{
+    XCloseDisplay(m_display);
+}
+
+unsigned long XConnection::root() const
+{
+    return DefaultRootWindow(m_display);
+}
+
+unsigned long XConnection::atom(const char *name) const
+{
+    return XInternAtom(m_display, name, False);
+}
+
+void XConnection::finish() const
+{
+    XSync(m_display, False);
+}
+
+void XConnection::awaitWindowManager()
+{
+    // It announces itself before it looks at its events, and what came in between may lie there
+    // until something else comes: so it is asked again and again.
+    const Window firstProbe = makeProbe();
+    require(
+        [this, firstProbe] {
+            askWindowManager(firstProbe);
+            return hasAnswered(firstProbe);
+        },
+        "the window manager to answer");
+    XDestroyWindow(m_display, firstProbe); // its other answers are of no use
+    m_probe = makeProbe();
+}
+
+void XConnection::finishWithWindowManager() const
+{
+    finish();
+    if (!m_probe)
+        return;
+    // It takes its events in their order, so that its answer to this one comes after the others.
+    askWindowManager(m_probe);
+    require([this] { return hasAnswered(m_probe); }, "the window manager to answer");
+}
+
+unsigned long XConnection::makeProbe() const
+{
+    const Window probe = XCreateSimpleWindow(m_display, root(), 0, 0, 1, 1, 0, 0, 0);
+    XSelectInput(m_display, probe, PropertyChangeMask);
+    finish();
+    return probe;
+}
+
+void XConnection::askWindowManager(unsigned long probe) const
+{
+    XEvent event {};
+    event.xclient.type = ClientMessage;
+    event.xclient.window = probe;
+    event.xclient.message_type = atom("_NET_REQUEST_FRAME_EXTENTS");
+    event.xclient.format = 32;
+    XSendEvent(m_display, root(), False, SubstructureRedirectMask | SubstructureNotifyMask, &event);
+    finish();
+}
+
+bool XConnection::hasAnswered(unsigned long probe) const
+{
+    // Openbox sets other properties on the way; only this one is the answer.
+    const Atom wanted = atom("_NET_FRAME_EXTENTS");
+    XEvent change {};
+    while (XCheckTypedWindowEvent(m_display, probe, PropertyNotify, &change)) {
+        if (change.xproperty.atom == wanted)
+            return true;
+    }
+    return false;
+}
+
+} // namespace penwick::desktop
