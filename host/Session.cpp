@@ -8,6 +8,8 @@
 #include <QScreen>
 #include <QWindow>
 
+#include <utility>
+
 namespace penwick::host {
 
 using platform::NotificationCenter;
@@ -36,8 +38,11 @@ bool Session::open(const Options &options, QScreen &screen, const std::optional<
         return false;
     m_announcesSharing = options.announcesSharing;
     m_controller->showWindow(this);
-    if (QWindow *const window = m_controller->drawingWindow()->windowHandle())
+    if (QWindow *const window = m_controller->drawingWindow()->windowHandle()) {
         window->installEventFilter(this);
+        if (window->isExposed())
+            announceSharing();
+    }
     for (const StartCall &startCall : options.startCalls)
         call(startCall);
     return true;
@@ -61,17 +66,22 @@ void Session::call(const StartCall &call)
 bool Session::eventFilter(QObject *watched, QEvent *event)
 {
     // The first exposure: from now on the window can be seen, and so can a banner over it.
-    if (event->type() == QEvent::Expose && m_announcesSharing) {
-        m_announcesSharing = false;
-        QMetaObject::invokeMethod(
-            this,
-            [this] {
-                if (m_penwick)
-                    m_penwick->showWindowSharingNotification();
-            },
-            Qt::QueuedConnection);
-    }
+    if (event->type() == QEvent::Expose)
+        announceSharing();
     return QObject::eventFilter(watched, event);
+}
+
+void Session::announceSharing()
+{
+    if (!std::exchange(m_announcesSharing, false))
+        return;
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            if (m_penwick)
+                m_penwick->showWindowSharingNotification();
+        },
+        Qt::QueuedConnection);
 }
 
 void Session::end()

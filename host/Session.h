@@ -36,6 +36,7 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    void announceSharing();
     void end();
 
     std::unique_ptr<Penwick> m_penwick;

@@ -43,8 +43,8 @@ missing_on_debian() {
     installed=$(dpkg-query -W -f '${db:Status-Status} ${Package}\n' \
         $(needed | awk '{ print $1 }') 2>/dev/null || true)
     while read -r package _; do
-        grep -qxF "installed $package" <<<"$installed" || printf '%s ' "$package"
-    done < <(needed)
+        grep -qxF "installed $package" <<<"$installed" || printf '%s\n' "$package"
+    done < <(needed) | paste -sd ' '
 }
 
 is_there() {
@@ -62,8 +62,8 @@ is_there() {
 missing_elsewhere() {
     local package check
     while read -r package check; do
-        is_there "$check" || printf '%s ' "$package"
-    done < <(needed)
+        is_there "$check" || printf '%s\n' "$package"
+    done < <(needed) | paste -sd ' '
 }
 
 install_what_is_missing() {
@@ -80,11 +80,12 @@ install_what_is_missing() {
     [[ -n $missing ]] || return 0
     if ((EUID != 0)); then
         command -v sudo >/dev/null ||
-            fail "missing, and neither root nor sudo to install it: $missing"
+            fail "these packages are missing, and there is neither root nor sudo to install them: $missing"
         as_root=(sudo)
     fi
-    say "Installing $missing"
-    quietly "${as_root[@]}" apt-get update
+    say "Installing $missing (a minute or two)"
+    # By itself it takes a network that is down for success.
+    quietly "${as_root[@]}" apt-get -o APT::Update::Error-Mode=any update
     # shellcheck disable=SC2086
     quietly "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
         apt-get install -y --no-install-recommends $missing
@@ -98,7 +99,13 @@ build_release() {
         quietly cmake --preset release
         touch "$build/build.ninja"
     fi
-    say "Building ${*:-everything}"
+    local first=''
+    [[ -e $build/src/libpenwick.so ]] || first=' (several minutes the first time)'
+    if (($#)); then
+        say "Building the example host$first"
+    else
+        say "Building everything$first"
+    fi
     cmake --build "$build" ${1:+--target "$@"} -- --quiet |
         sed '/^ninja: no work to do\.$/d'
 }
