@@ -51,8 +51,18 @@ namespace TextBoxParams {
 inline constexpr QColor defaultTextFontColor { 0, 0, 0 };
 } // namespace TextBoxParams
 
+/// The identifiers of the tools: what the tool bar's buttons are called and what is handed on when
+/// one is chosen. Only the first three change what the pointer does.
 namespace Tools {
-inline const QString defaultSelectedTool = QStringLiteral("text");
+inline const QString text = QStringLiteral("text");
+inline const QString brush = QStringLiteral("brush");
+inline const QString eraser = QStringLiteral("eraser");
+inline const QString color = QStringLiteral("color");
+inline const QString clear = QStringLiteral("clear");
+inline const QString state = QStringLiteral("state"); ///< ends the session
+inline const QString undo = QStringLiteral("undo");
+inline const QString redo = QStringLiteral("redo");
+inline const QString defaultSelectedTool = text;
 } // namespace Tools
 
 /// Hot spots in points from the top left corner of the cursor's image.

@@ -29,7 +29,9 @@ using platform::require;
 std::optional<double> numberFrom(const QString &text)
 {
     bool isNumber = false;
-    const double value = QLocale().toDouble(text, &isNumber);
+    QLocale locale;
+    locale.setNumberOptions(QLocale::RejectGroupSeparator);
+    const double value = locale.toDouble(text, &isNumber);
     return isNumber && std::isfinite(value) ? std::optional(value) : std::nullopt;
 }
 
@@ -137,14 +139,14 @@ void DrawViewController::drawPathOnCanvas(Point pointToDraw, Point lastPoint)
         Rect::spanning(lastPoint, pointToDraw).grownBy(strokes.last().bPath->lineWidth()));
 }
 
-void DrawViewController::createTextBoxOnCanvas(Point textBoxLocation)
+void DrawViewController::createTextBoxOnCanvas(Point)
 {
     updateDrawingCanvasElements();
     const auto &boxes = canvas().textBoxArray();
     if (boxes.isEmpty())
         platform::fatalError("the canvas has no text box to show");
-    const platform::Size size = boxes.last().textBox->frame().size();
-    canvas().setNeedsDisplay({ textBoxLocation.x, textBoxLocation.y, size.width, size.height });
+    // All of it: the box hangs below the point that was clicked.
+    canvas().setNeedsDisplay(boxes.last().textBox->frame());
 }
 
 void DrawViewController::didClearCanvas()
@@ -203,25 +205,25 @@ void DrawViewController::handleToolSelection(const QString &selectedTool)
     view.setCurrentSelectedTool(selectedTool);
     const auto goBackToDrawing = [&view] { view.setCurrentSelectedTool(view.lastSelecedTool()); };
 
-    if (selectedTool == QStringLiteral("color")) {
+    if (selectedTool == Tools::color) {
         goBackToDrawing(); // the colour itself is chosen in a popover
-    } else if (selectedTool == QStringLiteral("text")) {
+    } else if (selectedTool == Tools::text) {
         if (platform::Window *const window = view.window())
             window->makeFirstResponder(&view);
         selectDrawingTool(selectedTool, QStringLiteral("Text_Cursor"));
-    } else if (selectedTool == QStringLiteral("brush")) {
+    } else if (selectedTool == Tools::brush) {
         selectDrawingTool(selectedTool, QStringLiteral("Brush_Cursor"));
-    } else if (selectedTool == QStringLiteral("eraser")) {
+    } else if (selectedTool == Tools::eraser) {
         selectDrawingTool(selectedTool, QStringLiteral("Eraser_Cursor"));
-    } else if (selectedTool == QStringLiteral("clear")) {
+    } else if (selectedTool == Tools::clear) {
         clearIfThereIsAnything();
         goBackToDrawing();
-    } else if (selectedTool == QStringLiteral("state")) {
+    } else if (selectedTool == Tools::state) {
         require(view.window(), "the canvas to be ended is in no window")->close();
-    } else if (selectedTool == QStringLiteral("undo")) {
+    } else if (selectedTool == Tools::undo) {
         history().undoAction();
         goBackToDrawing();
-    } else if (selectedTool == QStringLiteral("redo")) {
+    } else if (selectedTool == Tools::redo) {
         history().redoAction();
         goBackToDrawing();
     } else {
@@ -260,15 +262,15 @@ void DrawViewController::handleToolOptionSelection(const QString &selectedToolOp
     DrawingCanvasView &view = canvas();
     const QString &tool = parts[0];
     const QString &value = parts[1];
-    if (tool == QStringLiteral("color")) {
+    if (tool == Tools::color) {
         const auto color = colorMap().constFind(value);
         if (color != colorMap().constEnd())
             view.setBrushColor(*color);
         view.setCurrentSelectedTool(view.lastSelecedTool());
-    } else if (tool == QStringLiteral("brush")) {
+    } else if (tool == Tools::brush) {
         if (const auto thickness = numberFrom(value))
             view.setBrushThickness(*thickness);
-    } else if (tool == QStringLiteral("text")) {
+    } else if (tool == Tools::text) {
         if (const auto size = numberFrom(value))
             view.setTextFontSize(*size);
     }

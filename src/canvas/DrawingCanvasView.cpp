@@ -14,10 +14,6 @@ namespace {
 using platform::Point;
 using platform::require;
 
-const QString brush = QStringLiteral("brush");
-const QString eraser = QStringLiteral("eraser");
-const QString text = QStringLiteral("text");
-
 constexpr double initialThickness = 5.0; // points
 constexpr double initialFontSize = 24.0; // points
 constexpr float strokeOpacity = 0.7F; // of every stroke, whatever its colour
@@ -29,8 +25,8 @@ DrawingCanvasView::DrawingCanvasView(QWidget *parent)
     , m_brushThickness(initialThickness)
     , m_textFontSize(initialFontSize)
     , m_brushColor(TnhColors::blackColor)
-    , m_currentSelectedTool(brush)
-    , m_lastSelecedTool(brush)
+    , m_currentSelectedTool(Tools::brush)
+    , m_lastSelecedTool(Tools::brush)
 { }
 
 DrawingCanvasView::DrawingCanvasView(const platform::Rect &frame)
@@ -79,7 +75,7 @@ void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
         m_popoverWindow->orderOut();
         m_currentSelectedTool = m_lastSelecedTool; // a colour that was not chosen is given up
     }
-    if (m_currentSelectedTool != brush)
+    if (m_currentSelectedTool != Tools::brush)
         return;
     ownWindow.makeFirstResponder(this);
     m_startPoint = convertTo(event.locationInWindow, nullptr);
@@ -100,13 +96,13 @@ void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
     const Point point = convertFrom(event.locationInWindow, this);
     if (bounds().contains(point) && !(platform::Cursor::currentCursor() == m_cursorType))
         m_cursorType.set(*this);
-    if (m_currentSelectedTool == brush) {
+    if (m_currentSelectedTool == Tools::brush) {
         m_lastPoint = point;
         m_isDragged = true;
         if (DrawingCanvasDelegate *const delegate = m_drawingCanvasDelegate.get())
             delegate->didBeginDrawing(m_lastPoint);
         m_startPoint = m_lastPoint;
-    } else if (m_currentSelectedTool == eraser) {
+    } else if (m_currentSelectedTool == Tools::eraser) {
         eraseAt(point);
     }
 }
@@ -125,12 +121,12 @@ void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
     const Point point = convertTo(event.locationInWindow, nullptr);
     if (!bounds().contains(point) && platform::Cursor::currentCursor() == m_cursorType)
         platform::Cursor::arrow().set(*this);
-    if (m_currentSelectedTool == brush) {
+    if (m_currentSelectedTool == Tools::brush) {
         endStroke(point);
-    } else if (m_currentSelectedTool == eraser) {
+    } else if (m_currentSelectedTool == Tools::eraser) {
         eraseAt(point);
         setNeedsDisplay();
-    } else if (m_currentSelectedTool == text) {
+    } else if (m_currentSelectedTool == Tools::text) {
         placeTextBox(point);
     }
 }
@@ -194,7 +190,8 @@ void DrawingCanvasView::draw(const platform::Rect &dirtyRect)
         paintStrokes(painter, m_pathArray, dirtyRect);
     }
     // So text boxes that undo brought back appear again.
-    for (const TextBoxEntry &entry : m_textBoxArray)
+    const EntryList<TextBoxEntry> boxes = m_textBoxArray; // whoever leaves may change the list
+    for (const TextBoxEntry &entry : boxes)
         addSubview(entry.textBox);
 }
 

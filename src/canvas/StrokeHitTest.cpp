@@ -74,6 +74,8 @@ struct Disc
 
 bool strokeContains(const BezierPath &path, Point point)
 {
+    if (path.lineWidth() <= 0.0)
+        return false; // it leaves no mark either
     const Disc disc { point, path.lineWidth() / 2 };
     // One point wider than need be: only a short cut, it must not decide at the very edge.
     if (!path.controlPointBounds().grownBy(disc.radius + 1).contains(point))

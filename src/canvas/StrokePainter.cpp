@@ -25,6 +25,32 @@ QPointF toQt(Point point)
     return { point.x, point.y };
 }
 
+Qt::PenCapStyle toQt(platform::LineCapStyle style)
+{
+    switch (style) {
+    case platform::LineCapStyle::Butt:
+        return Qt::FlatCap;
+    case platform::LineCapStyle::Round:
+        return Qt::RoundCap;
+    case platform::LineCapStyle::Square:
+        return Qt::SquareCap;
+    }
+    return Qt::FlatCap;
+}
+
+Qt::PenJoinStyle toQt(platform::LineJoinStyle style)
+{
+    switch (style) {
+    case platform::LineJoinStyle::Miter:
+        return Qt::MiterJoin;
+    case platform::LineJoinStyle::Round:
+        return Qt::RoundJoin;
+    case platform::LineJoinStyle::Bevel:
+        return Qt::BevelJoin;
+    }
+    return Qt::MiterJoin;
+}
+
 // Segments that follow each other are one line, so that no end caps thicken the edges where they
 // meet. A path drops a line that leads nowhere, but a pointer that stayed where it was leaves a
 // dot.
@@ -93,6 +119,8 @@ void paintStrokes(QPainter &painter, const EntryList<StrokeEntry> &strokes, cons
             || !path.controlPointBounds().grownBy(reach).intersects(dirtyRect))
             continue;
         pen.setWidthF(path.lineWidth());
+        pen.setCapStyle(toQt(path.lineCapStyle()));
+        pen.setJoinStyle(toQt(path.lineJoinStyle()));
         paintShape(painter, segmentsTouching(path, reach, dirtyRect), pen);
     }
 }

@@ -139,7 +139,7 @@ void UndoRedoManager::setUndoCount(std::int64_t count)
 
 CanvasContent &UndoRedoManager::requireContent() const
 {
-    // A plain reference will do: the content owns this history and so outlives the command.
+    // A plain reference will do: the command keeps the content alive.
     return *platform::require(m_drawingCanvasModel.lock(), "the history's canvas model is gone");
 }
 
@@ -147,6 +147,7 @@ void UndoRedoManager::undoAction()
 {
     if (m_undoStack.isEmpty())
         return;
+    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and with it, this history
     if (m_undoCount == std::numeric_limits<std::int64_t>::max())
         platform::fatalError("the number of undo steps overflows");
     setUndoCount(m_undoCount + 1);
@@ -211,6 +212,7 @@ void UndoRedoManager::redoAction()
 {
     if (m_redoStack.isEmpty())
         return;
+    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and with it, this history
     setUndoCount(0);
 
     const UndoRedoState record = m_redoStack.last();
