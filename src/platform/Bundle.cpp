@@ -27,4 +27,14 @@ Bundle::SceneMaker Bundle::scene(const QString &storyboard, const QString &ident
     return m_storyboards.value(storyboard).value(identifier);
 }
 
+void Bundle::addInterface(const QString &name, InterfaceLoader loader)
+{
+    m_interfaces.insert(name, std::move(loader));
+}
+
+Bundle::InterfaceLoader Bundle::interfaceLoader(const QString &name) const
+{
+    return m_interfaces.value(name);
+}
+
 } // namespace penwick::platform

@@ -19,6 +19,9 @@ class Bundle
 public:
     /// Makes what a scene holds, complete and loaded.
     using SceneMaker = std::function<std::unique_ptr<QObject>()>;
+    /// Makes what an interface file holds and connects it to its owner, which must be of the class
+    /// that the file is made for.
+    using InterfaceLoader = std::function<void(QObject &owner)>;
 
     /// `imagePath` is the resource folder of the artwork, without a slash at its end.
     explicit Bundle(const QString &imagePath);
@@ -31,9 +34,15 @@ public:
     /// The maker of that scene; empty where there is none.
     [[nodiscard]] SceneMaker scene(const QString &storyboard, const QString &identifier) const;
 
+    /// Adds the interface file `name`.
+    void addInterface(const QString &name, InterfaceLoader loader);
+    /// Its loader; empty where there is none.
+    [[nodiscard]] InterfaceLoader interfaceLoader(const QString &name) const;
+
 private:
     QString m_imagePath;
     QHash<QString, QHash<QString, SceneMaker>> m_storyboards;
+    QHash<QString, InterfaceLoader> m_interfaces;
 };
 
 } // namespace penwick::platform

@@ -39,14 +39,15 @@ Cursor::Cursor(const QIcon &image, Point hotSpot)
 
 Cursor Cursor::arrow()
 {
-    static const auto data = std::make_shared<const Data>();
-    return Cursor(data);
+    // Never destroyed: images need an application, which may be gone by then.
+    static const auto *const data = new std::shared_ptr<const Data>(std::make_shared<const Data>());
+    return Cursor(*data);
 }
 
 Cursor &Cursor::current()
 {
-    static Cursor cursor = arrow();
-    return cursor;
+    static auto *const cursor = new Cursor(arrow());
+    return *cursor;
 }
 
 Point Cursor::hotSpot() const

@@ -5,8 +5,11 @@
 #include "platform/native/NativeDesktop.h"
 
 #include <QEvent>
+#include <QScreen>
 #include <QWidget>
 #include <QWindow>
+
+#include <utility>
 
 namespace penwick::platform {
 
@@ -16,6 +19,9 @@ namespace {
 // what stands there is taken for the answer. The desktop does not announce every step of its own.
 constexpr int looks = 6;
 constexpr int lookInterval = 50; // ms
+
+// Steps of one move by the user follow each other faster than this.
+constexpr int longestRest = 500; // ms
 
 } // namespace
 
@@ -29,10 +35,15 @@ FrameTracker::FrameTracker(QWidget &window)
     connect(&m_check, &QTimer::timeout, this, &FrameTracker::check);
     m_patience.setInterval(lookInterval);
     connect(&m_patience, &QTimer::timeout, this, &FrameTracker::lookAgain);
+    m_userMove.setSingleShot(true);
+    m_userMove.setInterval(longestRest);
     m_window.installEventFilter(this);
 }
 
-FrameTracker::~FrameTracker() = default;
+FrameTracker::~FrameTracker()
+{
+    NativeDesktop::instance().forgetFrame(m_followed);
+}
 
 Rect FrameTracker::frame() const
 {
@@ -63,9 +74,21 @@ void FrameTracker::prepareToShow()
     } else {
         m_margins = native.frameMargins();
     }
+    followFrame();
     applyRequest();
     m_announced = toDesktop(m_frame);
     awaitAnswer();
+}
+
+void FrameTracker::followFrame()
+{
+    QWindow &native = *m_window.windowHandle();
+    m_followed = native.winId();
+    m_corner.reset();
+    NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
+        m_corner = corner;
+        m_check.start();
+    });
 }
 
 void FrameTracker::applyRequest()
@@ -79,6 +102,7 @@ bool FrameTracker::eventFilter(QObject *watched, QEvent *event)
     case QEvent::Move:
     case QEvent::Resize:
     case QEvent::Show:
+    case QEvent::WindowStateChange: // what the frame did while it was minimised was not looked at
         // The events come one by one, and the frame is whole only after the last of them.
         if (watched == &m_window && m_window.isVisible())
             m_check.start();
@@ -91,7 +115,16 @@ bool FrameTracker::eventFilter(QObject *watched, QEvent *event)
 
 QRect FrameTracker::outerGeometry() const
 {
-    return m_window.windowHandle()->frameGeometry();
+    const QWindow &native = *m_window.windowHandle();
+    QRect outer = m_window.windowFlags().testFlag(Qt::FramelessWindowHint) ? native.geometry()
+                                                                           : native.frameGeometry();
+    if (m_corner) {
+        // The toolkit keeps a screen's corner in device pixels and scales what lies inside it.
+        const QPoint screen = native.screen()->geometry().topLeft();
+        outer.moveTopLeft(
+            screen + (QPointF(*m_corner - screen) / native.devicePixelRatio()).toPoint());
+    }
+    return outer;
 }
 
 void FrameTracker::check()
@@ -109,19 +142,48 @@ void FrameTracker::check()
         if (m_isPending)
             return; // until the desktop answers or patience ends
         m_frame = fromDesktop(outer);
+        m_isByUser = true;
     }
     m_isPending = false;
     m_patience.stop();
+    mendToolkit();
     announce();
+}
+
+// A window manager may move a frame without a word to its window right after it has decorated it;
+// the toolkit then holds a place that was true for a moment. It is told the true one as soon as the
+// window moves again; asking for where it stands anyway would move nothing. While the user drags
+// the window, the toolkit may well lag behind.
+void FrameTracker::mendToolkit()
+{
+    const bool isStale = m_corner && !m_isByUser && !m_userMove.isActive()
+        && m_window.windowHandle()->frameGeometry().topLeft() != toDesktop(m_frame).topLeft();
+    if (isStale && !std::exchange(m_isMended, true)) {
+        m_window.setGeometry(toDesktop(m_frame).marginsRemoved(m_margins).translated(1, 0));
+        applyRequest();
+        awaitAnswer();
+    } else if (!isStale) {
+        m_isMended = false;
+    }
 }
 
 // Another title bar is the desktop's doing and not the user's, so the frame that was asked for
 // still holds. A window that was just shown has no margins at all until it is decorated.
 bool FrameTracker::isDecoratedAnew() const
 {
+    if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
+        return false; // whatever the toolkit makes of a frame that is still being built
     const QMargins margins = m_window.windowHandle()->frameMargins();
     return margins != m_margins && !(m_isPending && margins.isNull())
         && !m_window.windowState().testAnyFlags(Qt::WindowMaximized | Qt::WindowFullScreen);
+}
+
+void FrameTracker::announceUserMove()
+{
+    const bool goesOn = m_userMove.isActive();
+    m_userMove.start();
+    if (!goesOn)
+        Q_EMIT moveBegan();
 }
 
 void FrameTracker::awaitAnswer()
@@ -146,9 +208,12 @@ void FrameTracker::announce()
     const bool hasResized = outer.size() != m_announced.size();
     const QPoint delta = outer.topLeft() - m_announced.topLeft();
     m_announced = outer;
+    const bool isByUser = std::exchange(m_isByUser, false);
     if (hasResized)
         Q_EMIT resized();
-    else if (!delta.isNull())
+    else if (!delta.isNull() && isByUser)
+        announceUserMove();
+    if (!hasResized && !delta.isNull())
         Q_EMIT shifted(delta);
     if (!delta.isNull())
         Q_EMIT moved();

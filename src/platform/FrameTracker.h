@@ -9,6 +9,9 @@
 #include <QObject>
 #include <QRect>
 #include <QTimer>
+#include <QWindow>
+
+#include <optional>
 
 class QWidget;
 
@@ -40,18 +43,24 @@ Q_SIGNALS:
     /// The window has another size than when this was last sent, or than when it was shown. Sent
     /// before moved() where both changed.
     void resized();
+    /// The user has begun to move the window. Sent before shifted(), once for each move however
+    /// many steps it has.
+    void moveBegan();
     /// The window was moved by `delta` of Qt's desktop and kept its size. Sent before moved().
     void shifted(QPoint delta);
     /// The window's top left corner is somewhere else.
     void moved();
 
 private:
+    void followFrame();
     void applyRequest();
+    void mendToolkit();
     void check();
     [[nodiscard]] bool isDecoratedAnew() const;
     void awaitAnswer();
     void lookAgain();
     void announce();
+    void announceUserMove();
     [[nodiscard]] QRect outerGeometry() const;
 
     QWidget &m_window;
@@ -59,9 +68,14 @@ private:
     QRect m_announced; // Qt's desktop; what the last signals told of
     QMargins m_margins; // of the desktop, as last used to place the window
     bool m_isPending = false; // asked, not yet granted
+    WId m_followed = 0;
+    std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it
     QTimer m_check;
     QTimer m_patience;
     int m_looksLeft = 0;
+    QTimer m_userMove; // runs while a move by the user may go on
+    bool m_isByUser = false;
+    bool m_isMended = false; // asked once more already
 };
 
 } // namespace penwick::platform

@@ -29,8 +29,7 @@ View::View(QWidget &widget)
 
 View::~View()
 {
-    if (Window *const ownWindow = window())
-        ownWindow->forgetView(*this);
+    forgetInside();
     if (m_superview)
         detachFrom(*m_superview);
     for (const Subview &subview : m_subviews) {
@@ -171,6 +170,7 @@ void View::removeFromSuperview()
     resignInside();
     if (!m_superview) // it removed itself while it resigned
         return;
+    forgetInside(); // it leaves even if it would not resign
     const std::shared_ptr<View> keptUntilDone = [this] {
         for (const Subview &subview : m_superview->m_subviews) {
             if (subview.view == this)
@@ -204,6 +204,16 @@ void View::resignInside()
     }
 }
 
+void View::forgetInside()
+{
+    Window *const ownWindow = window();
+    if (!ownWindow)
+        return;
+    ownWindow->forgetView(*this);
+    for (View *const view : subviews())
+        view->forgetInside();
+}
+
 Window *View::window() const
 {
     return qobject_cast<Window *>(m_widget.window());
@@ -231,6 +241,7 @@ void View::adoptScene()
         m_subviews.push_back({ view, nullptr });
         view->adoptScene();
     }
+    awakeFromScene();
 }
 
 void View::announceWindow()
@@ -264,7 +275,8 @@ void View::setNeedsDisplay()
 
 void View::setNeedsDisplay(const Rect &rect)
 {
-    surface().update(toSurface(rect).toAlignedRect());
+    // Within the view, so that no size, however absurd, is too large for whole numbers.
+    surface().update(toSurface(rect).intersected(surface().rect()).toAlignedRect());
 }
 
 void View::addCursorRect(const Rect &rect, const Cursor &cursor)
@@ -273,6 +285,22 @@ void View::addCursorRect(const Rect &rect, const Cursor &cursor)
         fatalError("a cursor rectangle covers its view's bounds");
     m_cursor = cursor;
     surface().setCursor(cursor.forScale(m_widget.devicePixelRatioF()));
+}
+
+void View::addGestureRecognizer(PanGestureRecognizer &recognizer)
+{
+    removeGestureRecognizer(recognizer);
+    m_gestureRecognizers.push_back(&recognizer);
+}
+
+void View::removeGestureRecognizer(PanGestureRecognizer &recognizer)
+{
+    std::erase(m_gestureRecognizers, &recognizer);
+}
+
+std::vector<PanGestureRecognizer *> View::gestureRecognizers() const
+{
+    return m_gestureRecognizers;
 }
 
 void View::refreshCursorRects()

@@ -18,6 +18,7 @@ class QWidget;
 
 namespace penwick::platform {
 
+class PanGestureRecognizer;
 class Window;
 
 /// One press, drag, release or move of the left button's pointer.
@@ -101,6 +102,11 @@ public:
     /// Shows `cursor` while the pointer is over `rect`. Only the whole bounds are supported.
     void addCursorRect(const Rect &rect, const Cursor &cursor);
 
+    /// Lets `recognizer` follow the pointer over this view, the press being handled included. One
+    /// that does already goes on. Borrowed.
+    void addGestureRecognizer(PanGestureRecognizer &recognizer);
+    void removeGestureRecognizer(PanGestureRecognizer &recognizer);
+
     // What classes override.
 
     /// Paints the content; `dirtyRect` is in the view's own coordinates.
@@ -114,6 +120,8 @@ public:
     virtual void keyUp(const KeyEvent &event) = 0;
     /// Declares the view's cursors with addCursorRect().
     virtual void resetCursorRects() { }
+    /// The scene that the view comes from is complete.
+    virtual void awakeFromScene() { }
     /// The view came into a window or left one.
     virtual void viewDidMoveToWindow() { }
     /// Answers whether the view gives the first responder up.
@@ -134,6 +142,8 @@ protected:
 
     void widgetResized();
     void pointerEntered();
+    /// The recognizers that follow the pointer now; a copy, because an action may change them.
+    [[nodiscard]] std::vector<PanGestureRecognizer *> gestureRecognizers() const;
     /// `position`, of the surface's pixels from its top left corner, in window coordinates.
     [[nodiscard]] Point locationInWindow(double x, double y) const;
     /// The widget's area that `rect` covers, as Qt counts.
@@ -149,6 +159,7 @@ private:
 
     void detachFrom(View &superview);
     void resignInside();
+    void forgetInside();
     [[nodiscard]] Point toWindow(Point point) const;
     [[nodiscard]] Point fromWindow(Point point) const;
 
@@ -161,6 +172,7 @@ private:
     bool m_wantsLayer = false;
     Layer m_layer;
     std::optional<Cursor> m_cursor;
+    std::vector<PanGestureRecognizer *> m_gestureRecognizers;
 };
 
 /// Makes a view that is held by reference: it is deleted from the event loop after the last

@@ -25,6 +25,9 @@ public:
 
     /// The view has been loaded.
     virtual void viewDidLoad() { }
+    /// The window whose content the view is was asked to come to the screen; not again when it
+    /// only comes back together with the window that it belongs to.
+    virtual void viewWillAppear() { }
 
 private:
     View *m_view = nullptr;

@@ -2,6 +2,8 @@
 // Makes a view of any widget class: Qt's events go in, the view's operations come out.
 #pragma once
 
+#include "platform/PanGestureRecognizer.h"
+#include "platform/PointerPress.h"
 #include "platform/View.h"
 
 #include <QAbstractScrollArea>
@@ -11,6 +13,7 @@
 #include <QPainter>
 
 #include <type_traits>
+#include <utility>
 
 namespace penwick::platform {
 
@@ -32,8 +35,11 @@ public:
         : Base(parent)
         , View(static_cast<QWidget &>(*this))
     {
-        this->setMouseTracking(true);
+        this->setFocusPolicy(Qt::NoFocus); // only makeFirstResponder() moves the keys
+        surface().setMouseTracking(true);
     }
+
+    ~ViewOf() override { forgetPress(); }
 
     [[nodiscard]] QWidget &surface() const final
     {
@@ -44,7 +50,13 @@ public:
     }
 
     void draw(const Rect &) override { Base::paintEvent(m_paintEvent); }
-    void mouseDown(const MouseEvent &) override { Base::mousePressEvent(m_mouseEvent); }
+    void mouseDown(const MouseEvent &) override
+    {
+        if (m_mouseEvent->type() == QEvent::MouseButtonDblClick)
+            Base::mouseDoubleClickEvent(m_mouseEvent);
+        else
+            Base::mousePressEvent(m_mouseEvent);
+    }
     void mouseDragged(const MouseEvent &) override { Base::mouseMoveEvent(m_mouseEvent); }
     void mouseUp(const MouseEvent &) override { Base::mouseReleaseEvent(m_mouseEvent); }
     void mouseMoved(const MouseEvent &) override { Base::mouseMoveEvent(m_mouseEvent); }
@@ -83,7 +95,14 @@ protected:
         }
     }
 
-    void mousePressEvent(QMouseEvent *event) override { press(event, 1); }
+    void mousePressEvent(QMouseEvent *event) override
+    {
+        // A class without a meaning for double clicks makes another press of one.
+        if (event == m_mouseEvent)
+            Base::mousePressEvent(event);
+        else
+            press(event, 1);
+    }
     void mouseDoubleClickEvent(QMouseEvent *event) override { press(event, 2); }
 
     void mouseMoveEvent(QMouseEvent *event) override
@@ -93,7 +112,7 @@ protected:
         if (event->buttons() == Qt::NoButton)
             mouseMoved(translated(event, 0));
         else if (m_isPressed && event->buttons().testFlag(Qt::LeftButton))
-            mouseDragged(translated(event, m_clickCount));
+            drag(translated(event, m_clickCount));
         m_mouseEvent = nullptr;
     }
 
@@ -104,8 +123,19 @@ protected:
             return;
         m_isPressed = false;
         m_mouseEvent = event;
-        mouseUp(translated(event, m_clickCount));
+        const MouseEvent release = translated(event, m_clickCount);
+        for (PanGestureRecognizer *const recognizer : gestureRecognizers())
+            recognizer->released(release.locationInWindow);
+        mouseUp(release);
         m_mouseEvent = nullptr;
+        pointerWasReleased();
+    }
+
+    // A view that leaves the screen under the pointer hears of no release.
+    void hideEvent(QHideEvent *event) override
+    {
+        Base::hideEvent(event);
+        forgetPress();
     }
 
     void enterEvent(QEnterEvent *event) override
@@ -156,10 +186,27 @@ private:
         if (event->button() != Qt::LeftButton)
             return;
         m_isPressed = true;
+        pointerWasPressed();
         m_clickCount = clickCount;
         m_mouseEvent = event;
-        mouseDown(translated(event, clickCount));
+        const MouseEvent press = translated(event, clickCount);
+        mouseDown(press);
+        for (PanGestureRecognizer *const recognizer : gestureRecognizers())
+            recognizer->pressed(press.locationInWindow);
         m_mouseEvent = nullptr;
+    }
+
+    void forgetPress()
+    {
+        if (std::exchange(m_isPressed, false))
+            pointerWasReleased();
+    }
+
+    void drag(const MouseEvent &event)
+    {
+        mouseDragged(event);
+        for (PanGestureRecognizer *const recognizer : gestureRecognizers())
+            recognizer->dragged(event.locationInWindow);
     }
 
     [[nodiscard]] MouseEvent translated(const QMouseEvent *event, int clickCount) const

@@ -4,29 +4,20 @@
 #include <penwick/platform/WindowController.h>
 
 #include "platform/FrameTracker.h"
+#include "platform/Glide.h"
+#include "platform/ScreenCoordinates.h"
 #include "platform/View.h"
 #include "platform/ViewController.h"
+#include "platform/WindowFamily.h"
 #include "platform/WindowFlags.h"
 
 #include <QCloseEvent>
 #include <QPainter>
-#include <QVariantAnimation>
 #include <QWindow>
 
+#include <utility>
+
 namespace penwick::platform {
-
-namespace {
-
-constexpr int glideTime = 200; // ms
-
-Rect between(const Rect &from, const Rect &to, double progress)
-{
-    const auto mix = [progress](double a, double b) { return a + (b - a) * progress; };
-    return { mix(from.x, to.x), mix(from.y, to.y), mix(from.width, to.width),
-        mix(from.height, to.height) };
-}
-
-} // namespace
 
 WindowDelegate::~WindowDelegate() = default;
 
@@ -35,17 +26,18 @@ class Window::Private
 public:
     explicit Private(Window &window)
         : tracker(new FrameTracker(window))
+        , glide(new Glide(*tracker))
     { }
 
     FrameTracker *const tracker; // a child of the window
-    std::optional<Rect> glideTarget;
-    QPointer<QVariantAnimation> glide;
+    Glide *const glide; // a child of the tracker
+    WindowFamily family;
     std::unique_ptr<ViewController> contentViewController;
     QPointer<WindowController> windowController;
-    QPointer<Window> parentWindow;
-    std::vector<QPointer<Window>> childWindows;
-    bool isOrderedIn = false; // on the screen, or will be as soon as its parent is
     bool isClosed = false;
+    bool isMain = false;
+    bool isContentBorrowed = false;
+    std::optional<QPoint> grab; // of a drag by the background, from the window's corner
 };
 
 Window::Window(QWidget *parent)
@@ -53,11 +45,15 @@ Window::Window(QWidget *parent)
     , d(std::make_unique<Private>(*this))
 {
     setAttribute(Qt::WA_QuitOnClose, false);
-    connect(d->tracker, &FrameTracker::shifted, this, &Window::takeChildrenAlong);
-    connect(d->tracker, &FrameTracker::moved, this, [this] {
-        if (m_delegateObject)
-            m_delegate->windowDidMove();
-    });
+    setAttribute(Qt::WA_AlwaysShowToolTips); // a panel is never the active window
+    connect(d->tracker, &FrameTracker::shifted, this,
+        [this](QPoint delta) { d->family.takeAlong(delta); });
+    connect(d->tracker, &FrameTracker::moveBegan, this,
+        [this] { tellDelegate(&WindowDelegate::windowWillMove); });
+    connect(d->tracker, &FrameTracker::moved, this,
+        [this] { tellDelegate(&WindowDelegate::windowDidMove); });
+    connect(d->tracker, &FrameTracker::resized, this,
+        [this] { tellDelegate(&WindowDelegate::windowDidResize); });
     applyAttributes();
 }
 
@@ -67,35 +63,24 @@ Window::~Window()
     m_firstResponder = nullptr;
     for (Window *const child : childWindows())
         child->hide();
+    releaseContentView();
 }
 
 // Frame
 
 Rect Window::frame() const
 {
-    return d->glideTarget ? *d->glideTarget : d->tracker->frame();
+    return d->glide->target().value_or(d->tracker->frame());
 }
 
 void Window::setFrame(const Rect &frame, Animate animate)
 {
-    delete d->glide;
-    d->glideTarget.reset();
-    if (animate == Animate::No || !isVisible() || frame == d->tracker->frame()) {
-        d->tracker->request(frame);
+    if (animate == Animate::Yes && isVisible() && !(frame == d->tracker->frame())) {
+        d->glide->start(frame);
         return;
     }
-    const Rect start = d->tracker->frame();
-    d->glideTarget = frame;
-    d->glide = new QVariantAnimation(this);
-    d->glide->setDuration(glideTime);
-    d->glide->setEasingCurve(QEasingCurve::OutCubic);
-    d->glide->setStartValue(0.0);
-    d->glide->setEndValue(1.0);
-    connect(d->glide, &QVariantAnimation::valueChanged, this, [this, start](const QVariant &value) {
-        d->tracker->request(between(start, *d->glideTarget, value.toDouble()));
-    });
-    connect(d->glide, &QVariantAnimation::finished, this, [this] { d->glideTarget.reset(); });
-    d->glide->start(QAbstractAnimation::DeleteWhenStopped);
+    d->glide->stop();
+    d->tracker->request(frame);
 }
 
 void Window::setFrameOrigin(Point origin)
@@ -132,9 +117,27 @@ void Window::applyAttributes()
 
 void Window::setContentView(View *view)
 {
+    if (view != m_contentView)
+        releaseContentView();
     m_contentView = view;
-    if (view)
-        view->setFrame({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
+    if (!view)
+        return;
+    if (view->widget().parentWidget() != this) {
+        d->isContentBorrowed = true;
+        view->widget().setParent(this);
+        view->announceWindow();
+        view->widget().show();
+    }
+    view->setFrame({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
+}
+
+void Window::releaseContentView()
+{
+    if (!m_contentView || !std::exchange(d->isContentBorrowed, false))
+        return;
+    m_contentView->widget().hide();
+    m_contentView->widget().setParent(nullptr);
+    m_contentView = nullptr;
 }
 
 ViewController *Window::contentViewController() const
@@ -161,6 +164,12 @@ void Window::setWindowController(WindowController *controller)
     d->windowController = controller;
 }
 
+void Window::tellDelegate(void (WindowDelegate::*what)())
+{
+    if (m_delegateObject)
+        (m_delegate->*what)();
+}
+
 void Window::setDelegate(WindowDelegate *delegate)
 {
     m_delegateObject = dynamic_cast<QObject *>(delegate);
@@ -169,6 +178,7 @@ void Window::setDelegate(WindowDelegate *delegate)
 
 void Window::adoptScene()
 {
+    d->tracker->request({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
     for (View *const view : topViews()) {
         view->adoptScene();
         view->announceWindow();
@@ -197,7 +207,9 @@ bool Window::makeFirstResponder(View *view)
             m_firstResponder = previous;
             return false;
         }
-        m_firstResponder = view && view->window() == this ? view : nullptr;
+        // Whom it chose instead of itself, as it did, comes before nobody.
+        if (view || !m_firstResponder)
+            m_firstResponder = view && view->window() == this ? view : nullptr;
     }
     QWidget &receiver = m_firstResponder ? m_firstResponder->widget() : *this;
     receiver.setFocus(Qt::OtherFocusReason);
@@ -221,50 +233,32 @@ void Window::invalidateCursorRects(View &view)
 
 void Window::addChildWindow(Window &child)
 {
-    if (child.d->parentWindow != this) {
-        if (Window *const former = child.d->parentWindow)
-            std::erase(former->d->childWindows, &child);
-        child.d->parentWindow = this;
-        d->childWindows.emplace_back(&child);
+    if (child.parentWindow() != this) {
+        if (Window *const former = child.parentWindow())
+            former->d->family.remove(child);
+        child.d->family.setParent(this);
+        d->family.add(child);
     }
-    child.orderFront();
+    if (child.d->family.canShow())
+        child.orderFront();
 }
 
 Window *Window::parentWindow() const
 {
-    return d->parentWindow;
+    return d->family.parent();
 }
 
 std::vector<Window *> Window::childWindows() const
 {
-    std::vector<Window *> children;
-    for (const auto &child : d->childWindows) {
-        if (child)
-            children.push_back(child);
-    }
-    return children;
-}
-
-void Window::takeChildrenAlong(QPoint delta)
-{
-    for (Window *const child : childWindows()) {
-        const Point origin = child->frame().origin();
-        child->setFrameOrigin({ origin.x + delta.x(), origin.y - delta.y() });
-    }
+    return d->family.children();
 }
 
 // Showing and closing
 
-bool Window::canShow() const
-{
-    const Window *const parent = d->parentWindow;
-    return !parent || (parent->isVisible() && !parent->isMinimized());
-}
-
 void Window::showFamily()
 {
     for (Window *const child : childWindows()) {
-        if (child->d->isOrderedIn && !child->isVisible())
+        if (child->d->family.isOrderedIn() && !child->isVisible())
             child->show();
     }
 }
@@ -272,9 +266,9 @@ void Window::showFamily()
 void Window::hideFamily()
 {
     for (Window *const child : childWindows()) {
-        const bool comesBack = child->d->isOrderedIn;
+        const bool comesBack = child->d->family.isOrderedIn();
         child->hide();
-        child->d->isOrderedIn = comesBack;
+        child->d->family.setOrderedIn(comesBack);
     }
 }
 
@@ -289,17 +283,29 @@ void Window::orderOut()
     hide();
 }
 
+void Window::orderIn()
+{
+    if (d->family.isOrderedIn())
+        return;
+    d->family.setOrderedIn(true);
+    d->isClosed = false;
+    if (d->contentViewController)
+        d->contentViewController->viewWillAppear();
+}
+
 void Window::setVisible(bool visible)
 {
-    d->isOrderedIn = visible;
-    if (visible && !canShow())
+    if (visible)
+        orderIn();
+    else
+        d->family.setOrderedIn(false);
+    if (visible && !d->family.canShow())
         return;
     if (visible && !isVisible()) {
-        d->isClosed = false;
         d->tracker->prepareToShow();
         // Not a widget's child: a window outlives the one it stands above.
         windowHandle()->setTransientParent(
-            d->parentWindow ? d->parentWindow->windowHandle() : nullptr);
+            parentWindow() ? parentWindow()->windowHandle() : nullptr);
     }
     QWidget::setVisible(visible);
     if (visible)
@@ -311,12 +317,9 @@ void Window::setVisible(bool visible)
 void Window::changeEvent(QEvent *event)
 {
     QWidget::changeEvent(event);
-    if (event->type() != QEvent::WindowStateChange)
-        return;
-    if (isMinimized())
-        hideFamily();
-    else
-        showFamily();
+    if (event->type() == QEvent::ActivationChange && std::exchange(d->isMain, isActiveWindow())
+        && !isActiveWindow())
+        tellDelegate(&WindowDelegate::windowDidResignMain);
 }
 
 void Window::closeEvent(QCloseEvent *event)
@@ -325,8 +328,47 @@ void Window::closeEvent(QCloseEvent *event)
     if (d->isClosed)
         return;
     d->isClosed = true;
-    if (m_delegateObject)
-        m_delegate->windowWillClose();
+    tellDelegate(&WindowDelegate::windowWillClose);
+}
+
+// Whatever no view has taken
+
+void Window::keyPressEvent(QKeyEvent *event)
+{
+    if (d->windowController && d->windowController->keyDown(*event))
+        event->accept();
+    else
+        QWidget::keyPressEvent(event);
+}
+
+void Window::mousePressEvent(QMouseEvent *event)
+{
+    event->accept();
+    if (event->button() != Qt::LeftButton)
+        return;
+    if (m_attributes.isMovable && m_attributes.isMovableByWindowBackground)
+        d->grab = event->globalPosition().toPoint() - pos();
+    if (d->windowController)
+        d->windowController->mouseDown();
+}
+
+void Window::mouseMoveEvent(QMouseEvent *event)
+{
+    event->accept();
+    if (!d->grab || !event->buttons().testFlag(Qt::LeftButton))
+        return;
+    const QPoint corner = event->globalPosition().toPoint() - *d->grab;
+    setFrame(fromDesktop(QRect(corner, frameGeometry().size())));
+}
+
+void Window::mouseReleaseEvent(QMouseEvent *event)
+{
+    event->accept();
+    if (event->button() != Qt::LeftButton)
+        return;
+    d->grab.reset();
+    if (d->windowController)
+        d->windowController->mouseUp();
 }
 
 void Window::resizeEvent(QResizeEvent *event)

@@ -29,6 +29,11 @@ void WindowController::showWindow(QObject *)
     m_window->activateWindow();
 }
 
+bool WindowController::keyDown(const QKeyEvent &)
+{
+    return false;
+}
+
 void WindowController::retire()
 {
     if (m_window)

@@ -45,6 +45,9 @@ struct WindowAttributes
     bool hasShadow = true;
     bool isOpaque = true;
     bool ignoresMouseEvents = false;
+    bool isMovable = true;
+    bool isMovableByWindowBackground = false; ///< dragged wherever no view takes the pointer
+    bool showsToolbarButton = false;
     QColor backgroundColor = Qt::white;
     std::optional<Size> aspectRatio; ///< of the frame, kept while the user resizes
 
@@ -56,7 +59,10 @@ class PENWICK_EXPORT WindowDelegate
 {
 public:
     virtual ~WindowDelegate();
+    virtual void windowWillMove() { } ///< the user has begun to move it
     virtual void windowDidMove() { }
+    virtual void windowDidResize() { } ///< before windowDidMove() where both changed
+    virtual void windowDidResignMain() { } ///< another window of the desktop has taken over
     virtual void windowWillClose() { }
 };
 
@@ -105,7 +111,8 @@ public:
     // Content
 
     [[nodiscard]] View *contentView() const { return m_contentView; }
-    /// Lets `view`, one of this window's own widgets, fill the window's content.
+    /// Lets `view` fill the window's content. A view from outside is borrowed: it comes into this
+    /// window and leaves it again when another one takes its place.
     void setContentView(View *view);
     [[nodiscard]] ViewController *contentViewController() const;
     /// Takes `controller`, whose view must be one of this window's own.
@@ -141,15 +148,20 @@ public:
 protected:
     void changeEvent(QEvent *event) override;
     void closeEvent(QCloseEvent *event) override;
+    void keyPressEvent(QKeyEvent *event) override;
+    void mouseMoveEvent(QMouseEvent *event) override;
+    void mousePressEvent(QMouseEvent *event) override;
+    void mouseReleaseEvent(QMouseEvent *event) override;
     void paintEvent(QPaintEvent *event) override;
     void resizeEvent(QResizeEvent *event) override;
 
 private:
     void applyAttributes();
-    [[nodiscard]] bool canShow() const;
+    void orderIn();
+    void releaseContentView();
+    void tellDelegate(void (WindowDelegate::*what)());
     void showFamily();
     void hideFamily();
-    void takeChildrenAlong(QPoint delta);
     [[nodiscard]] std::vector<View *> topViews() const;
 
     class Private;

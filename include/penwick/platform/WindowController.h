@@ -8,6 +8,8 @@
 
 #include <memory>
 
+class QKeyEvent;
+
 namespace penwick::platform {
 
 class Window;
@@ -35,6 +37,12 @@ public:
 
     /// The window has been loaded.
     virtual void windowDidLoad() { }
+    /// The left button went down where no view of the window took it.
+    virtual void mouseDown() { }
+    /// It was let go again.
+    virtual void mouseUp() { }
+    /// A key went down that no view of the window took; answers whether it does something here.
+    virtual bool keyDown(const QKeyEvent &event);
 
 private:
     std::unique_ptr<Window> m_window;

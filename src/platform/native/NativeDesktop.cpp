@@ -1,14 +1,22 @@
 // SPDX-License-Identifier: MIT
 #include "platform/native/NativeDesktop.h"
 
+#include <QCoreApplication>
+#include <QPointer>
+
 namespace penwick::platform {
 
 NativeDesktop &NativeDesktop::instance()
 {
-    static const std::unique_ptr<NativeDesktop> desktop = [] {
-        auto native = makeNativeDesktop();
-        return native ? std::move(native) : std::make_unique<NativeDesktop>();
-    }();
+    // One for each application: the connection to the desktop goes with it.
+    static QPointer<QObject> application;
+    static std::unique_ptr<NativeDesktop> desktop;
+    if (!desktop || application != qApp) {
+        application = qApp;
+        desktop = makeNativeDesktop();
+        if (!desktop)
+            desktop = std::make_unique<NativeDesktop>();
+    }
     return *desktop;
 }
 
@@ -16,5 +24,9 @@ std::optional<QMargins> NativeDesktop::frameMarginsBeforeShow(QWindow &)
 {
     return std::nullopt;
 }
+
+void NativeDesktop::followFrame(QWindow &, FrameListener) { }
+
+void NativeDesktop::forgetFrame(WId) { }
 
 } // namespace penwick::platform

@@ -3,11 +3,12 @@
 #pragma once
 
 #include <QMargins>
+#include <QPoint>
+#include <QWindow>
 
+#include <functional>
 #include <memory>
 #include <optional>
-
-class QWindow;
 
 namespace penwick::platform {
 
@@ -25,6 +26,18 @@ public:
     /// not been shown, in device pixels. Nothing where the desktop does not tell beforehand.
     /// Waits for the answer, at most for a few frames.
     virtual std::optional<QMargins> frameMarginsBeforeShow(QWindow &window);
+
+    /// Told where the top left corner of a window's frame is, in device pixels of the desktop;
+    /// nothing while the window has no frame of the window manager's.
+    using FrameListener = std::function<void(std::optional<QPoint> corner)>;
+
+    /// Calls `listener` from now on whenever the window manager moves `window`'s frame, also where
+    /// it tells the window itself only at the end, and keeps the window's being dragged by its
+    /// title bar from looking like another window's taking over. Replaces an earlier listener of
+    /// the same window. Does nothing where the desktop, or the host, leaves no way to know.
+    virtual void followFrame(QWindow &window, FrameListener listener);
+    /// Ends it; `window` may be gone.
+    virtual void forgetFrame(WId window);
 };
 
 /// The desktop of this build's platform; null where the running application is not on it.

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 // X11, through Qt's own connection.
 #include "platform/native/NativeDesktop.h"
+#include "platform/native/X11FrameFollower.h"
+#include "platform/native/X11Reply.h"
 
 #include <QElapsedTimer>
 #include <QGuiApplication>
@@ -10,7 +12,6 @@
 #include <xcb/xcb.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <cstring>
 #include <string_view>
 #include <vector>
@@ -22,12 +23,6 @@ namespace {
 // A window manager answers within a millisecond; one that does not is not waited for.
 constexpr int longestWait = 50; // ms
 
-template <class Reply>
-std::unique_ptr<Reply, decltype(&std::free)> owned(Reply *reply)
-{
-    return { reply, &std::free };
-}
-
 class NativeDesktopX11 final : public NativeDesktop
 {
 public:
@@ -37,6 +32,7 @@ public:
         , m_supported(atom("_NET_SUPPORTED"))
         , m_frameExtents(atom("_NET_FRAME_EXTENTS"))
         , m_requestFrameExtents(atom("_NET_REQUEST_FRAME_EXTENTS"))
+        , m_frames(connection, m_root)
     { }
 
     std::optional<QMargins> frameMarginsBeforeShow(QWindow &window) override
@@ -59,6 +55,13 @@ public:
         }
         return std::nullopt;
     }
+
+    void followFrame(QWindow &window, FrameListener listener) override
+    {
+        m_frames.follow(static_cast<xcb_window_t>(window.winId()), std::move(listener));
+    }
+
+    void forgetFrame(WId window) override { m_frames.forget(static_cast<xcb_window_t>(window)); }
 
 private:
     [[nodiscard]] xcb_atom_t atom(std::string_view name) const
@@ -106,6 +109,7 @@ private:
     const xcb_atom_t m_supported;
     const xcb_atom_t m_frameExtents;
     const xcb_atom_t m_requestFrameExtents;
+    X11FrameFollower m_frames;
 };
 
 } // namespace

@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+// Follows the frames that a window manager puts around windows.
+// Some tell a window that is dragged by its title bar nothing until it is let go; the frame itself
+// always knows.
+#pragma once
+
+#include "platform/native/NativeDesktop.h"
+
+#include <QAbstractNativeEventFilter>
+
+#include <xcb/xcb.h>
+
+#include <vector>
+
+namespace penwick::platform {
+
+/// Listens on the application's own connection. A host that runs without native event filters
+/// hears nothing, and the windows are followed by what the toolkit tells.
+class X11FrameFollower final : public QAbstractNativeEventFilter
+{
+public:
+    X11FrameFollower(xcb_connection_t *connection, xcb_window_t root);
+    ~X11FrameFollower() override;
+
+    void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
+    void forget(xcb_window_t window);
+
+    bool nativeEventFilter(const QByteArray &eventType, void *message, qintptr *result) override;
+
+private:
+    struct Followed
+    {
+        xcb_window_t window;
+        xcb_window_t frame; // XCB_NONE while there is none
+        NativeDesktop::FrameListener listener;
+    };
+
+    [[nodiscard]] Followed *find(xcb_window_t window);
+    [[nodiscard]] xcb_window_t childOfRootAround(xcb_window_t window) const;
+    void onReparented(const xcb_reparent_notify_event_t &event);
+    void onConfigured(const xcb_configure_notify_event_t &event);
+    [[nodiscard]] bool isFocusOfAGrab(const xcb_focus_in_event_t &event);
+
+    xcb_connection_t *const m_connection;
+    const xcb_window_t m_root;
+    std::vector<Followed> m_followed;
+};
+
+} // namespace penwick::platform
