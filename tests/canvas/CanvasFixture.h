@@ -151,7 +151,7 @@ protected:
         return model().pathArray().last().pathId;
     }
 
-    /// Places a text box with the text tool, then goes back to the tool that there was.
+    /// Places an empty text box with the text tool, then goes back to the tool that there was.
     std::int64_t textBox(Point point)
     {
         const QString tool = canvas->currentSelectedTool();
@@ -161,6 +161,24 @@ protected:
         canvas->setCurrentSelectedTool(tool);
         settle();
         return model().textBoxArray().last().textId;
+    }
+
+    /// The same with text in it, and still edited.
+    std::int64_t writtenTextBox(Point point)
+    {
+        const std::int64_t id = textBox(point);
+        QTest::keyClicks(model().textBoxArray().last().textBox.get(), QStringLiteral("Text"));
+        settle();
+        return id;
+    }
+
+    /// The same, and left: its text keeps it, its delete button is a hidden subview from now on.
+    std::int64_t placedTextBox(Point point)
+    {
+        const std::int64_t id = writtenTextBox(point);
+        window.makeFirstResponder(canvas);
+        settle();
+        return id;
     }
 
     [[nodiscard]] DrawingCanvasModel &model() const { return *controller->drawingCanvasModel(); }

@@ -61,10 +61,12 @@ TEST_F(DrawViewControllerHistoryTest, undoOfATextBoxTakesItOffTheCanvasAndRedoBr
 {
     const std::int64_t id = textBox({ 20, 100 });
     const auto box = model().textBoxArray().last().textBox;
+    platform::View *const button = box->deleteTextButton();
     static_cast<void>(recorder.take());
 
     controller->handleToolSelection(undo);
-    EXPECT_TRUE(canvas->subviews().empty());
+    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { button });
+    EXPECT_TRUE(button->isHidden());
     EXPECT_EQ(idsOf(canvas->textBoxArray()), Ids());
     EXPECT_EQ(recorder.take(),
         (Posts { "removeWithId " + std::to_string(id), "redraw", "enableRedo true",
@@ -72,9 +74,10 @@ TEST_F(DrawViewControllerHistoryTest, undoOfATextBoxTakesItOffTheCanvasAndRedoBr
 
     controller->handleToolSelection(redo);
     EXPECT_EQ(recorder.take(), (Posts { "enableUndo true", "enableRedo false", "redraw" }));
-    EXPECT_TRUE(canvas->subviews().empty()); // it comes with the repaint
-    settle();
-    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { box.get() });
+    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { button });
+    settle(); // it comes with the repaint
+    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { button, box.get() }));
+    EXPECT_TRUE(button->isHidden());
     EXPECT_EQ(box->frame(), (Rect { 20, 76, 200, 30 }));
 }
 
@@ -110,7 +113,7 @@ TEST_F(DrawViewControllerHistoryTest, clearDropsStrokesAndBoxesAndOneUndoBringsA
 {
     const Ids strokes { stroke({ { 20, 50 }, { 200, 50 } }),
         stroke({ { 20, 150 }, { 200, 150 } }) };
-    const std::int64_t box = textBox({ 20, 100 });
+    const std::int64_t box = placedTextBox({ 20, 100 });
     static_cast<void>(recorder.take());
     PaintRecorder painted(*canvas);
 
@@ -143,7 +146,7 @@ TEST_F(DrawViewControllerHistoryTest, clearWithStrokesOnlyOrBoxesOnlyClears)
     EXPECT_EQ(history().undoStack().size(), 1);
     EXPECT_TRUE(model().pathArray().isEmpty());
 
-    textBox({ 20, 100 });
+    placedTextBox({ 20, 100 });
     controller->handleToolSelection(clear);
     EXPECT_EQ(history().undoStack().size(), 1);
     EXPECT_TRUE(model().textBoxArray().isEmpty());
@@ -165,7 +168,7 @@ TEST_F(DrawViewControllerHistoryTest, clearWithNothingButAHiddenSubviewClears)
 
 TEST_F(DrawViewControllerHistoryTest, clearWhileABoxIsEditedLeavesNobodyFirstResponder)
 {
-    textBox({ 20, 100 });
+    writtenTextBox({ 20, 100 });
     ASSERT_EQ(window.firstResponder(), canvas->subviews().front());
 
     controller->handleToolSelection(clear);
@@ -177,7 +180,7 @@ TEST_F(DrawViewControllerHistoryTest, clearWhileABoxIsEditedLeavesNobodyFirstRes
 
 TEST_F(DrawViewControllerHistoryTest, clearedBoxesAreOffTheCanvasBeforeTheClearIsAnnounced)
 {
-    textBox({ 20, 100 });
+    writtenTextBox({ 20, 100 });
     std::vector<std::size_t> subviews;
     auto &center = platform::NotificationCenter::defaultCenter();
     center.addObserver(this, penwickNotificationKey(),

@@ -18,8 +18,8 @@ using DrawViewControllerSubviewTest = CanvasFixture;
 TEST_F(
     DrawViewControllerSubviewTest, boxThatDeletesItselfLeavesTheModelAndTheCanvasIsFirstResponder)
 {
-    const std::int64_t kept = textBox({ 20, 160 });
-    textBox({ 20, 100 });
+    const std::int64_t kept = placedTextBox({ 20, 160 });
+    writtenTextBox({ 20, 100 });
     const auto box = model().textBoxArray().last().textBox;
     const std::int64_t id = box->hash();
     static_cast<void>(recorder.take());
@@ -40,11 +40,13 @@ TEST_F(
 
 TEST_F(DrawViewControllerSubviewTest, undoOfADeletionBringsTheSameBoxWithTheSameHashBack)
 {
-    const std::int64_t id = textBox({ 20, 100 });
+    const std::int64_t id = writtenTextBox({ 20, 100 });
     const auto box = model().textBoxArray().last().textBox;
+    platform::View *const button = box->deleteTextButton();
     box->deleteTextBox();
     settle();
-    ASSERT_TRUE(canvas->subviews().empty());
+    ASSERT_EQ(canvas->subviews(), std::vector<platform::View *> { button });
+    ASSERT_TRUE(button->isHidden());
     static_cast<void>(recorder.take());
 
     controller->handleToolSelection(undo);
@@ -53,13 +55,14 @@ TEST_F(DrawViewControllerSubviewTest, undoOfADeletionBringsTheSameBoxWithTheSame
     EXPECT_EQ(idsOf(model().textBoxArray()), Ids { id });
     EXPECT_EQ(model().textBoxArray().last().textBox, box);
     EXPECT_EQ(box->hash(), id);
-    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { box.get() });
+    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { button, box.get() }));
+    EXPECT_TRUE(button->isHidden());
     EXPECT_EQ(recorder.take(), (Posts { "enableRedo true", "redraw" }));
 }
 
 TEST_F(DrawViewControllerSubviewTest, deletionOfAnUnknownBoxOnlyRepaintsAndTakesTheFirstResponder)
 {
-    const std::int64_t kept = textBox({ 20, 100 });
+    const std::int64_t kept = writtenTextBox({ 20, 100 });
     static_cast<void>(recorder.take());
 
     controller->shouldDeleteTheTextBox(-1);
@@ -74,9 +77,12 @@ TEST_F(DrawViewControllerSubviewTest, deletionOfAnUnknownBoxOnlyRepaintsAndTakes
 
 TEST_F(DrawViewControllerSubviewTest, removalByIdentifierTakesThatTextBoxOnly)
 {
-    const std::int64_t first = textBox({ 20, 60 });
-    const std::int64_t second = textBox({ 20, 100 });
-    const std::int64_t third = textBox({ 20, 160 });
+    const std::int64_t first = placedTextBox({ 20, 60 });
+    const std::int64_t second = placedTextBox({ 20, 100 });
+    const std::int64_t third = placedTextBox({ 20, 160 });
+    Ids buttons;
+    for (const TextBoxEntry &entry : model().textBoxArray())
+        buttons.push_back(entry.textBox->deleteTextButton()->hash());
 
     controller->handlDrawingCanvasSubviewOperation(
         { QString(), SubviewOperation::removeWithId(second).toVariant() });
@@ -84,13 +90,13 @@ TEST_F(DrawViewControllerSubviewTest, removalByIdentifierTakesThatTextBoxOnly)
     Ids left;
     for (const platform::View *const view : canvas->subviews())
         left.push_back(view->hash());
-    EXPECT_EQ(left, (Ids { first, third }));
+    EXPECT_EQ(left, (Ids { first, buttons[0], buttons[1], third, buttons[2] }));
     EXPECT_EQ(model().textBoxArray().size(), 3);
 }
 
 TEST_F(DrawViewControllerSubviewTest, removalByTheIdentifierOfABoxThatIsNoSubviewDoesNothing)
 {
-    const std::int64_t gone = textBox({ 20, 60 });
+    const std::int64_t gone = placedTextBox({ 20, 60 });
     const auto box = model().textBoxArray().last().textBox;
     box->removeFromSuperview();
     addPlainView();
@@ -113,15 +119,16 @@ TEST_F(DrawViewControllerSubviewTest, removalByIdentifierSparesAViewThatIsNoText
 TEST_F(DrawViewControllerSubviewTest, firstLastAndAllTakeWhateverStandsThere)
 {
     const auto bottom = addPlainView();
-    textBox({ 20, 60 });
+    placedTextBox({ 20, 60 });
     const auto top = addPlainView();
-    platform::View *const box = model().textBoxArray().last().textBox.get();
+    TnTextBox *const box = model().textBoxArray().last().textBox.get();
+    platform::View *const button = box->deleteTextButton();
 
     postSubviewOperation({ Case::removefirst, 0 });
-    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { box, top.get() }));
+    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { box, button, top.get() }));
 
     postSubviewOperation({ Case::removelast, 0 });
-    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { box });
+    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { box, button }));
 
     addPlainView();
     postSubviewOperation({ Case::removeall, 0 });

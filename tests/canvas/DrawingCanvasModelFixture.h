@@ -2,6 +2,7 @@
 // A model with its history, and an ear on all that is posted.
 #pragma once
 
+#include "appearance/PenwickBundle.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "history/UndoRedoManager.h"
 #include "support/NotificationRecorder.h"
@@ -64,6 +65,8 @@ class DrawingCanvasModelTest : public ::testing::Test
 protected:
     DrawingCanvasModelTest()
     {
+        // A text box brings its delete button with it, and that its pictures.
+        setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         history->setDrawingCanvasModel(model);
         model->setUndoRedoManager(history);
     }

@@ -141,6 +141,7 @@ TEST_F(DrawingCanvasViewToolsTest, textClickWhileABoxIsEditedOnlyEndsTheEditing)
     canvas->setCurrentSelectedTool(text);
     window.makeFirstResponder(canvas);
     click({ 20, 100 });
+    QTest::keyClicks(model().textBoxArray().last().textBox.get(), QStringLiteral("Text"));
     static_cast<void>(recorder.take());
 
     click({ 20, 160 });
@@ -178,27 +179,31 @@ TEST_F(DrawingCanvasViewToolsTest, textPressAloneDoesNothing)
 
 TEST_F(DrawingCanvasViewToolsTest, boxThatIsInTheCopyAgainComesBackWithTheNextRepaint)
 {
-    const std::int64_t id = textBox({ 20, 100 });
+    const std::int64_t id = placedTextBox({ 20, 100 });
     const auto box = model().textBoxArray().last().textBox;
+    platform::View *const button = box->deleteTextButton();
     box->removeFromSuperview();
-    ASSERT_TRUE(canvas->subviews().empty());
+    ASSERT_EQ(canvas->subviews(), std::vector<platform::View *> { button });
 
     canvas->setNeedsDisplay();
     settle();
 
     EXPECT_EQ(idsOf(canvas->textBoxArray()), Ids { id });
-    EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { box.get() });
+    EXPECT_EQ(canvas->subviews(), (std::vector<platform::View *> { button, box.get() }));
     EXPECT_TRUE(box->isVisible());
 }
 
 TEST_F(DrawingCanvasViewToolsTest, repaintLeavesTheOrderOfTheSubviewsAlone)
 {
-    textBox({ 20, 100 });
-    const auto plain = platform::makeView<PlainView>();
-    canvas->addSubview(plain);
+    placedTextBox({ 20, 100 });
+    const auto placed = model().textBoxArray().last().textBox;
+    const auto plain = addPlainView();
     textBox({ 20, 160 });
+    const auto edited = model().textBoxArray().last().textBox;
     const std::vector<platform::View *> before = canvas->subviews();
-    ASSERT_EQ(before.size(), 3U);
+    ASSERT_EQ(before,
+        (std::vector<platform::View *> { placed.get(), placed->deleteTextButton(), plain.get(),
+            edited.get(), edited->deleteTextButton() }));
 
     canvas->setNeedsDisplay();
     settle();

@@ -21,11 +21,13 @@ using platform::Rect;
 constexpr int side = 60;
 constexpr Rect everything { 0, 0, side, side };
 
-/// A stroke that goes through `points`, built segment by segment.
+/// A stroke that goes through `points`, built segment by segment and round as drawn ones are.
 StrokeEntry strokeThrough(
     const std::vector<Point> &points, std::optional<QColor> color, double width = 5.0)
 {
     auto path = std::make_shared<BezierPath>();
+    path->setLineCapStyle(platform::LineCapStyle::Round);
+    path->setLineJoinStyle(platform::LineJoinStyle::Round);
     path->setLineWidth(width);
     for (std::size_t index = 1; index < points.size(); ++index) {
         path->moveToPoint(points[index - 1]);

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Random sessions on the model and its history, held against the reference step by step.
+#include "appearance/PenwickBundle.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "history/UndoRedoManager.h"
 #include "properties/ReferenceCanvas.h"
@@ -13,6 +14,7 @@
 #include <QColor>
 #include <QObject>
 
+#include <memory>
 #include <tuple>
 #include <utility>
 #include <vector>
@@ -55,6 +57,8 @@ class Session
 public:
     Session()
     {
+        // A text box brings its delete button with it, and that its pictures.
+        setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         m_history->setDrawingCanvasModel(m_model);
         m_model->setUndoRedoManager(m_history);
     }

@@ -68,6 +68,8 @@ QColor anyColor()
 StrokeEntry anyStroke()
 {
     auto path = std::make_shared<BezierPath>();
+    path->setLineCapStyle(platform::LineCapStyle::Round); // as every stroke that is drawn
+    path->setLineJoinStyle(platform::LineJoinStyle::Round);
     path->setLineWidth(*rc::gen::inRange(0, 5) == 0 ? 0.5 : anyWidth());
     Point point = anyPoint();
     for (int left = *rc::gen::inRange(0, 12); left > 0; --left) {

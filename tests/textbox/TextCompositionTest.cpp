@@ -1,0 +1,114 @@
+// SPDX-License-Identifier: MIT
+// What an input method composes in a box.
+#include "textbox/TextComposition.h"
+
+#include "textbox/TextBoxFixture.h"
+
+#include <QInputMethodEvent>
+
+namespace penwick::test {
+namespace {
+
+class TextCompositionTest : public TextBoxFixture
+{
+protected:
+    static void compose(TnTextBox &box, const QString &text)
+    {
+        QInputMethodEvent event(text, {});
+        QCoreApplication::sendEvent(&box, &event);
+    }
+
+    static void commit(TnTextBox &box, const QString &text)
+    {
+        QInputMethodEvent event;
+        event.setCommitString(text);
+        QCoreApplication::sendEvent(&box, &event);
+    }
+
+    const QString m_half = QStringLiteral("kanj");
+};
+
+TEST_F(TextCompositionTest, isNotYetPartOfTheText)
+{
+    const auto box = newBox();
+
+    compose(*box, m_half);
+
+    EXPECT_EQ(compositionIn(*box), m_half);
+    EXPECT_EQ(box->toPlainText(), QString());
+}
+
+TEST_F(TextCompositionTest, isReplacedByWhatTheInputMethodCommits)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+
+    commit(*box, QStringLiteral("漢字"));
+
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("漢字"));
+    EXPECT_EQ(box->textColor(), box->textFontColor());
+}
+
+TEST_F(TextCompositionTest, isPartOfTheTextOnceTheBoxIsLeft)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("a"));
+    compose(*box, m_half);
+
+    leave();
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("akanj"));
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->superview(), canvas);
+}
+
+TEST_F(TextCompositionTest, keepsABoxThatHasNothingElseFromBeingDeleted)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+
+    QTest::keyClick(box.get(), Qt::Key_Tab);
+
+    EXPECT_EQ(box->toPlainText(), m_half);
+    EXPECT_EQ(box->superview(), canvas);
+    EXPECT_FALSE(box->isEditable());
+}
+
+TEST_F(TextCompositionTest, makesTheBoxGrow)
+{
+    const auto box = newBox();
+
+    compose(*box, QString(16, QLatin1Char('m')));
+
+    EXPECT_GT(box->frame().width, 200.0);
+    compose(*box, QString());
+    EXPECT_EQ(box->frame().width, 200.0);
+}
+
+TEST_F(TextCompositionTest, takesThePlaceholdersPlace)
+{
+    const auto box = newBox();
+    const QImage hinted = pictureOf(*box);
+
+    compose(*box, QStringLiteral("."));
+    settle();
+
+    const QRect farRight(120, 4, 70, 20); // of the placeholder's end, where the dot is not
+    EXPECT_LT(darkest(hinted.copy(farRight)), paper);
+    EXPECT_EQ(darkest(pictureOf(*box).copy(farRight)), paper);
+}
+
+TEST_F(TextCompositionTest, ofNothingLeavesAnEmptyBoxEmpty)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+    compose(*box, QString());
+
+    leave();
+
+    EXPECT_EQ(box->superview(), nullptr);
+}
+
+} // namespace
+} // namespace penwick::test

@@ -1,0 +1,216 @@
+// SPDX-License-Identifier: MIT
+// Moving a placed box, the pointer's look over a box, and the buttons that are no pointer.
+#include "textbox/TextBoxFixture.h"
+
+#include "appearance/ToolCursors.h"
+
+namespace penwick::test {
+namespace {
+
+using State = platform::PanGestureRecognizer::State;
+using TnTextBoxPointerTest = TextBoxFixture;
+
+/// What the pointer looks like over `view`.
+QImage lookOver(const platform::View &view)
+{
+    return view.surface().cursor().pixmap().toImage();
+}
+
+QImage lookOf(const QString &cursor)
+{
+    return getCursorOfType(cursor).forScale(1.0).pixmap().toImage();
+}
+
+// Moving
+
+TEST_F(TnTextBoxPointerTest, dragOfAPlacedBoxKeepsThePointUnderThePointer)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 45, 30 }); // 15 to the right, 20 down
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 15, -20 }));
+    EXPECT_EQ(box->mouseDownPoint(), (Point { 30, before.height - 10 }));
+    EXPECT_EQ(box->panGesture().state(), State::Changed);
+
+    dragOn(*box, { 29, 10 }); // the box has moved: one to the left of the grabbed point
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 14, -20 }));
+
+    releaseOn(*box, { 30, 10 });
+    EXPECT_EQ(box->frame(), (Rect { 34, before.y - 20, before.width, before.height }));
+    EXPECT_EQ(box->panGesture().state(), State::Ended);
+    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_FALSE(box->isEditable());
+}
+
+TEST_F(TnTextBoxPointerTest, secondDragStartsWhereTheFirstEnded)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 40, 10 });
+    releaseOn(*box, { 30, 10 });
+
+    pressOn(*box, { 100, 20 });
+    dragOn(*box, { 100, 10 });
+    releaseOn(*box, { 100, 20 });
+
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 10, 10 }));
+}
+
+TEST_F(TnTextBoxPointerTest, handThatTremblesOnAPlacedBoxDoesNotMoveIt)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 32, 11 });
+    releaseOn(*box, { 32, 11 });
+
+    EXPECT_EQ(box->frame(), before);
+}
+
+TEST_F(TnTextBoxPointerTest, dragInABoxThatIsEditedSelectsTextAndMovesNothing)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("Hello"));
+    const Rect before = box->frame();
+
+    pressOn(*box, { 5, 15 });
+    dragOn(*box, { 150, 15 });
+    releaseOn(*box, { 150, 15 });
+
+    EXPECT_EQ(box->frame(), before);
+    EXPECT_EQ(box->textCursor().selectedText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TnTextBoxPointerTest, boxThatIsEditedAgainIsNotDragged)
+{
+    const auto box = placedBox();
+    doubleClickOn(*box, { 20, 15 });
+    const Rect before = box->frame();
+
+    pressOn(*box, { 20, 15 });
+    dragOn(*box, { 60, 15 });
+    releaseOn(*box, { 60, 15 });
+
+    EXPECT_EQ(box->frame(), before);
+    EXPECT_EQ(box->panGesture().state(), State::Possible);
+}
+
+TEST_F(TnTextBoxPointerTest, dragOfAPlacedBoxSelectsNoText)
+{
+    const auto box = placedBox();
+
+    pressOn(*box, { 5, 15 });
+    dragOn(*box, { 100, 15 });
+    releaseOn(*box, { 5, 15 });
+
+    EXPECT_FALSE(box->textCursor().hasSelection());
+}
+
+TEST_F(TnTextBoxPointerTest, deleteButtonOfABoxThatWasMovedIsBesideItsNewPlace)
+{
+    const auto box = placedBox();
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 40, 10 });
+    releaseOn(*box, { 30, 10 });
+
+    doubleClickOn(*box, { 20, 15 });
+
+    EXPECT_EQ(box->deleteTextButton()->frame(),
+        (Rect { box->frame().maxX() + 1, box->frame().maxY() + 1, 20, 20 }));
+}
+
+// Its look
+
+TEST_F(TnTextBoxPointerTest, pointerIsTheTextCursorOverABoxThatIsEdited)
+{
+    const auto box = newBox();
+
+    moveOver(*box, { 30, 10 });
+
+    EXPECT_EQ(lookOver(*box), lookOf(QStringLiteral("Text_Cursor")));
+}
+
+TEST_F(TnTextBoxPointerTest, pointerIsTheMoveCursorOverAPlacedBox)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("Hello"));
+    moveOver(*box, { 30, 10 });
+    leave();
+
+    moveOver(*box, { 31, 10 });
+
+    EXPECT_EQ(lookOver(*box), lookOf(QStringLiteral("Move_Cursor")));
+    EXPECT_NE(lookOver(*box), lookOf(QStringLiteral("Text_Cursor")));
+}
+
+TEST_F(TnTextBoxPointerTest, pointerIsTheTextCursorAgainAfterADoubleClick)
+{
+    const auto box = placedBox();
+    moveOver(*box, { 30, 10 });
+    doubleClickOn(*box, { 20, 15 });
+
+    moveOver(*box, { 31, 10 });
+
+    EXPECT_EQ(lookOver(*box), lookOf(QStringLiteral("Text_Cursor")));
+}
+
+// Other buttons
+
+TEST_F(TnTextBoxPointerTest, otherButtonsOnAPlacedBoxDoNothing)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+
+    for (const Qt::MouseButton button : { Qt::RightButton, Qt::MiddleButton }) {
+        clickOn(*box, { 30, 10 }, button);
+        pressOn(*box, { 30, 10 }, QEvent::MouseButtonDblClick, button);
+    }
+
+    EXPECT_FALSE(box->isEditable());
+    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(box->frame(), before);
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TnTextBoxPointerTest, otherButtonsInABoxThatIsEditedDrawNothingAndGoOnEditing)
+{
+    const auto box = newBox();
+    controller->handleToolSelection(QStringLiteral("brush"));
+
+    for (const Qt::MouseButton button : { Qt::RightButton, Qt::MiddleButton })
+        clickOn(*box, { 30, 10 }, button);
+
+    EXPECT_TRUE(model().pathArray().isEmpty());
+    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_TRUE(box->isEditable());
+}
+
+TEST_F(TnTextBoxPointerTest, clickOnABoxWithTheBrushDrawsNothing)
+{
+    const auto box = placedBox();
+    controller->handleToolSelection(QStringLiteral("brush"));
+
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 60, 10 });
+    releaseOn(*box, { 30, 10 });
+
+    EXPECT_TRUE(model().pathArray().isEmpty());
+}
+
+TEST_F(TnTextBoxPointerTest, wheelLeavesTheFontAsItIs)
+{
+    const auto box = placedBox();
+    QWheelEvent turn({ 30, 10 }, box->viewport()->mapToGlobal(QPointF(30, 10)), {}, { 0, 120 },
+        Qt::NoButton, Qt::ControlModifier, Qt::NoScrollPhase, false);
+
+    QCoreApplication::sendEvent(box->viewport(), &turn);
+
+    EXPECT_EQ(box->font().pixelSize(), 24);
+}
+
+} // namespace
+} // namespace penwick::test
