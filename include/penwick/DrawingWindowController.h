@@ -12,11 +12,14 @@
 #include <QPointer>
 #include <QString>
 
+#include <memory>
 #include <optional>
 
 class QScreen;
 
 namespace penwick {
+
+class ToolPanelWindowController;
 
 /// Builds and places the drawing window and announces the end of the session when it closes.
 ///
@@ -40,6 +43,8 @@ public:
     /// The drawing window; null once it is gone. Owned by this controller.
     [[nodiscard]] platform::Window *drawingWindow() const;
     void setDrawingWindow(platform::Window *window);
+    /// The controller of the tool bar; null before the window was loaded. Owned.
+    [[nodiscard]] const std::shared_ptr<ToolPanelWindowController> &tPanelWindowController() const;
     /// Two thirds of the screen's width, in points: the width of a whiteboard window.
     [[nodiscard]] double minWindowWidth() const;
     /// Two thirds of the screen's height, in points.
@@ -50,20 +55,37 @@ public:
     void createWindowForApplication(WindowType win_type, QScreen &screen,
         const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle);
 
+    /// Moves `window`'s bottom left corner to the recorded one plus that offset. Nothing recorded
+    /// yet stops the process.
+    void setWindowPositionRelativeToMainWindow(
+        platform::Window &window, double xoffset, double yOffset);
+    /// Takes the tool bar's popover off the screen.
+    void hideThePopover();
+
     void windowDidLoad() override;
+    /// Hides the popover, as does another window's taking over.
+    void windowWillMove() override;
+    void windowDidResignMain() override;
     /// Records where the window is now.
     void windowDidMove() override;
-    /// Posts penwickSessionEndNotificationKey().
+    /// Moves the tool bar with the corner that moved, and pulls it back inside.
+    void windowDidResize() override;
+    /// Closes the tool bar and posts penwickSessionEndNotificationKey().
     void windowWillClose() override;
+    /// Works the tool bar: B, T, E, C choose a tool, the desktop's keys undo, redo and close.
+    bool keyDown(const QKeyEvent &event) override;
 
 private:
     void placeOnWhiteboard(const QScreen &screen);
+    void placeToolBar();
+    void attachToolBar();
 
     std::optional<platform::Point> m_drawingWindowOrigin;
     std::optional<WindowType> m_windowType;
     QPointer<platform::Window> m_drawingWindow;
     double m_minWindowWidth;
     double m_minWindowHeight;
+    std::shared_ptr<ToolPanelWindowController> m_tPanelWindowController;
 };
 
 } // namespace penwick

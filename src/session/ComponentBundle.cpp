@@ -2,6 +2,8 @@
 #include "session/ComponentBundle.h"
 
 #include "session/DrawingWindowScene.h"
+#include "session/ToolPanelScene.h"
+#include "toolpanel/PopoverInterface.h"
 
 namespace penwick {
 
@@ -10,6 +12,12 @@ std::shared_ptr<platform::Bundle> makeComponentBundle()
     auto bundle = std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images"));
     const QString main = QStringLiteral("Main");
     bundle->addScene(main, QStringLiteral("DrawingWindowController"), makeDrawingWindowScene);
+    // The bundle outlives its own makers.
+    const platform::Bundle &images = *bundle;
+    bundle->addScene(main, QStringLiteral("ToolPanelWindowController"),
+        [&images] { return makeToolPanelScene(images); });
+    bundle->addInterface(QStringLiteral("CommonPopoverView"),
+        [&images](QObject &owner) { loadPopoverInterface(owner, images); });
     return bundle;
 }
 

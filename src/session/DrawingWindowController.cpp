@@ -1,10 +1,16 @@
 // SPDX-License-Identifier: MIT
 #include <penwick/DrawingWindowController.h>
 
+#include "appearance/PenwickBundle.h"
 #include "appearance/Theme.h"
 #include "appearance/ViewBorder.h"
+#include "canvas/DrawingCanvasView.h"
+#include "platform/Storyboard.h"
 #include "platform/View.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/StandardOutput.h"
+#include "session/ToolPanelWindowController.h"
+#include "toolpanel/ToolPanelViewController.h"
 
 #include <penwick/Penwick.h>
 #include <penwick/platform/NotificationCenter.h>
@@ -22,6 +28,8 @@ using platform::Rect;
 using platform::require;
 
 constexpr double boardBorder = 3.0; // points
+constexpr double toolBarInset = 20.0; // points, from the drawing window's left edge
+constexpr auto missingToolBar = "Warning: ToolPanelWindowController not created!";
 
 Rect mainScreenFrame()
 {
@@ -42,7 +50,12 @@ DrawingWindowController::DrawingWindowController()
     , m_minWindowHeight(mainScreenFrame().height * 2 / 3)
 { }
 
-DrawingWindowController::~DrawingWindowController() = default;
+DrawingWindowController::~DrawingWindowController()
+{
+    // The window goes after this object and must not tell it so.
+    if (window())
+        window()->setDelegate(nullptr);
+}
 
 std::optional<platform::Point> DrawingWindowController::drawingWindowOrigin() const
 {
@@ -62,6 +75,12 @@ platform::Window *DrawingWindowController::drawingWindow() const
 void DrawingWindowController::setDrawingWindow(platform::Window *window)
 {
     m_drawingWindow = window;
+}
+
+const std::shared_ptr<ToolPanelWindowController> &
+DrawingWindowController::tPanelWindowController() const
+{
+    return m_tPanelWindowController;
 }
 
 double DrawingWindowController::minWindowWidth() const
@@ -87,6 +106,18 @@ void DrawingWindowController::windowDidLoad()
     // The host's own translations; no context, because the title is the host's to word.
     window.setWindowTitle(QCoreApplication::translate("", "Tarnhill Whiteboard"));
     window.setFrame(boardOn(mainScreenFrame(), m_minWindowWidth), Animate::Yes);
+    attachToolBar();
+}
+
+void DrawingWindowController::attachToolBar()
+{
+    const platform::Storyboard storyboard(
+        QStringLiteral("Main"), *require(penwickBundle().get(), "the resource bundle is not set"));
+    m_tPanelWindowController = storyboard.instantiate<ToolPanelWindowController>(
+        QStringLiteral("ToolPanelWindowController"));
+    require(m_tPanelWindowController, "the drawing window has no tool bar");
+    m_drawingWindow->addChildWindow(*require(
+        m_tPanelWindowController->toolPanelWindow(), "the drawing window's tool bar has no panel"));
 }
 
 void DrawingWindowController::createWindowForApplication(WindowType win_type, QScreen &screen,
@@ -100,6 +131,32 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     if (win_type == WindowType::whiteboard)
         placeOnWhiteboard(screen);
     m_drawingWindowOrigin = window.frame().origin();
+    placeToolBar();
+}
+
+void DrawingWindowController::placeToolBar()
+{
+    if (!m_tPanelWindowController) {
+        platform::printLine(missingToolBar);
+        return;
+    }
+    platform::Window *const panel = m_tPanelWindowController->window();
+    if (!panel)
+        return;
+    setWindowPositionRelativeToMainWindow(
+        *panel, toolBarInset, m_drawingWindow->frame().height * 0.5 - panel->frame().height * 0.5);
+    platform::WindowAttributes attributes = panel->attributes();
+    attributes.hasShadow = true;
+    panel->setAttributes(attributes);
+    m_tPanelWindowController->showWindow(this);
+}
+
+void DrawingWindowController::setWindowPositionRelativeToMainWindow(
+    platform::Window &window, double xoffset, double yOffset)
+{
+    if (!m_drawingWindowOrigin)
+        platform::fatalError("the drawing window has not been placed");
+    window.setFrameOrigin(*m_drawingWindowOrigin + platform::Point { xoffset, yOffset });
 }
 
 void DrawingWindowController::placeOnWhiteboard(const QScreen &screen)
@@ -117,8 +174,50 @@ void DrawingWindowController::windowDidMove()
         m_drawingWindowOrigin = m_drawingWindow->frame().origin();
 }
 
+void DrawingWindowController::windowDidResize()
+{
+    platform::Window *const panel
+        = m_tPanelWindowController ? m_tPanelWindowController->window() : nullptr;
+    if (!panel) {
+        platform::printLine(missingToolBar);
+        return;
+    }
+    if (!m_drawingWindowOrigin || !m_drawingWindow)
+        return;
+    const platform::Point origin = m_drawingWindow->frame().origin();
+    panel->setFrameOrigin(panel->frame().origin() + (origin - *m_drawingWindowOrigin));
+    m_tPanelWindowController->adjustPosition();
+    m_drawingWindowOrigin = origin;
+}
+
+void DrawingWindowController::windowWillMove()
+{
+    hideThePopover();
+}
+
+void DrawingWindowController::windowDidResignMain()
+{
+    hideThePopover();
+}
+
+void DrawingWindowController::hideThePopover()
+{
+    if (!m_drawingWindow)
+        return;
+    auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView());
+    if (canvas && canvas->popoverWindow())
+        canvas->popoverWindow()->orderOut();
+}
+
+bool DrawingWindowController::keyDown(const QKeyEvent &event)
+{
+    return m_tPanelWindowController && m_tPanelWindowController->content().performKey(event);
+}
+
 void DrawingWindowController::windowWillClose()
 {
+    if (m_tPanelWindowController && m_tPanelWindowController->toolPanelWindow())
+        m_tPanelWindowController->toolPanelWindow()->close();
     platform::NotificationCenter::defaultCenter().postNotification(
         penwickSessionEndNotificationKey(), m_windowType == WindowType::imageAnnotation);
 }

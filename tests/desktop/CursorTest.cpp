@@ -68,7 +68,7 @@ TEST_F(Cursor, isNotTheBrushAfterADragThatEndedBesideTheBoard)
 
     drag({ { 200, 200 }, { -60, 200 } });
 
-    waitForLevel({ 20, 200 }, inkOnWhite);
+    waitForLevel({ 12, 200 }, inkOnWhite); // left of the tool bar
     EXPECT_TRUE(waitUntil([&] { return desktop().pointer().look() != brush; }));
     desktop().pointer().glideTo(onScreen({ 300, 300 }));
     EXPECT_TRUE(waitUntil([&] { return desktop().pointer().look() == brush; }));

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "desktop/support/BoardFixture.h"
 
+#include <QPainter>
+
 #include <algorithm>
 #include <cstdlib>
 #include <stdexcept>
@@ -13,11 +15,13 @@ constexpr int borderWidth = 3;
 
 } // namespace
 
-void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments)
+void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments,
+    const std::vector<std::string> &variables)
 {
-    m_host = std::make_unique<HostProcess>(m_desktop, arguments, program);
+    m_host = std::make_unique<HostProcess>(m_desktop, arguments, program, variables);
     m_host->waitForWindow(QStringLiteral("drawing"));
     waitForLevel(canvas().center() - canvas().topLeft(), 255);
+    static_cast<void>(toolBar());
 }
 
 WindowId BoardTest::window()
@@ -42,6 +46,33 @@ QRect BoardTest::canvas()
     return m_desktop.windows().clientArea(window());
 }
 
+WindowState BoardTest::toolBar()
+{
+    WindowState bar = m_host->waitForWindow(QStringLiteral("toolPanel"));
+    const QRect frame = m_desktop.windows().outerFrame(toolBarWindow());
+    for (QPoint &button : bar.buttons)
+        button += frame.topLeft() - bar.frame.topLeft();
+    bar.frame = frame;
+    return bar;
+}
+
+WindowId BoardTest::toolBarWindow()
+{
+    const Windows &windows = m_desktop.windows();
+    const QSize size = m_host->waitForWindow(QStringLiteral("toolPanel")).frame.size();
+    WindowId found = 0;
+    require(
+        [&] {
+            for (const WindowId window : windows.ofProcess(m_host->processId())) {
+                if (windows.outerFrame(window).size() == size && windows.isShown(window))
+                    found = window;
+            }
+            return found != 0;
+        },
+        "a window of the tool bar's size");
+    return found;
+}
+
 void BoardTest::drag(const std::vector<QPoint> &places, MouseButton button)
 {
     std::vector<QPoint> screenPlaces;
@@ -58,8 +89,10 @@ void BoardTest::click(QPoint place, MouseButton button)
 
 QImage BoardTest::picture()
 {
-    return m_desktop.screen().picture(
-        canvas().adjusted(borderWidth, borderWidth, -borderWidth, -borderWidth));
+    const QRect area = canvas().adjusted(borderWidth, borderWidth, -borderWidth, -borderWidth);
+    QImage picture = m_desktop.screen().picture(area);
+    QPainter(&picture).fillRect(toolBar().frame.translated(-area.topLeft()), Qt::white);
+    return picture;
 }
 
 int BoardTest::level(QPoint place)

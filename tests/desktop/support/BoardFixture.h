@@ -24,7 +24,8 @@ protected:
 
     /// Opens a white board and returns once it can be seen.
     void open(HostProgram program = HostProgram::AsShipped,
-        const std::vector<std::string> &arguments = {});
+        const std::vector<std::string> &arguments = {},
+        const std::vector<std::string> &variables = {});
 
     Desktop &desktop() { return m_desktop; }
     HostProcess &host() { return *m_host; }
@@ -35,21 +36,27 @@ protected:
     /// The screen's place of a place on the board.
     [[nodiscard]] QPoint onScreen(QPoint place) { return canvas().topLeft() + place; }
 
+    /// The tool bar on the screen. It stands on the board, 20 points from its left edge. Where it
+    /// is, is the server's word; the log knows where its buttons are in it.
+    [[nodiscard]] WindowState toolBar();
+    /// The tool bar's window, which must be on the screen.
+    [[nodiscard]] WindowId toolBarWindow();
+
     /// Draws, or erases, along `places` on the board.
     void drag(const std::vector<QPoint> &places, MouseButton button = MouseButton::Left);
     void click(QPoint place, MouseButton button = MouseButton::Left);
 
-    /// The board without its coloured border, which alone is not in shades of grey.
+    /// The board without its coloured border and with paper where the tool bar stands.
     [[nodiscard]] QImage picture();
     /// The grey level at a place on the board.
     [[nodiscard]] int level(QPoint place);
     /// Waits until the board shows `wanted` there, one level more or less; throws if it does not.
     void waitForLevel(QPoint place, int wanted);
-    /// Draws a short stroke near the lower left corner, each time in another place, and waits for
-    /// it: whatever was done before has then been dealt with and painted.
+    /// Draws a short stroke right of the tool bar's lower end, each time in another place, and
+    /// waits for it: whatever was done before has then been dealt with and painted.
     void settle();
     /// Where settle() draws.
-    static constexpr QRect settlingArea { 20, 280, 80, 160 };
+    static constexpr QRect settlingArea { 80, 280, 80, 160 };
 
     /// The smallest rectangle that holds all pixels in which the two differ; null if none does.
     [[nodiscard]] static QRect difference(const QImage &one, const QImage &other);

@@ -93,7 +93,14 @@ void Desktop::startServer(QSize screenSize)
     m_displayName = ':' + *number;
 }
 
-std::string Desktop::startBus()
+const std::string &Desktop::sessionBus()
+{
+    if (!m_bus)
+        startBus();
+    return m_busAddress;
+}
+
+void Desktop::startBus()
 {
     m_bus = std::make_unique<ChildProcess>(
         ChildProcess::Command { { "dbus-daemon", "--session", "--nofork", "--nopidfile",
@@ -104,7 +111,7 @@ std::string Desktop::startBus()
         "the session bus to say its address");
     if (!address)
         throw std::runtime_error("the session bus ended at once");
-    return *address;
+    m_busAddress = *address;
 }
 
 void Desktop::startWindowManager(WindowManager windowManager)
@@ -116,7 +123,7 @@ void Desktop::startWindowManager(WindowManager windowManager)
         : std::vector<std::string> { "xfwm4", "--compositor=off" };
     // Xfwm4 reads its settings over a bus, or does not start.
     m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command { command,
-        windowManager == WindowManager::Xfwm4 ? environmentWithBus(startBus()) : environment(),
+        windowManager == WindowManager::Xfwm4 ? environmentWithBus(sessionBus()) : environment(),
         file("window-manager.log") });
 
     // It is up when the window that it announces itself by names itself too.

@@ -42,6 +42,8 @@ public:
     [[nodiscard]] const std::string &displayName() const { return m_displayName; }
     /// What a program that is to run on this desktop needs, each "NAME=value".
     [[nodiscard]] std::vector<std::string> environment() const;
+    /// The address of the desktop's session bus, which is started when it is first asked for.
+    [[nodiscard]] const std::string &sessionBus();
     /// A name for a file in the desktop's own folder.
     [[nodiscard]] std::string file(const std::string &name) const;
 
@@ -53,11 +55,12 @@ public:
 private:
     void startServer(QSize screenSize);
     void startWindowManager(WindowManager windowManager);
-    [[nodiscard]] std::string startBus(); // returns its address
+    void startBus();
     [[nodiscard]] std::vector<std::string> environmentWithBus(const std::string &address) const;
 
     QTemporaryDir m_folder;
     std::string m_displayName;
+    std::string m_busAddress;
     std::unique_ptr<ChildProcess> m_server;
     std::unique_ptr<ChildProcess> m_bus;
     std::unique_ptr<ChildProcess> m_windowManager;

@@ -23,7 +23,13 @@ ChildProcess::Command hostCommand(const Desktop &desktop, const std::string &err
     ChildProcess::Command command { { path, "--log" }, desktop.environment(), errorFile };
     command.arguments.insert(command.arguments.end(), arguments.begin(), arguments.end());
     command.environment.emplace_back("QT_QPA_PLATFORM=xcb");
-    command.environment.insert(command.environment.end(), variables.begin(), variables.end());
+    for (const std::string &variable : variables) {
+        // Of two with one name the first would count.
+        const std::string name = variable.substr(0, variable.find('=') + 1);
+        std::erase_if(command.environment,
+            [&name](const std::string &other) { return other.starts_with(name); });
+        command.environment.push_back(variable);
+    }
     return command;
 }
 

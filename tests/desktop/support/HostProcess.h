@@ -44,7 +44,8 @@ enum class HostProgram
 class HostProcess final
 {
 public:
-    /// `arguments` beside --log, `variables` ("NAME=value") beside the desktop's own.
+    /// `arguments` beside --log, `variables` ("NAME=value") beside the desktop's own, or
+    /// instead of them.
     explicit HostProcess(const Desktop &desktop, const std::vector<std::string> &arguments = {},
         HostProgram program = HostProgram::AsShipped,
         const std::vector<std::string> &variables = {});

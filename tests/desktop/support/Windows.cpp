@@ -6,6 +6,7 @@
 #include <X11/Xlib.h>
 
 #include <X11/Xatom.h>
+#include <X11/Xutil.h>
 
 #include <algorithm>
 #include <memory>
@@ -13,6 +14,8 @@
 namespace penwick::desktop {
 
 namespace {
+
+constexpr long askedByUser = 2; // as a task bar asks
 
 struct Property
 {
@@ -154,15 +157,38 @@ WindowId Windows::root() const
 
 void Windows::close(WindowId window)
 {
+    ask(window, "_NET_CLOSE_WINDOW", 0, askedByUser);
+}
+
+void Windows::minimise(WindowId window)
+{
+    ask(window, "WM_CHANGE_STATE", IconicState, 0);
+}
+
+void Windows::activate(WindowId window)
+{
+    ask(window, "_NET_ACTIVE_WINDOW", askedByUser, CurrentTime);
+}
+
+void Windows::ask(WindowId window, const char *what, long first, long second)
+{
     XEvent event {};
     event.xclient.type = ClientMessage;
     event.xclient.window = window;
-    event.xclient.message_type = m_connection.atom("_NET_CLOSE_WINDOW");
+    event.xclient.message_type = m_connection.atom(what);
     event.xclient.format = 32;
-    event.xclient.data.l[1] = 2; // asked by the user, as a task bar does
+    event.xclient.data.l[0] = first;
+    event.xclient.data.l[1] = second;
     XSendEvent(m_connection.display(), root(), False,
         SubstructureRedirectMask | SubstructureNotifyMask, &event);
     m_connection.finish();
+}
+
+bool Windows::isShown(WindowId window) const
+{
+    XWindowAttributes attributes {};
+    return XGetWindowAttributes(m_connection.display(), window, &attributes)
+        && attributes.map_state == IsViewable;
 }
 
 } // namespace penwick::desktop

@@ -40,8 +40,16 @@ public:
 
     /// What a press on the title bar's close button asks for.
     void close(WindowId window);
+    /// What a press on the title bar's minimise button asks for.
+    void minimise(WindowId window);
+    /// Brings a minimised window back, and any window to the front.
+    void activate(WindowId window);
+    /// Whether the server shows the window, be it covered or not.
+    [[nodiscard]] bool isShown(WindowId window) const;
 
 private:
+    void ask(WindowId window, const char *what, long first, long second);
+
     const XConnection &m_connection;
 };
 

@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+// Where a tool bar may stand in its drawing window.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+namespace penwick {
+
+/// `panel`, moved inside `parent`. A panel that is larger than its parent ends flush with the
+/// right or the top limit.
+[[nodiscard]] platform::Rect clampedPanel(
+    const platform::Rect &panel, const platform::Rect &parent);
+
+} // namespace penwick

@@ -1,0 +1,78 @@
+// SPDX-License-Identifier: MIT
+#include "session/ToolPanelWindowController.h"
+
+#include "platform/WindowFlags.h"
+#include "platform/foundation/FatalError.h"
+#include "session/PanelClamp.h"
+#include "toolpanel/ToolPanelViewController.h"
+
+#include <QTimer>
+
+namespace penwick {
+
+namespace {
+
+using platform::require;
+
+constexpr int settleTime = 200; // ms, between letting go of the panel and pulling it back
+constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
+constexpr int hiddenTitle = 1;
+
+} // namespace
+
+ToolPanelWindowController::ToolPanelWindowController() = default;
+ToolPanelWindowController::~ToolPanelWindowController() = default;
+
+ToolPanelViewController &ToolPanelWindowController::content() const
+{
+    const ToolBarPanelWindow *const panel
+        = require(m_toolPanelWindow.data(), "the tool bar has no panel");
+    return *require(dynamic_cast<ToolPanelViewController *>(panel->contentViewController()),
+        "the panel's content is no tool bar");
+}
+
+void ToolPanelWindowController::windowDidLoad()
+{
+    WindowController::windowDidLoad();
+    ToolBarPanelWindow &panel = *require(m_toolPanelWindow.data(), "the tool bar has no panel");
+    platform::WindowAttributes attributes = panel.attributes();
+    attributes.backgroundColor = Qt::transparent;
+    attributes.isOpaque = false;
+    attributes.collectionBehavior = onAllDesktopsAndBesideFullScreen;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.styleMask &= ~(platform::StyleMask::titled | platform::StyleMask::closable
+        | platform::StyleMask::miniaturizable | platform::StyleMask::resizable);
+    attributes.styleMask |= platform::StyleMask::fullSizeContentView;
+    attributes.titleVisibility = hiddenTitle;
+    attributes.showsToolbarButton = false;
+    attributes.isMovableByWindowBackground = true;
+    attributes.sharingType = 0;
+    attributes.level = platform::mainMenuWindowLevel;
+    panel.setAttributes(attributes);
+    panel.setDelegate(this);
+}
+
+void ToolPanelWindowController::adjustPosition()
+{
+    if (!m_toolPanelWindow)
+        return;
+    const platform::Window *const parent = m_toolPanelWindow->parentWindow();
+    if (parent) {
+        m_toolPanelWindow->setFrame(
+            clampedPanel(m_toolPanelWindow->frame(), parent->frame()), platform::Animate::Yes);
+    }
+}
+
+void ToolPanelWindowController::mouseDown()
+{
+    ToolPanelViewController &bar = content();
+    require(bar.popoverW(), "the tool bar has no popover window");
+    bar.hidePopover();
+}
+
+void ToolPanelWindowController::mouseUp()
+{
+    QTimer::singleShot(settleTime, this, &ToolPanelWindowController::adjustPosition);
+}
+
+} // namespace penwick

@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+#include "toolpanel/PopoverInterface.h"
+
+#include "platform/PlainView.h"
+#include "platform/foundation/FatalError.h"
+#include "toolpanel/PopoverView.h"
+#include "toolpanel/PopoverViewController.h"
+#include "toolpanel/ToolOptionsButton.h"
+
+#include "ui_CommonPopoverView.h"
+
+namespace penwick {
+
+namespace {
+
+// Out of the interface file's common widget, ready to be put into the popover window.
+std::unique_ptr<PopoverView> taken(
+    PopoverView &popover, PopoverViewController &owner, const platform::Bundle &bundle)
+{
+    for (auto *const option : popover.findChildren<ToolOptionsButton *>()) {
+        option->loadImages(bundle);
+        option->setAction(
+            [&owner](platform::Button &sender) { owner.OnToolOptionSelection(sender); });
+    }
+    popover.setParent(nullptr);
+    popover.adoptScene();
+    for (auto *const option : popover.findChildren<ToolOptionsButton *>())
+        option->toggleToolState(); // today's value is selected from the start
+    return std::unique_ptr<PopoverView>(&popover);
+}
+
+} // namespace
+
+void loadPopoverInterface(QObject &owner, const platform::Bundle &bundle)
+{
+    auto &controller = *platform::require(dynamic_cast<PopoverViewController *>(&owner),
+        "the popovers' interface belongs to a popover view controller");
+    QWidget common;
+    Ui::CommonPopoverView interface;
+    interface.setupUi(&common);
+    auto text = taken(*interface.textPopoverView, controller, bundle);
+    auto color = taken(*interface.colorPopoverView, controller, bundle);
+    auto brush = taken(*interface.brushPopoverView, controller, bundle);
+    PopoverView &first = *text;
+    controller.setPopoverViews(std::move(text), std::move(color), std::move(brush));
+    controller.setView(first);
+}
+
+} // namespace penwick

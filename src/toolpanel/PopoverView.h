@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+// The content of a popover.
+#pragma once
+
+#include "platform/ViewOf.h"
+
+#include <QWidget>
+
+namespace penwick {
+
+/// One view in it is the grid, which holds option buttons and nothing else. It takes its colours
+/// when it enters a window.
+class PopoverView final : public platform::ViewOf<QWidget>
+{
+    Q_OBJECT
+
+public:
+    explicit PopoverView(QWidget *parent = nullptr);
+
+    void setUpLayer();
+    void viewDidMoveToWindow() override;
+};
+
+} // namespace penwick

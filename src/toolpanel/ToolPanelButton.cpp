@@ -1,0 +1,138 @@
+// SPDX-License-Identifier: MIT
+#include "toolpanel/ToolPanelButton.h"
+
+#include "appearance/Theme.h"
+#include "platform/Workspace.h"
+
+#include <QPainterPath>
+
+namespace penwick {
+
+namespace {
+
+constexpr double triangleInset = 2.0; // points, from the right and lower edges
+constexpr double triangleLeg = 6.0; // points
+
+bool isContrastIncreased()
+{
+    return platform::Workspace::shared().accessibilityDisplayShouldIncreaseContrast();
+}
+
+} // namespace
+
+ToolPanelButton::ToolPanelButton(QWidget *parent)
+    : Button(parent)
+{
+    awakeFromScene();
+}
+
+ToolPanelButton::ToolPanelButton(const platform::Rect &frame)
+    : ToolPanelButton(nullptr)
+{
+    setFrame(frame);
+}
+
+ToolPanelButton::~ToolPanelButton() = default;
+
+// Again after a scene gave the button its images.
+void ToolPanelButton::awakeFromScene()
+{
+    m_buttonImage = image();
+    m_buttonAltImage = alternateImage();
+}
+
+void ToolPanelButton::assignArrowColor(const QColor &color)
+{
+    m_setArrowColor = color;
+}
+
+QColor ToolPanelButton::hoverBackgroundColor() const
+{
+    return TnhColors::toolPanelButtonHoverColor;
+}
+
+QColor ToolPanelButton::hoverBackgroundColorContrast() const
+{
+    return TnhColors::toolPanelButtonHoverColorContrast;
+}
+
+QColor ToolPanelButton::originalBackgroundColor() const
+{
+    return TnhColors::toolPanelButtonColor;
+}
+
+bool ToolPanelButton::hasFixedImage() const
+{
+    return identifier() == Tools::color;
+}
+
+void ToolPanelButton::showTriangle(const QColor &color)
+{
+    m_setArrowColor = color;
+    setNeedsDisplay();
+}
+
+void ToolPanelButton::draw(const platform::Rect &dirtyRect)
+{
+    Button::draw(dirtyRect);
+    if (identifier() != Tools::text && identifier() != Tools::brush)
+        return;
+    const double right = bounds().width - triangleInset;
+    const double bottom = bounds().height - triangleInset;
+    QPainterPath triangle(QPointF(right, bottom));
+    triangle.lineTo(right, bottom - triangleLeg);
+    triangle.lineTo(right - triangleLeg, bottom);
+    triangle.closeSubpath();
+    Painter painter(*this);
+    painter.fillPath(triangle, m_setArrowColor);
+}
+
+void ToolPanelButton::mouseEntered()
+{
+    if (!isEnabled())
+        return;
+    showTriangle(m_arrowHoverColor);
+    if (identifier() == Tools::state) {
+        setBackgroundColor(isContrastIncreased() ? TnhColors::endButtonColorContrastHover
+                                                 : TnhColors::endButtonColorHover);
+    } else {
+        setBackgroundColor(
+            isContrastIncreased() ? hoverBackgroundColorContrast() : hoverBackgroundColor());
+    }
+    if (!hasFixedImage())
+        setImage(m_buttonAltImage);
+}
+
+// The enabled state does not matter here: a button that was disabled under the pointer must not
+// keep its hover look.
+void ToolPanelButton::mouseExited()
+{
+    if (m_isSelected)
+        return;
+    showTriangle(m_arrowNormalColor);
+    if (identifier() == Tools::state) {
+        setBackgroundColor(
+            isContrastIncreased() ? TnhColors::endButtonColorContrast : TnhColors::endButtonColor);
+    } else {
+        setBackgroundColor(originalBackgroundColor());
+    }
+    if (!hasFixedImage())
+        setImage(m_buttonImage);
+}
+
+// The end button gets the panel's ordinary colours here, as every other.
+void ToolPanelButton::toggleToolState()
+{
+    if (m_isSelected) {
+        setBackgroundColor(
+            isContrastIncreased() ? hoverBackgroundColorContrast() : hoverBackgroundColor());
+        showTriangle(m_arrowHoverColor);
+    } else {
+        showTriangle(m_arrowNormalColor);
+        setBackgroundColor(originalBackgroundColor());
+    }
+    if (!hasFixedImage())
+        setImage(m_isSelected ? m_buttonAltImage : m_buttonImage);
+}
+
+} // namespace penwick

@@ -1,0 +1,363 @@
+// SPDX-License-Identifier: MIT
+#include "toolpanel/ToolPanelViewController.h"
+
+#include "appearance/PenwickBundle.h"
+#include "appearance/Theme.h"
+#include "appearance/ViewBorder.h"
+#include "canvas/DrawViewController.h"
+#include "canvas/DrawingCanvasView.h"
+#include "history/NotificationNames.h"
+#include "platform/PlainView.h"
+#include "platform/WindowFlags.h"
+#include "platform/Workspace.h"
+#include "platform/foundation/FatalError.h"
+#include "platform/foundation/StandardOutput.h"
+#include "toolpanel/PopoverView.h"
+#include "toolpanel/PopoverViewController.h"
+#include "toolpanel/ToolKeys.h"
+#include "toolpanel/ToolPanelButton.h"
+
+#include <penwick/platform/Window.h>
+#include <penwick/platform/WindowController.h>
+
+#include <QKeyEvent>
+
+namespace penwick {
+
+namespace {
+
+using platform::NotificationCenter;
+using platform::require;
+
+constexpr double panelBorderWidth = 0.7; // points
+constexpr double endButtonRadius = 2.0; // points
+constexpr double popoverGap = 10.0; // points, between panel and popover
+constexpr int hiddenTitle = 1;
+constexpr int utilityWindowAnimation = 4;
+constexpr unsigned lowestStyleBits = 15; // title bar, its buttons, resizing
+
+template <class View>
+View &outlet(const QPointer<View> &view)
+{
+    return *require(view.data(), "an outlet of the tool panel is not connected");
+}
+
+} // namespace
+
+ToolPanelViewController::ToolPanelViewController()
+    : m_selectedButtonId(Tools::defaultSelectedTool)
+{ }
+
+ToolPanelViewController::~ToolPanelViewController()
+{
+    NotificationCenter::defaultCenter().removeObserver(this);
+    platform::Workspace::shared().notificationCenter().removeObserver(this);
+}
+
+DrawViewController *ToolPanelViewController::toolSelectionDelegate() const
+{
+    return m_toolSelectionDelegate;
+}
+
+ToolPanelButton *ToolPanelViewController::button(const QString &identifier) const
+{
+    return m_buttonMapping.value(identifier);
+}
+
+platform::Window &ToolPanelViewController::panelWindow() const
+{
+    const platform::View *const root = require(view(), "the tool panel has no view");
+    return *require(root->window(), "the tool panel is in no window");
+}
+
+DrawingCanvasView &ToolPanelViewController::canvas() const
+{
+    const DrawViewController *const drawing
+        = require(m_toolSelectionDelegate.data(), "the tool panel has no drawing to serve");
+    return *require(drawing->drawingView(), "the tool panel's drawing has no canvas");
+}
+
+// Loading
+
+void ToolPanelViewController::viewDidLoad()
+{
+    const ToolPanelOutlets &out = m_outlets;
+    m_buttonMapping = { { Tools::text, &outlet(out.textButton) },
+        { Tools::brush, &outlet(out.brushButton) }, { Tools::eraser, &outlet(out.eraserButton) },
+        { Tools::color, &outlet(out.colorButton) }, { Tools::clear, &outlet(out.clearButton) },
+        { Tools::state, &outlet(out.stateButton) }, { Tools::redo, &outlet(out.redoButton) },
+        { Tools::undo, &outlet(out.undoButton) } };
+    m_buttons = { out.textButton, out.brushButton, out.eraserButton, out.colorButton,
+        out.clearButton, out.redoButton, out.undoButton };
+    ViewController::viewDidLoad();
+    view()->setWantsLayer(true);
+    // So that no drawing cursor of the canvas survives over the tool bar.
+    view()->addCursorRect(view()->bounds(), platform::Cursor::arrow());
+    m_popoverVc = std::make_unique<PopoverViewController>(QStringLiteral("CommonPopoverView"),
+        *require(penwickBundle(), "the resource bundle is not set"));
+    makePopoverWindow();
+    observe();
+}
+
+void ToolPanelViewController::makePopoverWindow()
+{
+    m_popoverW = std::make_unique<platform::Window>();
+    m_popoverW->setObjectName(QStringLiteral("popover"));
+    platform::WindowAttributes attributes;
+    attributes.styleMask = platform::StyleMask::unifiedTitleAndToolbar & ~lowestStyleBits;
+    attributes.sharingType = 0;
+    attributes.titleVisibility = hiddenTitle;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.isOpaque = false;
+    attributes.backgroundColor = Qt::transparent;
+    attributes.isMovable = false;
+    attributes.level = platform::mainMenuWindowLevel;
+    attributes.animationBehavior = utilityWindowAnimation;
+    m_popoverW->setAttributes(attributes);
+    const platform::Size size
+        = require(m_popoverVc->view(), "the popovers have no view")->frame().size();
+    m_popoverW->setFrame({ 0.0, 0.0, size.width, size.height });
+}
+
+void ToolPanelViewController::observe()
+{
+    NotificationCenter::defaultCenter().addObserver(this, penwickNotificationKey(),
+        [this](const auto &notification) { updateUndoRedoButtonState(notification); });
+    platform::Workspace &workspace = platform::Workspace::shared();
+    workspace.notificationCenter().addObserver(this,
+        platform::Workspace::accessibilityDisplayOptionsDidChangeNotification(),
+        [this](const auto &) { determineEndButtonBackgroundColor(); });
+}
+
+// Appearing
+
+void ToolPanelViewController::viewWillAppear()
+{
+    m_popoverVc->setCurrentPopoverWindow(m_popoverW.get());
+    connectToDrawing();
+    paintPanel();
+    titleEndButton();
+    determineEndButtonBackgroundColor();
+    outlet(m_outlets.stateButton).layer()->cornerRadius = endButtonRadius;
+    selectCurrentTool();
+    outlet(m_outlets.undoButton).setEnabled(false);
+    outlet(m_outlets.redoButton).setEnabled(false);
+}
+
+void ToolPanelViewController::connectToDrawing()
+{
+    platform::Window *const drawingWindow
+        = require(panelWindow().parentWindow(), "the tool panel belongs to no drawing window");
+    platform::WindowController *const controller
+        = require(drawingWindow->windowController(), "the drawing window has no controller");
+    platform::Window *const window
+        = require(controller->window(), "the drawing window's controller has no window");
+    m_toolSelectionDelegate
+        = require(dynamic_cast<DrawViewController *>(window->contentViewController()),
+            "the drawing window's content is no drawing");
+    m_popoverVc->setToolPopoverDelegate(m_toolSelectionDelegate);
+    m_popoverVc->setToolPanelOptionDelegate(this);
+    canvas().setPopoverWindow(m_popoverW.get());
+}
+
+void ToolPanelViewController::paintPanel()
+{
+    platform::PlainView &panel = outlet(m_outlets.toolPanelView);
+    platform::PlainView &handle = outlet(m_outlets.toolBarHandle);
+    setViewBorder(panel, ToolPanelUI::toolPanelBorderColor, panelBorderWidth,
+        ToolPanelUI::toolPanelBorderRadius);
+    handle.setWantsLayer(true);
+    handle.layer()->backgroundColor = TnhColors::toolPanelHandleColor;
+    panel.setWantsLayer(true);
+    panel.layer()->backgroundColor = ToolPanelUI::toolPanelColor;
+}
+
+void ToolPanelViewController::titleEndButton()
+{
+    ToolPanelButton &end = outlet(m_outlets.stateButton);
+    end.setAttributedTitle({ tr("END"), Qt::white, end.font(), Qt::AlignHCenter });
+}
+
+void ToolPanelViewController::determineEndButtonBackgroundColor()
+{
+    const bool isIncreased
+        = platform::Workspace::shared().accessibilityDisplayShouldIncreaseContrast();
+    outlet(m_outlets.stateButton)
+        .setBackgroundColor(
+            isIncreased ? TnhColors::endButtonColorContrast : TnhColors::endButtonColor);
+    for (const auto &each : m_buttons)
+        outlet(each).toggleToolState();
+}
+
+void ToolPanelViewController::showSelected(ToolPanelButton *button, bool isSelected)
+{
+    if (!button)
+        return;
+    button->setIsSelected(isSelected);
+    button->toggleToolState();
+}
+
+void ToolPanelViewController::selectCurrentTool()
+{
+    m_selectedButtonId = canvas().currentSelectedTool();
+    m_lastSelectedButton = button(m_selectedButtonId);
+    m_currentSelectedButton = m_lastSelectedButton;
+    showSelected(m_lastSelectedButton, false);
+    showSelected(m_currentSelectedButton, true);
+}
+
+// Pressing
+
+void ToolPanelViewController::OnToolBarItemSelection(platform::Button &sender)
+{
+    m_selectedButtonId = sender.identifier();
+    if (m_selectedButtonId.isEmpty())
+        platform::fatalError("a button of the tool panel has no identifier");
+    const QString toolBefore = canvas().currentSelectedTool();
+    m_currentSelectedButton = button(m_selectedButtonId);
+    m_lastSelectedButton = button(toolBefore);
+    showSelected(m_lastSelectedButton, false);
+    showSelected(m_currentSelectedButton, true);
+    showPopoverFor(m_selectedButtonId, toolBefore);
+    // Last: "state" ends the session, and with it this panel.
+    if (m_toolSelectionDelegate)
+        m_toolSelectionDelegate->handleToolSelection(m_selectedButtonId);
+}
+
+void ToolPanelViewController::showPopoverFor(const QString &identifier, const QString &toolBefore)
+{
+    if (identifier == Tools::text || identifier == Tools::brush) {
+        if (toolBefore == identifier)
+            togglePopover(identifier == Tools::text ? PopoverChoice::textpopover
+                                                    : PopoverChoice::brushpopover);
+        else
+            hidePopover();
+    } else if (identifier == Tools::color) {
+        if (m_popoverW->isVisible()) {
+            hidePopover(); // the colour button then stays selected
+        } else {
+            showPopoverIfRequired(PopoverChoice::colorpopover);
+            restoreSelection();
+        }
+    } else if (identifier == Tools::clear || identifier == Tools::undo
+        || identifier == Tools::redo) {
+        hidePopover();
+        restoreSelection();
+    } else if (identifier == Tools::eraser || identifier == Tools::state) {
+        hidePopover();
+    } else {
+        platform::printLine("Default");
+    }
+}
+
+void ToolPanelViewController::restoreSelection()
+{
+    showSelected(m_currentSelectedButton, false);
+    showSelected(m_lastSelectedButton, true);
+}
+
+void ToolPanelViewController::togglePopover(PopoverChoice choice)
+{
+    if (m_popoverW->isVisible())
+        hidePopover();
+    else
+        showPopoverIfRequired(choice);
+}
+
+void ToolPanelViewController::hidePopover()
+{
+    if (m_popoverW->isVisible())
+        m_popoverW->orderOut();
+}
+
+void ToolPanelViewController::showPopoverIfRequired(PopoverChoice choice)
+{
+    PopoverView *popover = nullptr;
+    const ToolPanelButton *anchor = nullptr;
+    switch (choice) {
+    case PopoverChoice::textpopover:
+        popover = m_popoverVc->textPopoverView();
+        anchor = m_outlets.textButton;
+        break;
+    case PopoverChoice::colorpopover:
+        popover = m_popoverVc->colorPopoverView();
+        anchor = m_outlets.colorButton;
+        break;
+    case PopoverChoice::brushpopover:
+        popover = m_popoverVc->brushPopoverView();
+        anchor = m_outlets.brushButton;
+        break;
+    }
+    require(popover, "a popover view is missing");
+    placePopover(*require(anchor, "an outlet of the tool panel is not connected"));
+    if (choice == m_visiblePopover) {
+        m_popoverW->orderFront();
+        return;
+    }
+    m_visiblePopover = choice;
+    m_popoverW->setContentView(popover);
+    panelWindow().addChildWindow(*m_popoverW);
+}
+
+void ToolPanelViewController::placePopover(const ToolPanelButton &anchor)
+{
+    const platform::Point panel = panelWindow().frame().origin();
+    m_popoverW->setFrameOrigin({ panel.x + popoverGap + view()->frame().maxX() + anchor.frame().x,
+        panel.y + anchor.frame().y });
+}
+
+// Keys
+
+bool ToolPanelViewController::performKey(const QKeyEvent &event)
+{
+    if (!m_toolSelectionDelegate) // the panel has not appeared
+        return false;
+    if (m_popoverW->isVisible() && performPopoverKey(event))
+        return true;
+    ToolPanelButton *const pressed = button(toolForKey(event));
+    if (pressed)
+        pressed->click();
+    return pressed;
+}
+
+bool ToolPanelViewController::performPopoverKey(const QKeyEvent &event)
+{
+    if (event.key() == Qt::Key_Escape) {
+        hidePopover();
+        return true;
+    }
+    const platform::View *const popover = m_popoverW->contentView();
+    const std::vector<platform::View *> options = popover->subviews().front()->subviews();
+    const auto index = static_cast<std::size_t>(optionForKey(event));
+    if (index >= options.size())
+        return false;
+    dynamic_cast<platform::Button &>(*options[index]).click();
+    return true;
+}
+
+// What others tell
+
+void ToolPanelViewController::updateUndoRedoButtonState(const platform::Notification &notification)
+{
+    if (notification.object.typeId() != QMetaType::QVariantMap)
+        return;
+    const QVariantMap states = notification.object.toMap();
+    for (const QVariant &value : states) {
+        if (value.typeId() != QMetaType::Bool)
+            return;
+    }
+    const auto redoState = states.constFind(QStringLiteral("enableRedo"));
+    if (redoState != states.constEnd())
+        outlet(m_outlets.redoButton).setEnabled(redoState->toBool());
+    const auto undoState = states.constFind(QStringLiteral("enableUndo"));
+    if (undoState != states.constEnd())
+        outlet(m_outlets.undoButton).setEnabled(undoState->toBool());
+}
+
+void ToolPanelViewController::changeColorToolImage(const QString &newColorState)
+{
+    const auto &bundle = require(penwickBundle(), "the resource bundle is not set");
+    outlet(m_outlets.colorButton).setImage(bundle->imageForResource(newColorState));
+}
+
+} // namespace penwick

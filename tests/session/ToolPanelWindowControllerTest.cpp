@@ -1,0 +1,239 @@
+// SPDX-License-Identifier: MIT
+// The tool bar's window: what it is like, and how it is kept inside the drawing window.
+#include "session/SessionFixture.h"
+
+#include "session/ToolPanelScene.h"
+#include "session/ToolPanelWindowController.h"
+#include "toolpanel/ToolPanelButton.h"
+#include "toolpanel/ToolPanelViewController.h"
+
+#include "appearance/PenwickBundle.h"
+
+#include <QElapsedTimer>
+#include <QTest>
+
+#include <memory>
+
+namespace penwick {
+
+namespace {
+
+using platform::Point;
+using platform::Rect;
+using platform::Window;
+
+class ToolPanelWindow : public SessionFixture
+{
+protected:
+    ToolPanelWindow()
+        : m_board(m_penwick.createDrawingWindowController(WindowType::whiteboard, primary()))
+        , m_controller(*m_board->tPanelWindowController())
+        , m_panel(*m_controller.toolPanelWindow())
+    { }
+
+    void show()
+    {
+        m_board->showWindow(nullptr);
+        EXPECT_TRUE(QTest::qWaitForWindowExposed(&m_panel));
+        QCoreApplication::processEvents();
+    }
+
+    /// A tool bar that belongs to no window.
+    static std::unique_ptr<ToolPanelWindowController> loaded()
+    {
+        auto object = makeToolPanelScene(*penwickBundle());
+        auto *const controller = dynamic_cast<ToolPanelWindowController *>(object.get());
+        static_cast<void>(object.release());
+        return std::unique_ptr<ToolPanelWindowController>(controller);
+    }
+
+    Penwick m_penwick;
+    std::shared_ptr<DrawingWindowController> m_board;
+    ToolPanelWindowController &m_controller;
+    ToolBarPanelWindow &m_panel;
+};
+
+using ToolPanelWindowDeathTest = ToolPanelWindow;
+
+} // namespace
+
+TEST_F(ToolPanelWindow, newControllerHasNoPanel)
+{
+    const ToolPanelWindowController controller;
+
+    EXPECT_EQ(controller.toolPanelWindow(), nullptr);
+    EXPECT_EQ(controller.window(), nullptr);
+}
+
+TEST_F(ToolPanelWindow, loadedPanelHasItsAttributes)
+{
+    const auto controller = loaded();
+    const platform::WindowAttributes &attributes = controller->toolPanelWindow()->attributes();
+
+    EXPECT_EQ(controller->window(), controller->toolPanelWindow());
+    EXPECT_EQ(controller->toolPanelWindow()->windowController(), controller.get());
+    EXPECT_EQ(attributes.backgroundColor.alpha(), 0);
+    EXPECT_FALSE(attributes.isOpaque);
+    EXPECT_EQ(attributes.collectionBehavior, 257U);
+    EXPECT_TRUE(attributes.titlebarAppearsTransparent);
+    EXPECT_EQ(attributes.styleMask & 15U, 0U);
+    EXPECT_EQ(attributes.styleMask & 32768U, 32768U);
+    EXPECT_EQ(attributes.titleVisibility, 1U);
+    EXPECT_FALSE(attributes.showsToolbarButton);
+    EXPECT_TRUE(attributes.isMovableByWindowBackground);
+    EXPECT_EQ(attributes.sharingType, 0U);
+    EXPECT_EQ(attributes.level, 24);
+}
+
+TEST_F(ToolPanelWindow, neverTakesTheKeys)
+{
+    EXPECT_TRUE(m_panel.windowFlags().testFlag(Qt::WindowDoesNotAcceptFocus));
+    EXPECT_TRUE(m_panel.testAttribute(Qt::WA_ShowWithoutActivating));
+    show();
+
+    EXPECT_TRUE(m_board->window()->isKeyWindow());
+}
+
+TEST_F(ToolPanelWindow, buttonsLieInsideThePanelAndApart)
+{
+    const auto buttons = m_panel.findChildren<ToolPanelButton *>();
+    ASSERT_EQ(buttons.size(), 8);
+    for (const ToolPanelButton *const one : buttons) {
+        const QRect area(one->mapTo(&m_panel, QPoint()), one->size());
+        EXPECT_TRUE(m_panel.rect().contains(area));
+        for (const ToolPanelButton *const other : buttons) {
+            EXPECT_TRUE(one == other
+                || !area.intersects(QRect(other->mapTo(&m_panel, QPoint()), other->size())));
+        }
+    }
+}
+
+TEST_F(ToolPanelWindow, outOfItsParentGlidesBack)
+{
+    show();
+    m_panel.setFrameOrigin({ 100, 300 });
+    QCoreApplication::processEvents();
+
+    m_controller.adjustPosition();
+
+    EXPECT_EQ(m_panel.frame(), (Rect { 343, 300, 52, 352 })); // where it is going to
+    EXPECT_NE(m_panel.x(), 343); // it is on its way
+    EXPECT_TRUE(QTest::qWaitFor([this] { return m_panel.x() == 343; }));
+    EXPECT_EQ(m_panel.frame(), (Rect { 343, 300, 52, 352 }));
+}
+
+TEST_F(ToolPanelWindow, insideItsParentStays)
+{
+    show();
+    m_panel.setFrameOrigin({ 700, 400 });
+    QCoreApplication::processEvents();
+
+    m_controller.adjustPosition();
+
+    EXPECT_EQ(m_panel.frame(), (Rect { 700, 400, 52, 352 }));
+}
+
+TEST_F(ToolPanelWindow, withoutAParentIsNeverMoved)
+{
+    const auto controller = loaded();
+    controller->toolPanelWindow()->setFrameOrigin({ -500, -500 });
+
+    controller->adjustPosition();
+
+    EXPECT_EQ(controller->toolPanelWindow()->frame(), (Rect { -500, -500, 52, 352 }));
+}
+
+TEST_F(ToolPanelWindow, isAdjustedTwoTenthsOfASecondAfterTheButtonWasLetGo)
+{
+    show();
+    m_panel.setFrameOrigin({ 100, 300 });
+    QCoreApplication::processEvents();
+    QElapsedTimer sinceRelease;
+    sinceRelease.start();
+
+    m_controller.mouseUp();
+
+    EXPECT_EQ(m_panel.frame().x, 100);
+    EXPECT_TRUE(QTest::qWaitFor([this] { return m_panel.frame().x == 343; }));
+    EXPECT_GE(sinceRelease.elapsed(), 190); // a coarse timer may come a twentieth early
+}
+
+TEST_F(ToolPanelWindow, controllerThatDiesBeforeItIsAdjustedIsLeftAlone)
+{
+    show();
+    m_controller.mouseUp();
+
+    m_board.reset();
+    static_cast<void>(m_penwick.createDrawingWindowController(WindowType::whiteboard, primary()));
+    deleteWhatIsLeft();
+
+    QTest::qWait(0);
+}
+
+TEST_F(ToolPanelWindow, pressOnTheBackgroundHidesThePopover)
+{
+    show();
+    Window &popover = *m_controller.content().popoverW();
+    m_controller.content().button(QStringLiteral("color"))->click();
+    ASSERT_TRUE(popover.isVisible());
+
+    QTest::mousePress(&m_panel, Qt::LeftButton, {}, { 2, 8 });
+    EXPECT_FALSE(popover.isVisible());
+    m_controller.mouseDown(); // with nothing to hide
+    QTest::mouseRelease(&m_panel, Qt::LeftButton, {}, { 2, 8 });
+}
+
+TEST_F(ToolPanelWindow, handleIsDragged)
+{
+    show();
+    QTest::mousePress(&m_panel, Qt::LeftButton, {}, { 26, 8 });
+
+    QTest::mouseMove(&m_panel, { 126, 58 });
+    EXPECT_EQ(m_panel.frame(), (Rect { 440, 364 - 50, 52, 352 }));
+    QTest::mouseRelease(&m_panel, Qt::LeftButton, {}, { 26, 8 });
+}
+
+TEST_F(ToolPanelWindow, buttonsAreNotDragged)
+{
+    show();
+    const Rect before = m_panel.frame();
+    auto *const eraser = m_controller.content().button(QStringLiteral("eraser"));
+
+    QTest::mousePress(eraser, Qt::LeftButton, {}, { 5, 5 });
+    QTest::mouseMove(eraser, { 30, 30 });
+    QTest::mouseRelease(eraser, Qt::LeftButton, {}, { 30, 30 });
+
+    EXPECT_EQ(m_panel.frame(), before);
+}
+
+TEST_F(ToolPanelWindowDeathTest, loadingWithoutAPanelStopsTheProcess)
+{
+    ToolPanelWindowController controller;
+
+    EXPECT_DEATH(controller.windowDidLoad(), "penwick: fatal error: the tool bar has no panel");
+}
+
+TEST_F(ToolPanelWindowDeathTest, pressWithoutAPanelStopsTheProcess)
+{
+    m_controller.setToolPanelWindow(nullptr);
+
+    EXPECT_DEATH(m_controller.mouseDown(), "penwick: fatal error: the tool bar has no panel");
+}
+
+TEST_F(ToolPanelWindowDeathTest, pressWithAnotherContentStopsTheProcess)
+{
+    m_panel.setContentViewController(nullptr);
+
+    EXPECT_DEATH(
+        m_controller.mouseDown(), "penwick: fatal error: the panel's content is no tool bar");
+}
+
+TEST_F(ToolPanelWindowDeathTest, pressBeforeThePopoverWindowIsThereStopsTheProcess)
+{
+    m_panel.setContentViewController(std::make_unique<ToolPanelViewController>());
+
+    EXPECT_DEATH(
+        m_controller.mouseDown(), "penwick: fatal error: the tool bar has no popover window");
+}
+
+} // namespace penwick
