@@ -144,9 +144,11 @@ void FrameTracker::check()
         m_frame = fromDesktop(outer);
         m_isByUser = true;
     }
-    m_isPending = false;
+    const bool wasPending = std::exchange(m_isPending, false);
     m_patience.stop();
     mendToolkit();
+    if (wasPending)
+        Q_EMIT confirmed();
     announce();
 }
 
@@ -211,6 +213,8 @@ void FrameTracker::announce()
     const bool isByUser = std::exchange(m_isByUser, false);
     if (hasResized)
         Q_EMIT resized();
+    if (hasResized && isByUser)
+        Q_EMIT resizedByUser();
     else if (!delta.isNull() && isByUser)
         announceUserMove();
     if (!hasResized && !delta.isNull())

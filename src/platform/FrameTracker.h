@@ -32,6 +32,8 @@ public:
     ~FrameTracker() override;
 
     [[nodiscard]] Rect frame() const;
+    /// The title bar and borders, in points, as last known.
+    [[nodiscard]] QMargins margins() const { return m_margins; }
     /// Asks for `frame` and returns at once. The desktop may grant something else.
     void request(const Rect &frame);
     /// Places the window, which is about to be shown, so that its outer frame is right at once.
@@ -48,6 +50,10 @@ Q_SIGNALS:
     void moveBegan();
     /// The window was moved by `delta` of Qt's desktop and kept its size. Sent before moved().
     void shifted(QPoint delta);
+    /// The same, because the user pulled at its edges. Sent after resized().
+    void resizedByUser();
+    /// The desktop has granted the frame that was asked for.
+    void confirmed();
     /// The window's top left corner is somewhere else.
     void moved();
 

@@ -3,6 +3,12 @@
 
 namespace penwick::platform {
 
+namespace {
+
+constexpr QColor photoFrame { 128, 128, 128 };
+
+} // namespace
+
 ImageView::ImageView(QWidget *parent)
     : ViewOf(parent)
 { }
@@ -13,12 +19,24 @@ void ImageView::setImage(const QImage &image)
     setNeedsDisplay();
 }
 
+void ImageView::setImageFrameStyle(ImageFrameStyle style)
+{
+    m_imageFrameStyle = style;
+    setNeedsDisplay();
+}
+
 void ImageView::draw(const Rect &)
 {
     if (m_image.isNull())
         return;
     QPainter painter(&surface());
-    painter.drawImage(QPointF(0.0, height() - m_image.deviceIndependentSize().height()), m_image);
+    const QSizeF size = m_image.deviceIndependentSize();
+    const QRectF place(QPointF(0.0, height() - size.height()), size);
+    painter.drawImage(place, m_image);
+    if (m_imageFrameStyle == ImageFrameStyle::Photo) {
+        painter.setPen(QPen(photoFrame, 1.0, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
+        painter.drawRect(place.adjusted(0.5, 0.5, -0.5, -0.5));
+    }
 }
 
 } // namespace penwick::platform

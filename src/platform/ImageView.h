@@ -9,6 +9,12 @@
 
 namespace penwick::platform {
 
+enum class ImageFrameStyle
+{
+    None = 0,
+    Photo = 1
+};
+
 /// An image in the bottom left corner of its view.
 class ImageView final : public ViewOf<QWidget>
 {
@@ -19,11 +25,14 @@ public:
 
     [[nodiscard]] const QImage &image() const { return m_image; }
     void setImage(const QImage &image);
+    [[nodiscard]] ImageFrameStyle imageFrameStyle() const { return m_imageFrameStyle; }
+    void setImageFrameStyle(ImageFrameStyle style);
 
     void draw(const Rect &dirtyRect) override;
 
 private:
     QImage m_image;
+    ImageFrameStyle m_imageFrameStyle = ImageFrameStyle::None;
 };
 
 } // namespace penwick::platform

@@ -3,13 +3,16 @@
 
 #include <penwick/platform/WindowController.h>
 
+#include "platform/BackgroundDrag.h"
 #include "platform/FrameTracker.h"
 #include "platform/Glide.h"
-#include "platform/ScreenCoordinates.h"
 #include "platform/View.h"
 #include "platform/ViewController.h"
+#include "platform/WindowBackdrop.h"
 #include "platform/WindowFamily.h"
 #include "platform/WindowFlags.h"
+#include "platform/WindowShape.h"
+#include "platform/native/NativeDesktop.h"
 
 #include <QCloseEvent>
 #include <QPainter>
@@ -27,17 +30,20 @@ public:
     explicit Private(Window &window)
         : tracker(new FrameTracker(window))
         , glide(new Glide(*tracker))
+        , shape(new WindowShape(window, *tracker))
     { }
 
     FrameTracker *const tracker; // a child of the window
     Glide *const glide; // a child of the tracker
+    WindowShape *const shape; // a child of the tracker
     WindowFamily family;
     std::unique_ptr<ViewController> contentViewController;
     QPointer<WindowController> windowController;
+    WindowBackdrop backdrop;
+    BackgroundDrag drag;
     bool isClosed = false;
     bool isMain = false;
     bool isContentBorrowed = false;
-    std::optional<QPoint> grab; // of a drag by the background, from the window's corner
 };
 
 Window::Window(QWidget *parent)
@@ -85,8 +91,7 @@ void Window::setFrame(const Rect &frame, Animate animate)
 
 void Window::setFrameOrigin(Point origin)
 {
-    const Rect now = frame();
-    setFrame({ origin.x, origin.y, now.width, now.height });
+    setFrame({ origin.x, origin.y, frame().width, frame().height });
 }
 
 // Attributes
@@ -302,16 +307,17 @@ void Window::setVisible(bool visible)
     if (visible && !d->family.canShow())
         return;
     if (visible && !isVisible()) {
+        d->backdrop.prepare(*this);
         d->tracker->prepareToShow();
         // Not a widget's child: a window outlives the one it stands above.
         windowHandle()->setTransientParent(
             parentWindow() ? parentWindow()->windowHandle() : nullptr);
     }
     QWidget::setVisible(visible);
-    if (visible)
-        showFamily();
-    else
-        hideFamily();
+    if (!visible)
+        return hideFamily();
+    NativeDesktop::instance().applyAttributes(*windowHandle(), nativeWindowValues(m_attributes));
+    showFamily();
 }
 
 void Window::changeEvent(QEvent *event)
@@ -346,8 +352,7 @@ void Window::mousePressEvent(QMouseEvent *event)
     event->accept();
     if (event->button() != Qt::LeftButton)
         return;
-    if (m_attributes.isMovable && m_attributes.isMovableByWindowBackground)
-        d->grab = event->globalPosition().toPoint() - pos();
+    d->drag.begin(*this, event->globalPosition().toPoint());
     if (d->windowController)
         d->windowController->mouseDown();
 }
@@ -355,10 +360,8 @@ void Window::mousePressEvent(QMouseEvent *event)
 void Window::mouseMoveEvent(QMouseEvent *event)
 {
     event->accept();
-    if (!d->grab || !event->buttons().testFlag(Qt::LeftButton))
-        return;
-    const QPoint corner = event->globalPosition().toPoint() - *d->grab;
-    setFrame(fromDesktop(QRect(corner, frameGeometry().size())));
+    if (event->buttons().testFlag(Qt::LeftButton))
+        d->drag.goOn(*this, event->globalPosition().toPoint());
 }
 
 void Window::mouseReleaseEvent(QMouseEvent *event)
@@ -366,7 +369,7 @@ void Window::mouseReleaseEvent(QMouseEvent *event)
     event->accept();
     if (event->button() != Qt::LeftButton)
         return;
-    d->grab.reset();
+    d->drag.end();
     if (d->windowController)
         d->windowController->mouseUp();
 }
@@ -385,6 +388,8 @@ void Window::resizeEvent(QResizeEvent *event)
 void Window::paintEvent(QPaintEvent *event)
 {
     QPainter painter(this);
+    if (d->backdrop.paint(painter))
+        return;
     painter.setCompositionMode(QPainter::CompositionMode_Source);
     painter.fillRect(event->rect(), m_attributes.backgroundColor);
 }

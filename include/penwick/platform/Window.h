@@ -97,6 +97,11 @@ public:
 
     [[nodiscard]] const WindowAttributes &attributes() const { return m_attributes; }
     void setAttributes(const WindowAttributes &attributes);
+    /// Whether what lies below the window can be seen where the window is transparent. On a
+    /// desktop that cannot, a transparent layer over the screen shows a picture of what was below
+    /// it when it was shown; told once, at the information level, to the logging category
+    /// "penwick.desktop".
+    [[nodiscard]] bool showsWhatIsBelow() const;
 
     // Child windows
 

@@ -29,4 +29,13 @@ void NativeDesktop::followFrame(QWindow &, FrameListener) { }
 
 void NativeDesktop::forgetFrame(WId) { }
 
+bool NativeDesktop::isCompositing() const
+{
+    return true;
+}
+
+void NativeDesktop::keepContentRatio(QWindow &, const QSize &) { }
+
+void NativeDesktop::applyAttributes(QWindow &, const NativeWindowValues &) { }
+
 } // namespace penwick::platform

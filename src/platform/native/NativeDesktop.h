@@ -2,6 +2,8 @@
 // What only the desktop's own protocol can do with a window: one file a desktop behind it.
 #pragma once
 
+#include "platform/native/NativeWindowValues.h"
+
 #include <QMargins>
 #include <QPoint>
 #include <QWindow>
@@ -38,6 +40,15 @@ public:
     virtual void followFrame(QWindow &window, FrameListener listener);
     /// Ends it; `window` may be gone.
     virtual void forgetFrame(WId window);
+
+    /// Whether transparent pixels of a window show what is below it.
+    [[nodiscard]] virtual bool isCompositing() const;
+    /// Lets the user resize `window` only to content of the shape `content`; any shape where that
+    /// is empty. Wears off when the window is created anew.
+    virtual void keepContentRatio(QWindow &window, const QSize &content);
+    /// What can be done of `attributes` once `window` is on the screen: on every virtual desktop,
+    /// out of captures of the screen.
+    virtual void applyAttributes(QWindow &window, const NativeWindowValues &values);
 };
 
 /// The desktop of this build's platform; null where the running application is not on it.

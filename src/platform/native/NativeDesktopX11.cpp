@@ -23,6 +23,9 @@ namespace {
 // A window manager answers within a millisecond; one that does not is not waited for.
 constexpr int longestWait = 50; // ms
 
+constexpr std::uint32_t allDesktops = 0xFFFFFFFF;
+constexpr std::uint32_t fromApplication = 1; // and not from a pager
+
 class NativeDesktopX11 final : public NativeDesktop
 {
 public:
@@ -32,6 +35,8 @@ public:
         , m_supported(atom("_NET_SUPPORTED"))
         , m_frameExtents(atom("_NET_FRAME_EXTENTS"))
         , m_requestFrameExtents(atom("_NET_REQUEST_FRAME_EXTENTS"))
+        , m_desktop(atom("_NET_WM_DESKTOP"))
+        , m_compositor(atom("_NET_WM_CM_S0"))
         , m_frames(connection, m_root)
     { }
 
@@ -42,7 +47,7 @@ public:
         const auto id = static_cast<xcb_window_t>(window.winId());
         // What an earlier showing left behind would be taken for the answer.
         xcb_delete_property(m_connection, id, m_frameExtents);
-        askForFrameExtents(id);
+        askToRoot(id, m_requestFrameExtents);
         QElapsedTimer clock;
         clock.start();
         while (clock.elapsed() < longestWait) {
@@ -59,6 +64,25 @@ public:
     void followFrame(QWindow &window, FrameListener listener) override
     {
         m_frames.follow(static_cast<xcb_window_t>(window.winId()), std::move(listener));
+    }
+
+    [[nodiscard]] bool isCompositing() const override
+    {
+        const auto cookie = xcb_get_selection_owner(m_connection, m_compositor);
+        const auto reply = owned(xcb_get_selection_owner_reply(m_connection, cookie, nullptr));
+        return reply && reply->owner != XCB_NONE;
+    }
+
+    void keepContentRatio(QWindow &window, const QSize &content) override
+    {
+        m_frames.keepContentRatio(static_cast<xcb_window_t>(window.winId()), content);
+    }
+
+    void applyAttributes(QWindow &window, const NativeWindowValues &values) override
+    {
+        // Nothing on this desktop keeps a window out of a capture; the host has to leave it out.
+        if (values.isOnAllDesktops)
+            askToRoot(static_cast<xcb_window_t>(window.winId()), m_desktop, allDesktops);
     }
 
     void forgetFrame(WId window) override { m_frames.forget(static_cast<xcb_window_t>(window)); }
@@ -91,13 +115,16 @@ private:
         return std::find(features.begin(), features.end(), feature) != features.end();
     }
 
-    void askForFrameExtents(xcb_window_t window) const
+    // Sent to the root, which is where a window manager listens.
+    void askToRoot(xcb_window_t window, xcb_atom_t what, std::uint32_t value = 0) const
     {
         xcb_client_message_event_t message {};
         message.response_type = XCB_CLIENT_MESSAGE;
         message.format = 32;
         message.window = window;
-        message.type = m_requestFrameExtents;
+        message.type = what;
+        message.data.data32[0] = value;
+        message.data.data32[1] = fromApplication;
         xcb_send_event(m_connection, 0, m_root,
             XCB_EVENT_MASK_SUBSTRUCTURE_NOTIFY | XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT,
             reinterpret_cast<const char *>(&message));
@@ -109,6 +136,8 @@ private:
     const xcb_atom_t m_supported;
     const xcb_atom_t m_frameExtents;
     const xcb_atom_t m_requestFrameExtents;
+    const xcb_atom_t m_desktop;
+    const xcb_atom_t m_compositor;
     X11FrameFollower m_frames;
 };
 

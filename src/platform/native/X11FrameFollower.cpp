@@ -6,12 +6,20 @@
 #include <QCoreApplication>
 
 #include <algorithm>
+#include <array>
+#include <cstring>
 
 namespace penwick::platform {
 
 namespace {
 
 constexpr std::uint8_t sentByAnotherClient = 0x80;
+
+// The size hints of a window: 18 numbers, of which these say its shape.
+constexpr std::uint32_t sizeHintsLength = 18;
+constexpr std::uint32_t hasAspect = 1U << 7;
+constexpr std::size_t leastAspect = 11;
+constexpr std::size_t mostAspect = 13;
 
 } // namespace
 
@@ -29,7 +37,7 @@ void X11FrameFollower::follow(xcb_window_t window, NativeDesktop::FrameListener 
     if (Followed *const known = find(window))
         known->listener = std::move(listener);
     else
-        m_followed.push_back({ window, XCB_NONE, std::move(listener) });
+        m_followed.push_back({ window, XCB_NONE, std::move(listener), QSize() });
 }
 
 void X11FrameFollower::forget(xcb_window_t window)
@@ -55,6 +63,9 @@ bool X11FrameFollower::nativeEventFilter(const QByteArray &eventType, void *mess
         return false;
     case XCB_CONFIGURE_NOTIFY:
         onConfigured(*static_cast<const xcb_configure_notify_event_t *>(message));
+        return false;
+    case XCB_PROPERTY_NOTIFY:
+        onPropertyChanged(*static_cast<const xcb_property_notify_event_t *>(message));
         return false;
     case XCB_FOCUS_IN:
     case XCB_FOCUS_OUT:
@@ -97,6 +108,52 @@ void X11FrameFollower::onConfigured(const xcb_configure_notify_event_t &event)
         [&event](const Followed &each) { return each.frame == event.window; });
     if (place != m_followed.end())
         place->listener(QPoint(event.x, event.y));
+}
+
+void X11FrameFollower::keepContentRatio(xcb_window_t window, const QSize &content)
+{
+    Followed *const followed = find(window);
+    if (!followed || followed->contentRatio == content)
+        return;
+    followed->contentRatio = content;
+    writeContentRatio(*followed);
+}
+
+// The toolkit rewrites the hints without the ratio when it shows a window or changes its limits.
+void X11FrameFollower::onPropertyChanged(const xcb_property_notify_event_t &event)
+{
+    const Followed *const followed
+        = event.atom == XCB_ATOM_WM_NORMAL_HINTS ? find(event.window) : nullptr;
+    if (followed && !followed->contentRatio.isEmpty())
+        writeContentRatio(*followed);
+}
+
+void X11FrameFollower::writeContentRatio(const Followed &followed) const
+{
+    const auto cookie = xcb_get_property(m_connection, 0, followed.window, XCB_ATOM_WM_NORMAL_HINTS,
+        XCB_ATOM_WM_SIZE_HINTS, 0, sizeHintsLength);
+    const auto reply = owned(xcb_get_property_reply(m_connection, cookie, nullptr));
+    if (!reply)
+        return;
+    std::array<std::uint32_t, sizeHintsLength> hints {};
+    std::memcpy(hints.data(), xcb_get_property_value(reply.get()),
+        std::min(hints.size() * 4,
+            static_cast<std::size_t>(xcb_get_property_value_length(reply.get()))));
+    std::array<std::uint32_t, sizeHintsLength> wanted = hints;
+    if (followed.contentRatio.isEmpty()) {
+        wanted[0] &= ~hasAspect;
+    } else {
+        wanted[0] |= hasAspect;
+        for (const std::size_t place : { leastAspect, mostAspect }) {
+            wanted[place] = static_cast<std::uint32_t>(followed.contentRatio.width());
+            wanted[place + 1] = static_cast<std::uint32_t>(followed.contentRatio.height());
+        }
+    }
+    if (wanted == hints) // ours already: this is what the news was about
+        return;
+    xcb_change_property(m_connection, XCB_PROP_MODE_REPLACE, followed.window,
+        XCB_ATOM_WM_NORMAL_HINTS, XCB_ATOM_WM_SIZE_HINTS, 32, sizeHintsLength, wanted.data());
+    xcb_flush(m_connection);
 }
 
 xcb_window_t X11FrameFollower::childOfRootAround(xcb_window_t window) const

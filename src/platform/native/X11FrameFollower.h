@@ -7,6 +7,7 @@
 #include "platform/native/NativeDesktop.h"
 
 #include <QAbstractNativeEventFilter>
+#include <QSize>
 
 #include <xcb/xcb.h>
 
@@ -24,6 +25,9 @@ public:
 
     void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
     void forget(xcb_window_t window);
+    /// Puts the shape that a window's content keeps into its hints, and again whenever the toolkit
+    /// writes them without it; an empty `content` takes it out. Only for a followed window.
+    void keepContentRatio(xcb_window_t window, const QSize &content);
 
     bool nativeEventFilter(const QByteArray &eventType, void *message, qintptr *result) override;
 
@@ -33,10 +37,13 @@ private:
         xcb_window_t window;
         xcb_window_t frame; // XCB_NONE while there is none
         NativeDesktop::FrameListener listener;
+        QSize contentRatio; // empty: any
     };
 
     [[nodiscard]] Followed *find(xcb_window_t window);
     [[nodiscard]] xcb_window_t childOfRootAround(xcb_window_t window) const;
+    void writeContentRatio(const Followed &followed) const;
+    void onPropertyChanged(const xcb_property_notify_event_t &event);
     void onReparented(const xcb_reparent_notify_event_t &event);
     void onConfigured(const xcb_configure_notify_event_t &event);
     [[nodiscard]] bool isFocusOfAGrab(const xcb_focus_in_event_t &event);

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: MIT
+// macOS. Written to the platform's documentation; it has not been run yet.
+#include "platform/native/NativeDesktop.h"
+
+#import <AppKit/AppKit.h>
+
+namespace penwick::platform {
+
+namespace {
+
+class NativeDesktopCocoa final : public NativeDesktop
+{
+public:
+    void keepContentRatio(QWindow &window, const QSize &content) override
+    {
+        NSWindow *const native = nativeWindow(window);
+        if (content.isEmpty())
+            native.resizeIncrements = NSMakeSize(1.0, 1.0); // which lifts the ratio
+        else
+            native.contentAspectRatio = NSMakeSize(content.width(), content.height());
+    }
+
+    void applyAttributes(QWindow &window, const NativeWindowValues &values) override
+    {
+        NSWindow *const native = nativeWindow(window);
+        native.styleMask = values.styleMask;
+        native.collectionBehavior = values.collectionBehavior;
+        native.level = values.level;
+        native.sharingType = static_cast<NSWindowSharingType>(values.sharingType);
+        native.titleVisibility = static_cast<NSWindowTitleVisibility>(values.titleVisibility);
+        native.titlebarAppearsTransparent = values.titlebarAppearsTransparent;
+        native.animationBehavior
+            = static_cast<NSWindowAnimationBehavior>(values.animationBehavior);
+        native.hasShadow = values.hasShadow;
+    }
+
+private:
+    static NSWindow *nativeWindow(QWindow &window)
+    {
+        return reinterpret_cast<NSView *>(window.winId()).window;
+    }
+};
+
+} // namespace
+
+std::unique_ptr<NativeDesktop> makeNativeDesktop()
+{
+    return std::make_unique<NativeDesktopCocoa>();
+}
+
+} // namespace penwick::platform
