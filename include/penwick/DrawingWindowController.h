@@ -38,6 +38,8 @@ public:
     /// Bottom left corner of the drawing window's frame as last recorded, in points, y up, from
     /// the primary screen's bottom left corner; nothing before the window was placed.
     [[nodiscard]] std::optional<platform::Point> drawingWindowOrigin() const;
+    /// The banner's window; null where it could not be loaded. Owned.
+    [[nodiscard]] platform::Window *sharingNotificationWindow() const;
     /// The kind of window; nothing before the window was placed.
     [[nodiscard]] std::optional<WindowType> mWindowType() const;
     /// The drawing window; null once it is gone. Owned by this controller.
@@ -59,6 +61,14 @@ public:
     /// yet stops the process.
     void setWindowPositionRelativeToMainWindow(
         platform::Window &window, double xoffset, double yOffset);
+    /// Makes `window` a transparent banner that a capture of the screen leaves out where the
+    /// desktop can do that.
+    void setNotificationWindowProperties(platform::Window &window);
+    /// Shows the banner in the middle of the drawing window for 1.5 s. Without a banner nothing
+    /// happens; a drawing window that was not placed stops the process.
+    void showSharingNotificationWindow();
+    /// Takes the banner off the screen.
+    void closeSharingNotificationWindow();
     /// Takes the tool bar's popover off the screen.
     void hideThePopover();
 
@@ -76,9 +86,14 @@ public:
     bool keyDown(const QKeyEvent &event) override;
 
 private:
-    void placeOnWhiteboard(const QScreen &screen);
-    void placeToolBar();
+    void coverScreen(const QScreen &screen);
+    void showBoardBorder();
+    void placeAsBoard(const platform::Rect &frame);
+    void setAnnotationImage(const QImage &image, const std::optional<QString> &title);
+    void loadBanner();
     void attachToolBar();
+    void placeToolBar();
+    void centreBanner();
 
     std::optional<platform::Point> m_drawingWindowOrigin;
     std::optional<WindowType> m_windowType;
@@ -86,6 +101,7 @@ private:
     double m_minWindowWidth;
     double m_minWindowHeight;
     std::shared_ptr<ToolPanelWindowController> m_tPanelWindowController;
+    std::unique_ptr<platform::WindowController> m_bannerController;
 };
 
 } // namespace penwick

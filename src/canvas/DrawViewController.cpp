@@ -84,8 +84,11 @@ UndoRedoManager &DrawViewController::history() const
 
 void DrawViewController::configureAnnotatingImageView(const QImage &image)
 {
-    require(m_annotatedImageView.data(), "the draw view controller has no image view")
-        ->setImage(image);
+    platform::ImageView &view
+        = *require(m_annotatedImageView.data(), "the draw view controller has no image view");
+    const QSizeF size = image.deviceIndependentSize();
+    view.setFrame({ 0.0, 0.0, size.width(), size.height() });
+    view.setImage(image);
 }
 
 void DrawViewController::viewDidLoad()

@@ -2,6 +2,7 @@
 #include "session/ComponentBundle.h"
 
 #include "session/DrawingWindowScene.h"
+#include "session/SharingNotificationScene.h"
 #include "session/ToolPanelScene.h"
 #include "toolpanel/PopoverInterface.h"
 
@@ -12,6 +13,8 @@ std::shared_ptr<platform::Bundle> makeComponentBundle()
     auto bundle = std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images"));
     const QString main = QStringLiteral("Main");
     bundle->addScene(main, QStringLiteral("DrawingWindowController"), makeDrawingWindowScene);
+    bundle->addScene(
+        main, QStringLiteral("SharingNotificationWindowController"), makeSharingNotificationScene);
     // The bundle outlives its own makers.
     const platform::Bundle &images = *bundle;
     bundle->addScene(main, QStringLiteral("ToolPanelWindowController"),

@@ -4,9 +4,11 @@
 #include "appearance/PenwickBundle.h"
 #include "appearance/Theme.h"
 #include "appearance/ViewBorder.h"
+#include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
 #include "platform/Storyboard.h"
 #include "platform/View.h"
+#include "platform/WindowFlags.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/StandardOutput.h"
 #include "session/ToolPanelWindowController.h"
@@ -18,6 +20,7 @@
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QScreen>
+#include <QTimer>
 
 namespace penwick {
 
@@ -28,6 +31,10 @@ using platform::Rect;
 using platform::require;
 
 constexpr double boardBorder = 3.0; // points
+constexpr int bannerTime = 1500; // ms
+constexpr int alertPanelAnimation = 5;
+constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
+constexpr int hiddenTitle = 1;
 constexpr double toolBarInset = 20.0; // points, from the drawing window's left edge
 constexpr auto missingToolBar = "Warning: ToolPanelWindowController not created!";
 
@@ -41,6 +48,12 @@ Rect mainScreenFrame()
 Rect boardOn(const Rect &screen, double width)
 {
     return { screen.x + screen.width / 6, screen.y + screen.height / 6, width, width * 9 * 0.0625 };
+}
+
+platform::Storyboard mainStoryboard()
+{
+    return platform::Storyboard(
+        QStringLiteral("Main"), *require(penwickBundle().get(), "the resource bundle is not set"));
 }
 
 } // namespace
@@ -106,14 +119,32 @@ void DrawingWindowController::windowDidLoad()
     // The host's own translations; no context, because the title is the host's to word.
     window.setWindowTitle(QCoreApplication::translate("", "Tarnhill Whiteboard"));
     window.setFrame(boardOn(mainScreenFrame(), m_minWindowWidth), Animate::Yes);
+    loadBanner();
     attachToolBar();
+}
+
+void DrawingWindowController::loadBanner()
+{
+    m_bannerController = mainStoryboard().instantiate<platform::WindowController>(
+        QStringLiteral("SharingNotificationWindowController"));
+    require(m_bannerController, "the drawing window has no sharing banner");
+    if (platform::Window *const banner = sharingNotificationWindow())
+        setNotificationWindowProperties(*banner);
+}
+
+void DrawingWindowController::setNotificationWindowProperties(platform::Window &window)
+{
+    platform::WindowAttributes attributes = window.attributes();
+    attributes.isOpaque = false;
+    attributes.sharingType = 0;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.backgroundColor = Qt::transparent;
+    window.setAttributes(attributes);
 }
 
 void DrawingWindowController::attachToolBar()
 {
-    const platform::Storyboard storyboard(
-        QStringLiteral("Main"), *require(penwickBundle().get(), "the resource bundle is not set"));
-    m_tPanelWindowController = storyboard.instantiate<ToolPanelWindowController>(
+    m_tPanelWindowController = mainStoryboard().instantiate<ToolPanelWindowController>(
         QStringLiteral("ToolPanelWindowController"));
     require(m_tPanelWindowController, "the drawing window has no tool bar");
     m_drawingWindow->addChildWindow(*require(
@@ -121,17 +152,83 @@ void DrawingWindowController::attachToolBar()
 }
 
 void DrawingWindowController::createWindowForApplication(WindowType win_type, QScreen &screen,
-    const std::optional<QImage> &, const std::optional<QString> &)
+    const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle)
 {
     m_windowType = win_type;
     const Rect screenFrame = platform::frameOfScreen(screen);
     m_minWindowWidth = screenFrame.width * 2 / 3;
     m_minWindowHeight = screenFrame.height * 2 / 3;
-    platform::Window &window = *require(m_drawingWindow.data(), "the drawing window is gone");
-    if (win_type == WindowType::whiteboard)
-        placeOnWhiteboard(screen);
-    m_drawingWindowOrigin = window.frame().origin();
+    require(m_drawingWindow.data(), "the drawing window is gone");
+    switch (win_type) {
+    case WindowType::annotation:
+        coverScreen(screen);
+        break;
+    case WindowType::whiteboard:
+        placeAsBoard(boardOn(screenFrame, m_minWindowWidth));
+        break;
+    case WindowType::imageAnnotation: {
+        showBoardBorder();
+        if (!annotatedImage || annotatedImage->isNull())
+            return; // nothing to draw on: the window stays as it was loaded, without a tool bar
+        setAnnotationImage(*annotatedImage, windowTitle);
+        const QSizeF size = annotatedImage->deviceIndependentSize();
+        const platform::Point corner = boardOn(screenFrame, m_minWindowWidth).origin();
+        m_drawingWindow->setFrame(
+            { corner.x, corner.y, size.width(), size.height() }, Animate::Yes);
+        break;
+    }
+    }
+    m_drawingWindowOrigin = m_drawingWindow->frame().origin();
     placeToolBar();
+    if (win_type == WindowType::whiteboard && sharingNotificationWindow()) {
+        centreBanner();
+        platform::WindowAttributes attributes = sharingNotificationWindow()->attributes();
+        attributes.animationBehavior = alertPanelAnimation;
+        sharingNotificationWindow()->setAttributes(attributes);
+    }
+}
+
+void DrawingWindowController::coverScreen(const QScreen &screen)
+{
+    platform::WindowAttributes attributes = m_drawingWindow->attributes();
+    attributes.ignoresMouseEvents = false;
+    attributes.isOpaque = false;
+    attributes.backgroundColor = Qt::transparent;
+    attributes.collectionBehavior = onAllDesktopsAndBesideFullScreen;
+    attributes.styleMask |= platform::StyleMask::fullSizeContentView;
+    attributes.styleMask &= ~(platform::StyleMask::closable | platform::StyleMask::miniaturizable
+        | platform::StyleMask::resizable);
+    attributes.titleVisibility = hiddenTitle;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.hasShadow = false;
+    attributes.level = platform::mainMenuWindowLevel;
+    m_drawingWindow->setAttributes(attributes);
+    m_drawingWindow->setFrame(platform::frameOfScreen(screen), Animate::No);
+}
+
+void DrawingWindowController::placeAsBoard(const Rect &frame)
+{
+    showBoardBorder();
+    m_drawingWindow->setFrame(frame, Animate::Yes);
+}
+
+void DrawingWindowController::showBoardBorder()
+{
+    platform::View &canvas
+        = *require(m_drawingWindow->contentView(), "the drawing window has no content view");
+    setViewBorder(canvas, TnhColors::borderGreenColor, boardBorder, 0.0);
+}
+
+void DrawingWindowController::setAnnotationImage(
+    const QImage &image, const std::optional<QString> &title)
+{
+    if (title)
+        m_drawingWindow->setWindowTitle(*title);
+    auto *const content
+        = require(dynamic_cast<DrawViewController *>(m_drawingWindow->contentViewController()),
+            "the drawing window's content is no drawing");
+    content->configureAnnotatingImageView(image);
+    content->annotatedImageView()->setImageFrameStyle(platform::ImageFrameStyle::Photo);
 }
 
 void DrawingWindowController::placeToolBar()
@@ -159,14 +256,40 @@ void DrawingWindowController::setWindowPositionRelativeToMainWindow(
     window.setFrameOrigin(*m_drawingWindowOrigin + platform::Point { xoffset, yOffset });
 }
 
-void DrawingWindowController::placeOnWhiteboard(const QScreen &screen)
+// The banner
+
+platform::Window *DrawingWindowController::sharingNotificationWindow() const
 {
-    platform::View &canvas
-        = *require(m_drawingWindow->contentView(), "the drawing window has no content view");
-    setViewBorder(canvas, TnhColors::borderGreenColor, boardBorder, 0.0);
-    m_drawingWindow->setFrame(
-        boardOn(platform::frameOfScreen(screen), m_minWindowWidth), Animate::Yes);
+    return m_bannerController ? m_bannerController->window() : nullptr;
 }
+
+void DrawingWindowController::centreBanner()
+{
+    const platform::Size drawing = m_drawingWindow->frame().size();
+    const platform::Size banner = sharingNotificationWindow()->frame().size();
+    setWindowPositionRelativeToMainWindow(*sharingNotificationWindow(),
+        drawing.width * 0.5 - banner.width * 0.5, drawing.height * 0.5 - banner.height * 0.5);
+}
+
+void DrawingWindowController::showSharingNotificationWindow()
+{
+    if (!sharingNotificationWindow())
+        return;
+    require(m_drawingWindow.data(), "the drawing window is gone");
+    centreBanner();
+    m_drawingWindow->addChildWindow(*sharingNotificationWindow());
+    QTimer::singleShot(bannerTime, this, &DrawingWindowController::closeSharingNotificationWindow);
+}
+
+void DrawingWindowController::closeSharingNotificationWindow()
+{
+    if (platform::Window *const banner = sharingNotificationWindow()) {
+        banner->orderOut();
+        banner->close();
+    }
+}
+
+// Moving, resizing, closing
 
 void DrawingWindowController::windowDidMove()
 {

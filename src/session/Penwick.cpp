@@ -63,6 +63,10 @@ std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
     return m_penwickWindowController;
 }
 
-void Penwick::showWindowSharingNotification() { }
+void Penwick::showWindowSharingNotification()
+{
+    if (m_penwickWindowController)
+        m_penwickWindowController->showSharingNotificationWindow();
+}
 
 } // namespace penwick

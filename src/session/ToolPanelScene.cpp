@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "session/ToolPanelScene.h"
 
+#include "appearance/Theme.h"
 #include "platform/PlainView.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -36,6 +37,11 @@ std::unique_ptr<QObject> makeToolPanelScene(const platform::Bundle &bundle)
     Ui::ToolPanel scene;
     scene.setupUi(panel.get());
     scene.grip->setAttribute(Qt::WA_TransparentForMouseEvents); // it is the handle that is dragged
+
+    for (auto *const rounded : { scene.toolBarHandle, scene.toolPanelRoot }) {
+        rounded->setWantsLayer(true);
+        rounded->layer()->cornerRadius = ToolPanelUI::toolPanelBorderRadius;
+    }
 
     auto content = std::make_unique<ToolPanelViewController>();
     for (auto *const button : panel->findChildren<platform::Button *>()) {

@@ -5,6 +5,7 @@
 #include "appearance/PenwickBundle.h"
 #include "canvas/DrawingCanvasView.h"
 #include "session/DrawingWindowScene.h"
+#include "session/SharingNotificationScene.h"
 #include "session/ToolPanelScene.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/PopoverInterface.h"
@@ -70,6 +71,8 @@ protected:
         auto bundle = std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images"));
         const QString main = QStringLiteral("Main");
         bundle->addScene(main, QStringLiteral("DrawingWindowController"), makeDrawingWindowScene);
+        bundle->addScene(main, QStringLiteral("SharingNotificationWindowController"),
+            makeSharingNotificationScene);
         if (maker)
             bundle->addScene(main, QStringLiteral("ToolPanelWindowController"), maker);
         setPenwickBundle(std::move(bundle));

@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: MIT
+// The words on the banner.
+#pragma once
+
+#include "platform/ViewOf.h"
+
+#include <QString>
+#include <QWidget>
+
+namespace penwick {
+
+/// One line of text in the middle, light with a dark outline: the banner is translucent, so any
+/// colour may lie below it.
+class BannerLabel final : public platform::ViewOf<QWidget>
+{
+    Q_OBJECT
+    Q_PROPERTY(QString text READ text WRITE setText)
+
+public:
+    explicit BannerLabel(QWidget *parent = nullptr);
+
+    [[nodiscard]] bool isFlipped() const override { return true; }
+
+    [[nodiscard]] const QString &text() const { return m_text; }
+    void setText(const QString &text);
+
+    void draw(const platform::Rect &dirtyRect) override;
+
+private:
+    QString m_text;
+};
+
+} // namespace penwick
