@@ -94,6 +94,23 @@ TEST_F(DrawViewControllerTest, annotatedImageIsShownInItsView)
     controller->configureAnnotatingImageView(image);
 
     EXPECT_EQ(imageView.image(), image);
+    EXPECT_EQ(imageView.frame(), (Rect { 0, 0, 3, 4 }));
+}
+
+TEST_F(DrawViewControllerTest, clearNeverTouchesTheAnnotatedImage)
+{
+    platform::ImageView imageView;
+    controller->setAnnotatedImageView(&imageView);
+    QImage image(3, 4, QImage::Format_RGB32);
+    image.fill(Qt::green);
+    controller->configureAnnotatingImageView(image);
+    stroke({ { 10, 10 }, { 50, 50 } });
+
+    controller->handleToolSelection(QStringLiteral("clear"));
+
+    EXPECT_TRUE(model().pathArray().isEmpty());
+    EXPECT_EQ(imageView.image(), image);
+    EXPECT_EQ(imageView.frame(), (Rect { 0, 0, 3, 4 }));
 }
 
 // What is copied and painted

@@ -4,6 +4,10 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+#include <thread>
+#include <vector>
+
 namespace penwick {
 namespace {
 
@@ -22,6 +26,24 @@ TEST(NotificationNames, areMadeOnce)
     EXPECT_EQ(&penwickNotificationKey(), &penwickNotificationKey());
     EXPECT_EQ(&drawingViewUpdatedNotification(), &drawingViewUpdatedNotification());
     EXPECT_EQ(&drawingCanvasSubviewUpdateNotification(), &drawingCanvasSubviewUpdateNotification());
+}
+
+TEST(NotificationNames, areMadeOnceAlsoFromSeveralThreadsAtATime)
+{
+    constexpr std::size_t threadCount = 8;
+    std::array<std::array<const QString *, 4>, threadCount> seen {};
+    std::vector<std::thread> threads;
+    for (auto &own : seen) {
+        threads.emplace_back([&own] {
+            own = { &notificationPrefix(), &penwickNotificationKey(),
+                &drawingViewUpdatedNotification(), &drawingCanvasSubviewUpdateNotification() };
+        });
+    }
+    for (std::thread &thread : threads)
+        thread.join();
+
+    for (const auto &own : seen)
+        EXPECT_EQ(own, seen[0]);
 }
 
 } // namespace

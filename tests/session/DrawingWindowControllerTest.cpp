@@ -52,10 +52,12 @@ class TitleTranslator final : public QTranslator
 {
 public:
     [[nodiscard]] QString translate(
-        const char *, const char *sourceText, const char *, int) const override
+        const char *context, const char *sourceText, const char *, int) const override
     {
-        return qstrcmp(sourceText, "Tarnhill Whiteboard") == 0 ? QStringLiteral("Wandtafel")
-                                                               : QString();
+        // The title is the host's to word, so it is looked up without a context of ours.
+        return qstrlen(context) == 0 && qstrcmp(sourceText, "Tarnhill Whiteboard") == 0
+            ? QStringLiteral("Wandtafel")
+            : QString();
     }
     [[nodiscard]] bool isEmpty() const override { return false; }
 };
