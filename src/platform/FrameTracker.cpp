@@ -23,6 +23,9 @@ constexpr int lookInterval = 50; // ms
 // Steps of one move by the user follow each other faster than this.
 constexpr int longestRest = 500; // ms
 
+// How long after it was shown a window is still being put in its place.
+constexpr int newness = 2000; // ms
+
 } // namespace
 
 FrameTracker::FrameTracker(QWidget &window)
@@ -37,6 +40,7 @@ FrameTracker::FrameTracker(QWidget &window)
     connect(&m_patience, &QTimer::timeout, this, &FrameTracker::lookAgain);
     m_userMove.setSingleShot(true);
     m_userMove.setInterval(longestRest);
+    connect(&m_userMove, &QTimer::timeout, this, &FrameTracker::check);
     m_window.installEventFilter(this);
 }
 
@@ -75,6 +79,7 @@ void FrameTracker::prepareToShow()
         m_margins = native.frameMargins();
     }
     followFrame();
+    m_sinceShown.start();
     applyRequest();
     m_announced = toDesktop(m_frame);
     awaitAnswer();
@@ -154,11 +159,12 @@ void FrameTracker::check()
 
 // A window manager may move a frame without a word to its window right after it has decorated it;
 // the toolkit then holds a place that was true for a moment. It is told the true one as soon as the
-// window moves again; asking for where it stands anyway would move nothing. While the user drags
-// the window, the toolkit may well lag behind.
+// window moves again; asking for where it stands anyway would move nothing. Later on, and while the
+// user drags the window, the toolkit may well lag behind.
 void FrameTracker::mendToolkit()
 {
-    const bool isStale = m_corner && !m_isByUser && !m_userMove.isActive()
+    const bool isNew = m_sinceShown.isValid() && m_sinceShown.elapsed() < newness;
+    const bool isStale = m_corner && isNew && !m_isByUser && !m_userMove.isActive()
         && m_window.windowHandle()->frameGeometry().topLeft() != toDesktop(m_frame).topLeft();
     if (isStale && !std::exchange(m_isMended, true)) {
         m_window.setGeometry(toDesktop(m_frame).marginsRemoved(m_margins).translated(1, 0));

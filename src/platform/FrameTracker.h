@@ -5,6 +5,7 @@
 
 #include <penwick/platform/Geometry.h>
 
+#include <QElapsedTimer>
 #include <QMargins>
 #include <QObject>
 #include <QRect>
@@ -82,6 +83,7 @@ private:
     QTimer m_userMove; // runs while a move by the user may go on
     bool m_isByUser = false;
     bool m_isMended = false; // asked once more already
+    QElapsedTimer m_sinceShown;
 };
 
 } // namespace penwick::platform
