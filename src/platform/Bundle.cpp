@@ -17,9 +17,9 @@ QIcon Bundle::imageForResource(const QString &name) const
     return QFile::exists(file) ? QIcon(new SvgIconEngine(file)) : QIcon();
 }
 
-void Bundle::addScene(const QString &storyboard, const QString &identifier, SceneMaker maker)
+void Bundle::addScene(const QString &storyboard, const QString &identifier, const SceneMaker &maker)
 {
-    m_storyboards[storyboard].insert(identifier, std::move(maker));
+    m_storyboards[storyboard].insert(identifier, maker);
 }
 
 Bundle::SceneMaker Bundle::scene(const QString &storyboard, const QString &identifier) const
@@ -27,9 +27,9 @@ Bundle::SceneMaker Bundle::scene(const QString &storyboard, const QString &ident
     return m_storyboards.value(storyboard).value(identifier);
 }
 
-void Bundle::addInterface(const QString &name, InterfaceLoader loader)
+void Bundle::addInterface(const QString &name, const InterfaceLoader &loader)
 {
-    m_interfaces.insert(name, std::move(loader));
+    m_interfaces.insert(name, loader);
 }
 
 Bundle::InterfaceLoader Bundle::interfaceLoader(const QString &name) const

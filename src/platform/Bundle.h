@@ -30,12 +30,12 @@ public:
     [[nodiscard]] QIcon imageForResource(const QString &name) const;
 
     /// Adds the scene `identifier` to the storyboard `storyboard`.
-    void addScene(const QString &storyboard, const QString &identifier, SceneMaker maker);
+    void addScene(const QString &storyboard, const QString &identifier, const SceneMaker &maker);
     /// The maker of that scene; empty where there is none.
     [[nodiscard]] SceneMaker scene(const QString &storyboard, const QString &identifier) const;
 
     /// Adds the interface file `name`.
-    void addInterface(const QString &name, InterfaceLoader loader);
+    void addInterface(const QString &name, const InterfaceLoader &loader);
     /// Its loader; empty where there is none.
     [[nodiscard]] InterfaceLoader interfaceLoader(const QString &name) const;
 

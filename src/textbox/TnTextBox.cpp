@@ -235,20 +235,21 @@ void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)
 void TnTextBox::mousePressEvent(QMouseEvent *event)
 {
     if (event->button() == Qt::MiddleButton && isEditable())
-        QTextEdit::mousePressEvent(event);
+        QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
     ViewOf::mousePressEvent(event);
 }
 
 void TnTextBox::mouseMoveEvent(QMouseEvent *event)
 {
     if (event->buttons().testFlag(Qt::LeftButton) && isEditable())
-        QTextEdit::mouseMoveEvent(event);
+        QTextEdit::mouseMoveEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
     ViewOf::mouseMoveEvent(event);
 }
 
 void TnTextBox::mouseReleaseEvent(QMouseEvent *event)
 {
     if (event->button() == Qt::LeftButton || (event->button() == Qt::MiddleButton && isEditable()))
+        // NOLINTNEXTLINE(bugprone-parent-virtual-call): the editor alone
         QTextEdit::mouseReleaseEvent(event);
     ViewOf::mouseReleaseEvent(event);
 }
