@@ -52,6 +52,68 @@ TEST(BezierPath, elementsComeBackInTheOrderInWhichTheyWereAppended)
     EXPECT_EQ(path.elementAtIndex(3).kind, Kind::ClosePath);
 }
 
+TEST(BezierPath, linesThatFollowEachOtherAreAChainOfPointsAndKeepTheirElements)
+{
+    BezierPath path;
+    EXPECT_TRUE(path.chain().empty());
+    for (double x = 0; x < 3; ++x) {
+        path.moveToPoint({ x, 1 });
+        path.lineToPoint({ x + 1, 1 });
+    }
+
+    ASSERT_EQ(path.chain().size(), 4U);
+    EXPECT_EQ(path.chain()[3], (Point { 3, 1 }));
+    ASSERT_EQ(path.elementCount(), 6);
+    for (int index = 0; index < 6; ++index) {
+        const BezierPath::Element element = path.elementAtIndex(index);
+        EXPECT_EQ(element.kind, index % 2 == 0 ? Kind::MoveTo : Kind::LineTo) << index;
+        EXPECT_EQ(element.points[0], (Point { (index + 1) / 2 * 1.0, 1 })) << index;
+    }
+}
+
+TEST(BezierPath, whateverIsNoChainKeepsTheElementsThatItHadAsOne)
+{
+    const auto chainOfOne = [] {
+        auto path = std::make_unique<BezierPath>();
+        path->moveToPoint({ 0, 0 });
+        path->lineToPoint({ 1, 0 });
+        path->moveToPoint({ 1, 0 });
+        return path;
+    };
+    const auto expectStart = [](const BezierPath &path, Kind last, Point point) {
+        EXPECT_TRUE(path.chain().empty());
+        ASSERT_EQ(path.elementCount(), 4);
+        EXPECT_EQ(path.elementAtIndex(0).points[0], (Point { 0, 0 }));
+        EXPECT_EQ(path.elementAtIndex(1).points[0], (Point { 1, 0 }));
+        EXPECT_EQ(path.elementAtIndex(2).kind, Kind::MoveTo);
+        EXPECT_EQ(path.elementAtIndex(2).points[0], (Point { 1, 0 }));
+        EXPECT_EQ(path.elementAtIndex(3).kind, last);
+        EXPECT_EQ(path.elementAtIndex(3).points[0], point);
+    };
+
+    const auto moved = chainOfOne();
+    moved->moveToPoint({ 1, 0 });
+    expectStart(*moved, Kind::MoveTo, { 1, 0 });
+    const auto curved = chainOfOne();
+    curved->curveToPoint({ 9, 9 }, { 5, 5 }, { 7, 7 });
+    expectStart(*curved, Kind::CurveTo, { 5, 5 });
+    const auto closed = chainOfOne();
+    closed->closePath();
+    expectStart(*closed, Kind::ClosePath, {});
+
+    BezierPath apart;
+    apart.moveToPoint({ 0, 0 });
+    apart.lineToPoint({ 1, 0 });
+    apart.moveToPoint({ 1, 5 });
+    EXPECT_TRUE(apart.chain().empty());
+    EXPECT_EQ(apart.elementAtIndex(2).points[0], (Point { 1, 5 }));
+
+    BezierPath withoutMove;
+    withoutMove.lineToPoint({ 1, 0 });
+    EXPECT_TRUE(withoutMove.chain().empty());
+    EXPECT_EQ(withoutMove.elementAtIndex(0).kind, Kind::LineTo);
+}
+
 TEST(BezierPath, generalPathOfNothingIsEmpty)
 {
     EXPECT_EQ(BezierPath().CGPath().elementCount(), 0);

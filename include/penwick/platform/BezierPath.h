@@ -10,6 +10,7 @@
 #include <array>
 #include <cstdint>
 #include <initializer_list>
+#include <span>
 #include <vector>
 
 namespace penwick::platform {
@@ -28,6 +29,9 @@ enum class LineJoinStyle
 };
 
 /// A path that is a thing of its own: two paths with the same geometry are still two.
+///
+/// A path of lines each of which begins, by a move, where the last one ended is a chain; what is
+/// drawn by hand is one. A chain keeps one point for each line, any other path all its elements.
 ///
 /// Coordinates are points, y up, in the space of whatever draws it. Never copied; shared by
 /// reference. GUI thread only.
@@ -57,9 +61,13 @@ public:
     /// Identity of this object: unique in the process, the same for the object's whole life.
     [[nodiscard]] std::int64_t hash() const { return m_hash; }
 
-    [[nodiscard]] int elementCount() const { return static_cast<int>(m_elements.size()); }
+    [[nodiscard]] int elementCount() const { return m_elementCount; }
     /// The element at `index`, which must be from 0 to elementCount() - 1.
     [[nodiscard]] Element elementAtIndex(int index) const;
+
+    /// The points that the lines of a chain go through; empty for a path that is no chain and for
+    /// one without elements. Valid until the path changes.
+    [[nodiscard]] std::span<const Point> chain() const;
 
     void moveToPoint(Point point);
     void lineToPoint(Point point);
@@ -89,13 +97,18 @@ private:
         std::uint32_t firstPoint;
     };
 
+    [[nodiscard]] bool continuesChain(ElementKind kind, std::span<const Point> points) const;
     void append(ElementKind kind, std::initializer_list<Point> points);
+    void keepAllElements();
+    void growBounds(Point point);
 
     const std::int64_t m_hash;
     double m_lineWidth = 1.0;
     LineCapStyle m_lineCapStyle = LineCapStyle::Butt;
     LineJoinStyle m_lineJoinStyle = LineJoinStyle::Miter;
-    std::vector<Step> m_elements;
+    int m_elementCount = 0;
+    bool m_isChain = true;
+    std::vector<Step> m_steps; // empty for a chain
     std::vector<Point> m_points;
     Point m_lowest; // corners of the bounds; meaningful once there is a point
     Point m_highest;

@@ -4,6 +4,7 @@
 #include "platform/foundation/ObjectIdentifier.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace penwick::platform {
 
@@ -31,22 +32,66 @@ BezierPath::BezierPath()
 
 BezierPath::Element BezierPath::elementAtIndex(int index) const
 {
-    const Step step = m_elements.at(static_cast<std::size_t>(index));
+    const auto place = static_cast<std::size_t>(index);
+    if (m_isChain) {
+        const bool isMove = place % 2 == 0;
+        return { isMove ? ElementKind::MoveTo : ElementKind::LineTo,
+            { m_points.at((place + 1) / 2), {}, {} } };
+    }
+    const Step step = m_steps.at(place);
     Element element { step.kind, {} };
     std::copy_n(m_points.begin() + step.firstPoint, pointCount(step.kind), element.points.begin());
     return element;
 }
 
+std::span<const Point> BezierPath::chain() const
+{
+    return m_isChain ? std::span(m_points) : std::span<const Point>();
+}
+
+bool BezierPath::continuesChain(ElementKind kind, std::span<const Point> points) const
+{
+    const bool isMoveExpected = m_elementCount % 2 == 0;
+    if (kind == ElementKind::MoveTo)
+        return isMoveExpected && (m_points.empty() || points.front() == m_points.back());
+    return kind == ElementKind::LineTo && !isMoveExpected;
+}
+
 void BezierPath::append(ElementKind kind, std::initializer_list<Point> points)
 {
-    m_elements.push_back({ kind, static_cast<std::uint32_t>(m_points.size()) });
-    for (const Point point : points) {
-        if (m_points.empty())
-            m_lowest = m_highest = point;
-        m_lowest = { std::min(m_lowest.x, point.x), std::min(m_lowest.y, point.y) };
-        m_highest = { std::max(m_highest.x, point.x), std::max(m_highest.y, point.y) };
-        m_points.push_back(point);
+    if (m_isChain && !continuesChain(kind, points))
+        keepAllElements();
+    if (!m_isChain || m_elementCount == 0 || kind == ElementKind::LineTo) {
+        for (const Point point : points) {
+            growBounds(point);
+            m_points.push_back(point);
+        }
     }
+    if (!m_isChain)
+        m_steps.push_back({ kind, static_cast<std::uint32_t>(m_points.size() - points.size()) });
+    ++m_elementCount;
+}
+
+void BezierPath::keepAllElements()
+{
+    std::vector<Step> steps;
+    std::vector<Point> points;
+    for (int index = 0; index < m_elementCount; ++index) {
+        const Element element = elementAtIndex(index);
+        steps.push_back({ element.kind, static_cast<std::uint32_t>(points.size()) });
+        points.push_back(element.points[0]);
+    }
+    m_isChain = false;
+    m_steps = std::move(steps);
+    m_points = std::move(points);
+}
+
+void BezierPath::growBounds(Point point)
+{
+    if (m_points.empty())
+        m_lowest = m_highest = point;
+    m_lowest = { std::min(m_lowest.x, point.x), std::min(m_lowest.y, point.y) };
+    m_highest = { std::max(m_highest.x, point.x), std::max(m_highest.y, point.y) };
 }
 
 void BezierPath::moveToPoint(Point point)
