@@ -4,7 +4,7 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
-#include "canvas/StrokeHitTest.h"
+#include "strokes/StrokeHitTest.h"
 #include "history/UndoRedoManager.h"
 
 #include <QCoreApplication>
@@ -90,7 +90,7 @@ void Board::drag(Point point)
 
 void Board::show()
 {
-    QCoreApplication::sendPostedEvents(&m_window, QEvent::UpdateRequest);
+    QCoreApplication::sendPostedEvents();
 }
 
 void Board::forgetNewestStroke()

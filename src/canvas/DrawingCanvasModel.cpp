@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "canvas/DrawingCanvasModel.h"
 
-#include "canvas/StrokeHitTest.h"
 #include "history/UndoRedoManager.h"
 #include "platform/foundation/FatalError.h"
 #include "textbox/TextBoxDelegate.h"
@@ -65,6 +64,7 @@ void DrawingCanvasModel::createPathWithParam(
     const StrokeEntry entry { std::move(path), { startPoint, std::nullopt, pathColor }, pathId };
 
     mutablePathArray().append(entry);
+    m_strokeIndex.follow(pathArray());
     record({ entry, ActionType::draw, pathId });
     forgetWhatCouldBeRedone();
 }
@@ -73,6 +73,7 @@ void DrawingCanvasModel::updateTheCurrentPath(platform::Point currentPoint)
 {
     if (pathArray().isEmpty())
         return;
+    m_strokeIndex.follow(pathArray()); // an undo may have made another stroke the newest
     StrokeEntry &current = mutablePathArray().mutableLast();
     std::optional<platform::Point> &segmentStart = current.bPathParams.startPoint;
     if (!segmentStart)
@@ -84,15 +85,15 @@ void DrawingCanvasModel::updateTheCurrentPath(platform::Point currentPoint)
 
 bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLocation)
 {
-    const auto hit = pathArray().firstIndexWhere([eraseLocation](const StrokeEntry &entry) {
-        return strokeContains(*entry.bPath, eraseLocation);
-    });
+    m_strokeIndex.follow(pathArray());
+    const auto hit = m_strokeIndex.oldestAt(eraseLocation);
     if (!hit)
         return false;
     const StrokeEntry entry = pathArray()[*hit];
     record({ entry, ActionType::erase, entry.pathId });
     forgetWhatCouldBeRedone();
     mutablePathArray().removeAt(*hit);
+    m_strokeIndex.follow(pathArray());
     return true;
 }
 
@@ -131,6 +132,7 @@ void DrawingCanvasModel::clearCanvas()
         history.pushUndo({ entry, ActionType::clear, entry.textId });
     history.setUndoCount(0);
     mutablePathArray().clear();
+    m_strokeIndex.follow(pathArray()); // so that it keeps nothing alive
     mutableTextBoxArray().clear();
 }
 

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "history/CanvasContent.h"
+#include "strokes/StrokeIndex.h"
 
 #include <penwick/platform/Geometry.h>
 
@@ -65,6 +66,7 @@ private:
     void forgetWhatCouldBeRedone();
 
     std::shared_ptr<UndoRedoManager> m_undoRedoManager;
+    StrokeIndex m_strokeIndex; // brought up to date before it is asked or a stroke grows
 };
 
 } // namespace penwick

@@ -3,7 +3,6 @@
 
 #include "appearance/Theme.h"
 #include "canvas/DrawingCanvasModel.h"
-#include "canvas/StrokePainter.h"
 #include "platform/foundation/FatalError.h"
 #include "textbox/TnTextBox.h"
 
@@ -40,7 +39,20 @@ DrawingCanvasView::~DrawingCanvasView() = default;
 void DrawingCanvasView::setPathArray(const EntryList<StrokeEntry> &strokes)
 {
     m_pathArray = strokes;
+    markPixels(m_picture.follow(m_pathArray));
     m_hasDroppedEntry = false;
+}
+
+// The controller marks what a segment needs; the smooth edge of a hairline reaches farther.
+void DrawingCanvasView::markPixels(const QRect &pixels)
+{
+    if (pixels.isEmpty())
+        return;
+    const double scale = QWidget::devicePixelRatioF();
+    const double height = QWidget::height();
+    const QRectF area(pixels.x() / scale, height - (pixels.bottom() + 1) / scale,
+        pixels.width() / scale, pixels.height() / scale);
+    surface().update(area.toAlignedRect());
 }
 
 void DrawingCanvasView::setTextBoxArray(const EntryList<TextBoxEntry> &boxes)
@@ -182,13 +194,29 @@ void DrawingCanvasView::resetCursorRects()
     addCursorRect(bounds(), m_cursorType);
 }
 
+void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)
+{
+    const double scale = QWidget::devicePixelRatioF();
+    const QSize size = (QSizeF(QWidget::size()) * scale).toSize();
+    m_picture.follow(m_pathArray); // a click may have dropped an entry
+    m_picture.update(size, scale);
+
+    // A pixel more than marked on every side: what is too much is clipped away.
+    const platform::Rect dirty = dirtyRect.grownBy(1.0);
+    const QRect area
+        = QRectF(dirty.x * scale, dirty.y * scale, dirty.width * scale, dirty.height * scale)
+              .toAlignedRect()
+        & QRect(QPoint(), size);
+    QPainter painter(&surface());
+    painter.scale(1 / scale, 1 / scale); // pixel for pixel, no matter how many make a point
+    painter.drawImage(QPoint(area.x(), size.height() - area.y() - area.height()),
+        m_picture.pixels().image(), m_picture.pixels().inImage(area));
+}
+
 void DrawingCanvasView::draw(const platform::Rect &dirtyRect)
 {
     takeArraysAnew();
-    {
-        Painter painter(*this);
-        paintStrokes(painter, m_pathArray, dirtyRect);
-    }
+    showStrokes(dirtyRect);
     // So text boxes that undo brought back appear again.
     const EntryList<TextBoxEntry> boxes = m_textBoxArray; // whoever leaves may change the list
     for (const TextBoxEntry &entry : boxes)

@@ -6,6 +6,7 @@
 #include "history/CanvasContent.h"
 #include "platform/ViewOf.h"
 #include "platform/WeakReference.h"
+#include "strokes/StrokePicture.h"
 
 #include <penwick/platform/Window.h>
 
@@ -76,12 +77,15 @@ private:
     [[nodiscard]] DrawingCanvasModel &model() const;
     void dropEntryOfClick();
     void takeArraysAnew();
+    void markPixels(const QRect &pixels);
+    void showStrokes(const platform::Rect &dirtyRect);
 
     platform::Point m_lastPoint;
     platform::Point m_startPoint;
     bool m_isDragged = false;
     double m_brushThickness;
     EntryList<StrokeEntry> m_pathArray;
+    StrokePicture m_picture; // of m_pathArray
     EntryList<TextBoxEntry> m_textBoxArray;
     double m_textFontSize;
     QColor m_brushColor;

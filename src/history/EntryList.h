@@ -6,6 +6,7 @@
 
 #include "platform/foundation/FatalError.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <deque>
 #include <iterator>
@@ -92,6 +93,13 @@ public:
 
     [[nodiscard]] Iterator begin() const { return { this, 0 }; }
     [[nodiscard]] Iterator end() const { return { this, size() }; }
+
+    /// How many entries at the front this list and `other` are known to have in common, without a
+    /// look at them; there may be more.
+    [[nodiscard]] int sharedStart(const EntryList &other) const
+    {
+        return m_settled == other.m_settled ? std::min(m_settledCount, other.m_settledCount) : 0;
+    }
 
     /// The index of the first entry, from the front, for which `predicate` holds.
     template <class Predicate>

@@ -1,12 +1,18 @@
 // SPDX-License-Identifier: MIT
 // The one way of painting a stroke, on a picture of its own.
-#include "canvas/StrokePainter.h"
+#include "strokes/StrokePainter.h"
+
+#include "strokes/CoverageMask.h"
+#include "strokes/PixelLayer.h"
+
+#include <penwick/platform/BezierPath.h>
 
 #include <gtest/gtest.h>
 
+#include <QColor>
 #include <QImage>
-#include <QPainter>
 
+#include <algorithm>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -16,10 +22,9 @@ namespace {
 
 using platform::BezierPath;
 using platform::Point;
-using platform::Rect;
 
 constexpr int side = 60;
-constexpr Rect everything { 0, 0, side, side };
+constexpr QRect everything { 0, 0, side, side };
 
 /// A stroke that goes through `points`, built segment by segment and round as drawn ones are.
 StrokeEntry strokeThrough(
@@ -45,26 +50,20 @@ EntryList<StrokeEntry> listOf(const std::vector<StrokeEntry> &strokes)
     return list;
 }
 
-QImage paper()
+/// `strokes` painted as a canvas paints them, on nothing; only inside `part`.
+QImage painted(const std::vector<StrokeEntry> &strokes, const QRect &part = everything)
 {
-    QImage picture(side, side, QImage::Format_ARGB32_Premultiplied);
-    picture.fill(Qt::white);
-    return picture;
+    PixelLayer layer(everything.size());
+    CoverageMask scratch;
+    const EntryList<StrokeEntry> list = listOf(strokes);
+    for (int index = 0; index < list.size(); ++index)
+        paintStroke(layer, list[index], colorOf(list, index), 1.0, part, scratch);
+    return layer.image();
 }
 
-/// `strokes` on white, painted as a canvas paints them; only inside `clip` where there is one.
-QImage painted(const std::vector<StrokeEntry> &strokes, const Rect &dirtyRect = everything,
-    const std::optional<QRect> &clip = std::nullopt)
+QImage nothing()
 {
-    QImage picture = paper();
-    QPainter painter(&picture);
-    painter.setRenderHint(QPainter::Antialiasing);
-    if (clip)
-        painter.setClipRect(*clip);
-    painter.translate(0.0, side);
-    painter.scale(1.0, -1.0);
-    paintStrokes(painter, listOf(strokes), dirtyRect);
-    return picture;
+    return PixelLayer(everything.size()).image();
 }
 
 QColor at(const QImage &picture, int x, int y)
@@ -74,8 +73,8 @@ QColor at(const QImage &picture, int x, int y)
 
 TEST(StrokePainter, nothingIsPaintedWithoutStrokesOrForAStrokeWithoutSegments)
 {
-    EXPECT_EQ(painted({}), paper());
-    EXPECT_EQ(painted({ strokeThrough({ { 30, 30 } }, Qt::black) }), paper());
+    EXPECT_EQ(painted({}), nothing());
+    EXPECT_EQ(painted({ strokeThrough({ { 30, 30 } }, Qt::black) }), nothing());
 }
 
 TEST(StrokePainter, strokeHasItsColourItsWidthAndRoundEnds)
@@ -84,10 +83,10 @@ TEST(StrokePainter, strokeHasItsColourItsWidthAndRoundEnds)
 
     for (int y = 28; y <= 32; ++y)
         EXPECT_EQ(at(picture, 30, y), QColor(Qt::red)) << y;
-    EXPECT_EQ(at(picture, 30, 27), QColor(Qt::white));
-    EXPECT_EQ(at(picture, 30, 33), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 30, 27), QColor(Qt::transparent));
+    EXPECT_EQ(at(picture, 30, 33), QColor(Qt::transparent));
     EXPECT_EQ(at(picture, 18, 30), QColor(Qt::red));
-    EXPECT_EQ(at(picture, 16, 30), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 16, 30), QColor(Qt::transparent));
     EXPECT_NE(at(picture, 17, 28), QColor(Qt::red));
 }
 
@@ -99,14 +98,21 @@ TEST(StrokePainter, strokeWithoutAColourTakesThatOfTheStrokeBeforeIt)
     EXPECT_EQ(at(picture, 30, 30), QColor(Qt::green));
 }
 
+TEST(StrokePainter, firstStrokeIsBlackIfItHasNoColour)
+{
+    const QImage picture = painted({ strokeThrough({ { 10, 10.5 }, { 50, 10.5 } }, std::nullopt) });
+
+    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::black));
+}
+
 TEST(StrokePainter, strokeWithoutAColourTakesThatOfTheStrokeBeforeItThoughThatIsNotPainted)
 {
     const QImage picture
         = painted({ strokeThrough({ { 10, 10.5 }, { 50, 10.5 } }, Qt::green),
                       strokeThrough({ { 10, 30.5 }, { 50, 30.5 } }, std::nullopt) },
-            { 0, 20, side, side });
+            { 0, 20, side, side - 20 });
 
-    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::transparent));
     EXPECT_EQ(at(picture, 30, 30), QColor(Qt::green));
 }
 
@@ -118,9 +124,9 @@ TEST(StrokePainter, transparentStrokeIsOneShapeAndBlendedOnce)
 
     for (int y = 0; y < side; ++y) {
         for (int x = 0; x < side; ++x)
-            EXPECT_GE(at(picture, x, y).red(), 127);
+            EXPECT_LE(at(picture, x, y).alpha(), 128);
     }
-    EXPECT_EQ(at(picture, 30, 30).red(), 127);
+    EXPECT_EQ(at(picture, 30, 30).alpha(), 128);
 }
 
 TEST(StrokePainter, eachStrokeIsBlendedByItself)
@@ -129,8 +135,8 @@ TEST(StrokePainter, eachStrokeIsBlendedByItself)
     const QImage picture = painted({ strokeThrough({ { 10, 30 }, { 50, 30 } }, half, 9.0),
         strokeThrough({ { 30, 10 }, { 30, 50 } }, half, 9.0) });
 
-    EXPECT_EQ(at(picture, 20, 30).red(), 127);
-    EXPECT_EQ(at(picture, 30, 30).red(), 63);
+    EXPECT_EQ(at(picture, 20, 30).alpha(), 128);
+    EXPECT_EQ(at(picture, 30, 30).alpha(), 192); // 128 + 128 * (1 - 128 / 255)
 }
 
 TEST(StrokePainter, segmentThatLeadsNowhereIsADot)
@@ -140,8 +146,8 @@ TEST(StrokePainter, segmentThatLeadsNowhereIsADot)
 
     for (int x = 27; x <= 33; ++x)
         EXPECT_EQ(at(picture, x, 30), QColor(Qt::black)) << x;
-    EXPECT_EQ(at(picture, 25, 30), QColor(Qt::white));
-    EXPECT_EQ(at(picture, 35, 30), QColor(Qt::white));
+    EXPECT_EQ(at(picture, 25, 30), QColor(Qt::transparent));
+    EXPECT_EQ(at(picture, 35, 30), QColor(Qt::transparent));
 }
 
 TEST(StrokePainter, curveIsPaintedToo)
@@ -155,7 +161,7 @@ TEST(StrokePainter, curveIsPaintedToo)
     const QImage picture = painted({ { path, { std::nullopt, std::nullopt, Qt::black }, id } });
 
     EXPECT_EQ(at(picture, 30, 40), QColor(Qt::black)); // its top: a quarter of 10 + 50 + 50 + 10
-    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::white)); // no line from end to end
+    EXPECT_EQ(at(picture, 30, 10), QColor(Qt::transparent)); // no line from end to end
 }
 
 TEST(StrokePainter, partIsPixelForPixelWhatTheWholeHasThere)
@@ -169,12 +175,33 @@ TEST(StrokePainter, partIsPixelForPixelWhatTheWholeHasThere)
 
     for (int x = 0; x < side; x += 7) {
         for (int y = 0; y < side; y += 7) {
-            const QRect part(x, side - y - 7, 7, 7);
-            const QImage picture
-                = painted(strokes, { static_cast<double>(x), static_cast<double>(y), 7, 7 }, part);
-            ASSERT_EQ(picture.copy(part), whole.copy(part)) << x << ' ' << y;
+            const QRect part(x, y, std::min(7, side - x), std::min(7, side - y));
+            const QRect shown(x, side - y - part.height(), part.width(), part.height());
+            ASSERT_EQ(painted(strokes, part).copy(shown), whole.copy(shown)) << x << ' ' << y;
         }
     }
+}
+
+TEST(StrokePainter, strokeWithoutThicknessLeavesNoMark)
+{
+    EXPECT_EQ(painted({ strokeThrough({ { 10, 10 }, { 50, 50 } }, Qt::black, 0.0) }), nothing());
+    EXPECT_EQ(painted({ strokeThrough({ { 10, 10 }, { 50, 50 } }, Qt::black, -3.0) }), nothing());
+}
+
+TEST(StrokePainter, pointsAreAsManyPixelsAsTheScaleSays)
+{
+    PixelLayer layer({ 100, 40 });
+    CoverageMask scratch;
+    const StrokeEntry stroke = strokeThrough({ { 10, 10 }, { 40, 10 } }, Qt::black, 4.0);
+    EXPECT_EQ(pixelsOf(stroke, 2.0), QRect(15, 15, 70, 10));
+
+    paintStroke(layer, stroke, Qt::black, 2.0, layer.area(), scratch);
+
+    const QImage &picture = layer.image();
+    EXPECT_EQ(picture.pixelColor(50, 39 - 16), QColor(Qt::black));
+    EXPECT_EQ(picture.pixelColor(50, 39 - 23), QColor(Qt::black));
+    EXPECT_EQ(picture.pixelColor(50, 39 - 15), QColor(Qt::transparent));
+    EXPECT_EQ(picture.pixelColor(50, 39 - 24), QColor(Qt::transparent));
 }
 
 } // namespace

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Distances from a stroke's centre line, to the last fraction of a point.
-#include "canvas/StrokeHitTest.h"
+#include "strokes/StrokeHitTest.h"
 
 #include <penwick/platform/BezierPath.h>
 

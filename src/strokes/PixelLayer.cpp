@@ -1,0 +1,80 @@
+// SPDX-License-Identifier: MIT
+#include "strokes/PixelLayer.h"
+
+#include "strokes/CoverageMask.h"
+
+#include <QColor>
+
+#include <algorithm>
+
+namespace penwick {
+
+namespace {
+
+/// A premultiplied pixel, every channel times `share` of 255, rounded. Two channels at once: each
+/// has sixteen bits of room.
+inline std::uint32_t shareOf(std::uint32_t pixel, std::uint32_t share)
+{
+    constexpr std::uint32_t everySecond = 0x00ff00ff;
+    constexpr std::uint32_t half = 0x00800080;
+    const auto divided
+        = [](std::uint32_t product) { return product + ((product >> 8) & everySecond) + half; };
+    const std::uint32_t lower = divided((pixel & everySecond) * share) >> 8;
+    const std::uint32_t upper = divided(((pixel >> 8) & everySecond) * share);
+    return (lower & everySecond) | (upper & ~everySecond);
+}
+
+} // namespace
+
+PixelLayer::PixelLayer(QSize size)
+    : m_image(size, QImage::Format_ARGB32_Premultiplied)
+{
+    m_image.fill(Qt::transparent);
+}
+
+QRect PixelLayer::inImage(const QRect &area) const
+{
+    return { area.x(), m_image.height() - area.y() - area.height(), area.width(), area.height() };
+}
+
+std::span<std::uint32_t> PixelLayer::row(int x, int y, int width)
+{
+    auto *const line
+        = reinterpret_cast<std::uint32_t *>(m_image.scanLine(m_image.height() - 1 - y));
+    return { line + x, static_cast<std::size_t>(width) };
+}
+
+void PixelLayer::copy(const PixelLayer &other, const QRect &area)
+{
+    const QRect common = area & this->area() & other.area();
+    for (int y = common.y(); y <= common.bottom(); ++y) {
+        const auto *const source = reinterpret_cast<const std::uint32_t *>(
+            other.m_image.constScanLine(other.m_image.height() - 1 - y));
+        std::copy_n(
+            source + common.x(), common.width(), row(common.x(), y, common.width()).begin());
+    }
+}
+
+void PixelLayer::clear(const QRect &area)
+{
+    for (int y = area.y(); y <= area.bottom(); ++y)
+        std::ranges::fill(row(area.x(), y, area.width()), 0U);
+}
+
+void PixelLayer::blend(const CoverageMask &mask, const QColor &color, const QRect &area)
+{
+    constexpr std::uint32_t all = 255;
+    const std::uint32_t ink = qPremultiply(color.rgba());
+    for (int y = area.y(); y <= area.bottom(); ++y) {
+        const auto pixels = row(area.x(), y, area.width());
+        const auto coverage = mask.row(area.x(), y, area.width());
+        for (std::size_t index = 0; index < pixels.size(); ++index) {
+            if (coverage[index] == 0)
+                continue;
+            const std::uint32_t inked = shareOf(ink, coverage[index]);
+            pixels[index] = inked + shareOf(pixels[index], all - (inked >> 24));
+        }
+    }
+}
+
+} // namespace penwick

@@ -1,0 +1,157 @@
+// SPDX-License-Identifier: MIT
+#include "strokes/StrokeIndex.h"
+
+#include "strokes/StrokeHitTest.h"
+
+#include <penwick/platform/BezierPath.h>
+
+#include <boost/geometry.hpp>
+#include <boost/geometry/geometries/box.hpp>
+#include <boost/geometry/geometries/point_xy.hpp>
+#include <boost/geometry/index/rtree.hpp>
+#include <boost/iterator/function_output_iterator.hpp>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace penwick {
+
+using platform::Point;
+using platform::Rect;
+
+namespace {
+
+namespace geometry = boost::geometry;
+
+using TreePoint = geometry::model::d2::point_xy<float>;
+using TreeBox = geometry::model::box<TreePoint>;
+
+constexpr std::size_t strokesOfANode = 16;
+
+// Rounded outwards: the tree may find a stroke too many, never one too few.
+float below(double value)
+{
+    return std::nextafter(static_cast<float>(value), -std::numeric_limits<float>::infinity());
+}
+
+float above(double value)
+{
+    return std::nextafter(static_cast<float>(value), std::numeric_limits<float>::infinity());
+}
+
+} // namespace
+
+class StrokeIndex::Tree
+{
+public:
+    static TreeBox box(const Bounds &bounds)
+    {
+        return { { bounds.left, bounds.bottom }, { bounds.right, bounds.top } };
+    }
+
+    struct BoxOfPlace
+    {
+        using result_type = TreeBox;
+        result_type operator()(const Place &place) const { return box(place.bounds); }
+    };
+    struct SamePlace
+    {
+        bool operator()(const Place &a, const Place &b) const { return a.number == b.number; }
+    };
+    using Places = geometry::index::rtree<Place, geometry::index::quadratic<strokesOfANode>,
+        BoxOfPlace, SamePlace>;
+
+    Places places;
+};
+
+StrokeIndex::StrokeIndex()
+    : m_tree(std::make_unique<Tree>())
+{ }
+
+StrokeIndex::~StrokeIndex() = default;
+
+StrokeIndex::Bounds StrokeIndex::boundsOf(const StrokeEntry &stroke)
+{
+    const Rect bounds
+        = stroke.bPath->controlPointBounds().grownBy(std::max(stroke.bPath->lineWidth() / 2, 0.0));
+    return { below(bounds.x), below(bounds.y), above(bounds.maxX()), above(bounds.maxY()) };
+}
+
+EntryListChange StrokeIndex::changeTo(const EntryList<StrokeEntry> &strokes) const
+{
+    return changeBetween(m_strokes, strokes,
+        [](const StrokeEntry &a, const StrokeEntry &b) { return a.bPath == b.bPath; });
+}
+
+void StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
+{
+    const EntryListChange change = changeTo(strokes);
+    m_strokes = strokes;
+    const int last = change.first + change.added;
+    if (change.added == 0 && last < strokes.size()) {
+        remove(change.first, change.first + change.removed);
+        return;
+    }
+    // The newest has no place, because it may grow; and numbers are given in the list's order.
+    const int wanted = std::max(0, strokes.size() - 1);
+    const int present = static_cast<int>(m_places.size());
+    remove(std::min({ change.first, wanted, present }), present);
+    insert(static_cast<int>(m_places.size()), wanted);
+}
+
+void StrokeIndex::remove(int from, int to)
+{
+    if (from == 0 && to == static_cast<int>(m_places.size()))
+        m_tree->places.clear();
+    for (int index = from; index < to && !m_tree->places.empty(); ++index)
+        m_tree->places.remove(m_places[static_cast<std::size_t>(index)]);
+    m_places.erase(m_places.begin() + from, m_places.begin() + to);
+}
+
+void StrokeIndex::insert(int from, int to)
+{
+    for (int index = from; index < to; ++index)
+        m_places.push_back({ boundsOf(m_strokes[index]), m_nextNumber++ });
+    if (from == 0 && to > 0) {
+        m_tree->places = Tree::Places(m_places); // all at once makes the better tree, and sooner
+        return;
+    }
+    m_tree->places.insert(m_places.begin() + from, m_places.end());
+}
+
+template <class Visit>
+void StrokeIndex::visit(const Rect &area, Visit visit) const
+{
+    const TreeBox box { { below(area.x), below(area.y) },
+        { above(area.maxX()), above(area.maxY()) } };
+    const auto visitPlace = [this, &visit](const Place &place) {
+        const auto found = std::ranges::lower_bound(m_places, place.number, {}, &Place::number);
+        visit(static_cast<int>(found - m_places.begin()));
+    };
+    m_tree->places.query(
+        geometry::index::intersects(box), boost::make_function_output_iterator(visitPlace));
+    const int newest = m_strokes.size() - 1;
+    if (newest >= 0 && geometry::intersects(Tree::box(boundsOf(m_strokes[newest])), box))
+        visit(newest);
+}
+
+std::optional<int> StrokeIndex::oldestAt(Point point) const
+{
+    std::optional<int> oldest;
+    visit({ point.x, point.y, 0.0, 0.0 }, [&](int index) {
+        if ((!oldest || index < *oldest) && strokeContains(*m_strokes[index].bPath, point))
+            oldest = index;
+    });
+    return oldest;
+}
+
+std::vector<int> StrokeIndex::touching(const Rect &area) const
+{
+    std::vector<int> found;
+    visit(area, [&found](int index) { found.push_back(index); });
+    std::ranges::sort(found);
+    return found;
+}
+
+} // namespace penwick

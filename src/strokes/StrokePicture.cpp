@@ -1,0 +1,193 @@
+// SPDX-License-Identifier: MIT
+#include "strokes/StrokePicture.h"
+
+#include "strokes/StrokePainter.h"
+
+#include <penwick/platform/BezierPath.h>
+
+#include <QColor>
+
+namespace penwick {
+
+using platform::Rect;
+
+namespace {
+
+// Layers are a little larger than the canvas, so that resizing it by hand seldom needs new ones.
+constexpr int layerStep = 64; // pixels
+
+// More changes than this at once are painted as one area.
+constexpr int mostApart = 16;
+
+QSize roundedUp(QSize size)
+{
+    const auto up = [](int length) { return (length + layerStep - 1) / layerStep * layerStep; };
+    return { up(size.width()), up(size.height()) };
+}
+
+Rect inPoints(const QRect &pixels, double scale)
+{
+    return { pixels.x() / scale, pixels.y() / scale, pixels.width() / scale,
+        pixels.height() / scale };
+}
+
+} // namespace
+
+QRect StrokePicture::follow(const EntryList<StrokeEntry> &strokes)
+{
+    if (m_finished.area().isEmpty()) { // nothing is painted yet, so there is nothing to mend
+        m_index.follow(strokes);
+        return {};
+    }
+    const QRect grown = addGrowth();
+    const EntryListChange change = m_index.changeTo(strokes);
+    if (change.isNothing())
+        m_index.follow(strokes);
+    else
+        followChange(change, strokes);
+    return grown | addGrowth();
+}
+
+void StrokePicture::followChange(
+    const EntryListChange &change, const EntryList<StrokeEntry> &strokes)
+{
+    int lastGone = change.first + change.removed;
+    if (m_isNewestApart && lastGone == this->strokes().size()) {
+        if (change.removed > 0) {
+            dropNewest(); // which mends its pixels
+            --lastGone;
+        } else {
+            settleNewest();
+        }
+    }
+    mark(change.first, lastGone);
+    m_index.follow(strokes);
+
+    int lastCome = change.first + change.added;
+    const bool isNewestNew = change.added > 0 && lastCome == strokes.size();
+    if (isNewestNew)
+        --lastCome;
+    mark(change.first, lastCome);
+    // Whoever has no colour takes the one before it, and that may be another now.
+    if (lastCome < strokes.size() && !strokes[lastCome].bPathParams.pathColor)
+        m_marked = m_finished.area();
+    if (isNewestNew)
+        takeNewestApart();
+    else if (!m_isNewestApart && !strokes.isEmpty())
+        m_newestElements = strokes.last().bPath->elementCount();
+}
+
+void StrokePicture::mark(int from, int to)
+{
+    QRect all;
+    for (int index = from; index < to; ++index) {
+        const QRect touched = pixelsOf(strokes()[index], m_scale) & m_finished.area();
+        if (to - from <= mostApart)
+            m_marked += touched;
+        else
+            all |= touched;
+    }
+    m_marked += all;
+}
+
+void StrokePicture::takeNewestApart()
+{
+    m_isNewestApart = true;
+    m_newestElements = 0;
+}
+
+void StrokePicture::settleNewest()
+{
+    m_below.copy(m_finished, m_newestArea);
+    m_newest.clear(m_newestArea);
+    m_newestArea = {};
+    m_isNewestApart = false;
+}
+
+void StrokePicture::dropNewest()
+{
+    m_finished.copy(m_below, m_newestArea);
+    m_newest.clear(m_newestArea);
+    m_newestArea = {};
+    m_isNewestApart = false;
+}
+
+QColor StrokePicture::newestColor() const
+{
+    return colorOf(strokes(), strokes().size() - 1);
+}
+
+QRect StrokePicture::addGrowth()
+{
+    if (strokes().isEmpty())
+        return {};
+    const StrokeEntry &newest = strokes().last();
+    const int elements = newest.bPath->elementCount();
+    if (elements == m_newestElements)
+        return {};
+    if (!m_isNewestApart) { // it had been settled, and goes on all the same
+        mark(strokes().size() - 1, strokes().size());
+        takeNewestApart();
+    }
+    const int linesPainted = m_newestElements / 2;
+    m_newestElements = elements;
+    const QRect grown = addStroke(m_newest, newest, m_scale, static_cast<std::size_t>(linesPainted))
+        & m_finished.area();
+    m_newestArea |= grown;
+    m_finished.copy(m_below, grown);
+    m_finished.blend(m_newest, newestColor(), grown);
+    return grown;
+}
+
+void StrokePicture::update(QSize size, double scale)
+{
+    resize(size, scale);
+    addGrowth();
+    paintMarked();
+}
+
+void StrokePicture::resize(QSize size, double scale)
+{
+    const QSize wanted = roundedUp(size);
+    if (wanted == m_finished.area().size() && scale == m_scale)
+        return;
+    if (m_isNewestApart)
+        settleNewest();
+    PixelLayer finished(wanted);
+    if (scale == m_scale) {
+        finished.copy(m_finished, m_finished.area());
+        m_marked += QRegion(finished.area()) - m_finished.area();
+        m_marked &= finished.area();
+    } else {
+        m_marked = finished.area();
+    }
+    m_scale = scale;
+    m_finished = finished;
+    m_below = m_finished;
+    m_newest.reset(m_finished.area());
+    m_newestElements = strokes().isEmpty() ? 0 : strokes().last().bPath->elementCount();
+}
+
+void StrokePicture::paintMarked()
+{
+    for (const QRect &part : m_marked)
+        paintPart(part);
+    m_marked = {};
+}
+
+void StrokePicture::paintPart(const QRect &part)
+{
+    m_below.clear(part);
+    const int settled = strokes().size() - (m_isNewestApart ? 1 : 0);
+    for (const int index : m_index.touching(inPoints(part.adjusted(-1, -1, 1, 1), m_scale))) {
+        if (index < settled)
+            paintStroke(
+                m_below, strokes()[index], colorOf(strokes(), index), m_scale, part, m_scratch);
+    }
+    m_finished.copy(m_below, part);
+    const QRect common = part & m_newestArea;
+    if (m_isNewestApart && !common.isEmpty())
+        m_finished.blend(m_newest, newestColor(), common);
+}
+
+} // namespace penwick

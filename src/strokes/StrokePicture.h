@@ -1,0 +1,61 @@
+// SPDX-License-Identifier: MIT
+// The strokes of a canvas as finished pixels, mended where they change.
+#pragma once
+
+#include "strokes/CoverageMask.h"
+#include "strokes/PixelLayer.h"
+#include "strokes/StrokeIndex.h"
+
+#include <QRect>
+#include <QRegion>
+
+namespace penwick {
+
+/// What a list of strokes looks like, oldest first, each one shape in its colour.
+///
+/// Painting copies finished pixels. A change of the list costs what the strokes that came or went
+/// cover, a segment more of the newest stroke what the segment covers, both whatever else there is;
+/// the pixels are those of painting everything anew. GUI thread only.
+class StrokePicture
+{
+public:
+    /// Takes `strokes` for what is to be seen. To be told of every change, the growth of the newest
+    /// stroke included; no other may grow. Gives the pixels that such growth has changed.
+    QRect follow(const EntryList<StrokeEntry> &strokes);
+
+    /// Brings the pixels up to date for a canvas of `size` device pixels with `scale` pixels a
+    /// point.
+    void update(QSize size, double scale);
+
+    /// The finished pixels, at least as large as the canvas; valid after update().
+    [[nodiscard]] const PixelLayer &pixels() const { return m_finished; }
+
+private:
+    void followChange(const EntryListChange &change, const EntryList<StrokeEntry> &strokes);
+    void mark(int from, int to);
+    void takeNewestApart();
+    void settleNewest();
+    void dropNewest();
+    QRect addGrowth();
+    void resize(QSize size, double scale);
+    void paintMarked();
+    void paintPart(const QRect &part);
+    [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_index.strokes(); }
+    [[nodiscard]] QColor newestColor() const;
+
+    StrokeIndex m_index;
+    double m_scale = 0.0; // pixels a point
+    PixelLayer m_finished;
+    QRegion m_marked; // where strokes came or went since they were painted
+
+    // While the newest stroke grows it is kept apart: its coverage, and what lies below it.
+    bool m_isNewestApart = false;
+    PixelLayer m_below;
+    CoverageMask m_newest;
+    QRect m_newestArea; // what m_newest covers
+    int m_newestElements = 0; // so much of the newest stroke is painted
+
+    CoverageMask m_scratch;
+};
+
+} // namespace penwick

@@ -1,0 +1,109 @@
+// SPDX-License-Identifier: MIT
+// The index against asking every stroke.
+#include "strokes/StrokeIndex.h"
+
+#include "StrokeFixture.h"
+#include "strokes/StrokeHitTest.h"
+
+#include <gtest/gtest.h>
+#include <rapidcheck/gtest.h>
+
+#include <algorithm>
+
+namespace penwick::test {
+namespace {
+
+using platform::Point;
+using platform::Rect;
+
+StrokeEntry lineAt(double y)
+{
+    auto path = std::make_shared<platform::BezierPath>();
+    path->setLineWidth(4.0);
+    path->moveToPoint({ 10, y });
+    path->lineToPoint({ 50, y });
+    const std::int64_t id = path->hash();
+    return { std::move(path), { Point { 50, y }, std::nullopt, Qt::black }, id };
+}
+
+TEST(StrokeIndex, findsTheOldestOfTheStrokesUnderAPointAndTheNewestTooWhichStillGrows)
+{
+    EntryList<StrokeEntry> strokes;
+    for (const double y : { 10.0, 11.0, 40.0 })
+        strokes.append(lineAt(y));
+    StrokeIndex index;
+    index.follow(strokes);
+
+    EXPECT_EQ(index.oldestAt({ 20, 10.5 }), 0);
+    EXPECT_EQ(index.oldestAt({ 20, 12.5 }), 1);
+    EXPECT_EQ(index.oldestAt({ 20, 42 }), 2); // exactly half the thickness away
+    EXPECT_EQ(index.oldestAt({ 20, 42.01 }), std::nullopt);
+    EXPECT_EQ(index.oldestAt({ 60, 41 }), std::nullopt);
+
+    strokes.last().bPath->moveToPoint({ 50, 40 });
+    strokes.last().bPath->lineToPoint({ 90, 40 });
+    EXPECT_EQ(index.oldestAt({ 60, 41 }), 2);
+}
+
+TEST(StrokeIndex, touchingGivesIndicesOldestFirstThicknessIncluded)
+{
+    EntryList<StrokeEntry> strokes;
+    for (const double y : { 40.0, 10.0, 11.0 })
+        strokes.append(lineAt(y));
+    StrokeIndex index;
+    EXPECT_TRUE(index.touching({ 0, 0, 100, 100 }).empty());
+    index.follow(strokes);
+
+    EXPECT_EQ(index.touching({ 0, 0, 100, 100 }), (std::vector { 0, 1, 2 }));
+    EXPECT_EQ(index.touching({ 0, 12.5, 100, 10 }), (std::vector { 2 }));
+    EXPECT_EQ(index.touching({ 0, 30, 100, 8 }), (std::vector { 0 }));
+    EXPECT_TRUE(index.touching({ 0, 20, 100, 10 }).empty());
+}
+
+TEST(StrokeIndex, strokeThatIsNewestAgainMayGrowAgain)
+{
+    EntryList<StrokeEntry> strokes;
+    strokes.append(lineAt(10));
+    strokes.append(lineAt(40));
+    StrokeIndex index;
+    index.follow(strokes);
+    strokes.removeLast();
+    index.follow(strokes);
+
+    strokes.last().bPath->moveToPoint({ 50, 10 });
+    strokes.last().bPath->lineToPoint({ 50, 90 });
+    EXPECT_EQ(index.oldestAt({ 50, 80 }), 0);
+
+    strokes.append(lineAt(70));
+    index.follow(strokes);
+    EXPECT_EQ(index.oldestAt({ 50, 80 }), 0);
+}
+
+RC_GTEST_PROP(StrokeIndexProperties, answersAsAskingEveryStrokeDoes, ())
+{
+    AnyDrawing drawing;
+    StrokeIndex index;
+    const int steps = *rc::gen::inRange(1, 80);
+    for (int step = 0; step < steps; ++step) {
+        drawing.change();
+        index.follow(drawing.strokes());
+
+        const Point point = anyPoint();
+        RC_ASSERT(index.oldestAt(point)
+            == drawing.strokes().firstIndexWhere(
+                [point](const StrokeEntry &entry) { return strokeContains(*entry.bPath, point); }));
+        const Rect area { point.x, point.y, 30, 10 };
+        const std::vector<int> touching = index.touching(area);
+        RC_ASSERT(std::ranges::is_sorted(touching));
+        for (int stroke = 0; stroke < drawing.strokes().size(); ++stroke) {
+            const platform::BezierPath &path = *drawing.strokes()[stroke].bPath;
+            const bool touches
+                = path.controlPointBounds().grownBy(path.lineWidth() / 2).intersects(area);
+            if (touches)
+                RC_ASSERT(std::ranges::binary_search(touching, stroke));
+        }
+    }
+}
+
+} // namespace
+} // namespace penwick::test

@@ -1,0 +1,63 @@
+// SPDX-License-Identifier: MIT
+// Mended pixels against painting everything anew.
+#include "strokes/StrokePicture.h"
+
+#include "StrokeFixture.h"
+#include "strokes/StrokePainter.h"
+
+#include <gtest/gtest.h>
+#include <rapidcheck/gtest.h>
+
+#include <QImage>
+
+namespace penwick::test {
+namespace {
+
+/// Every stroke, oldest first, on nothing.
+QImage paintedAnew(const EntryList<StrokeEntry> &strokes, QSize size, double scale)
+{
+    PixelLayer layer(size);
+    CoverageMask scratch;
+    for (int index = 0; index < strokes.size(); ++index)
+        paintStroke(layer, strokes[index], colorOf(strokes, index), scale, layer.area(), scratch);
+    return layer.image();
+}
+
+QImage shownBy(const StrokePicture &picture, QSize size)
+{
+    return picture.pixels().image().copy(picture.pixels().inImage({ QPoint(), size }));
+}
+
+TEST(StrokePicture, pictureOfNothingIsTransparentAndLargeEnough)
+{
+    StrokePicture picture;
+    picture.update({ 100, 70 }, 1.0);
+
+    EXPECT_GE(picture.pixels().area().width(), 100);
+    EXPECT_GE(picture.pixels().area().height(), 70);
+    EXPECT_EQ(shownBy(picture, { 100, 70 }), paintedAnew({}, { 100, 70 }, 1.0));
+}
+
+RC_GTEST_PROP(StrokePictureProperties, mendedPictureIsTheOnePaintedAnew, ())
+{
+    AnyDrawing drawing;
+    StrokePicture picture;
+    double scale = 1.0;
+    QSize size(side, side);
+    const int steps = *rc::gen::inRange(1, 60);
+    for (int step = 0; step < steps; ++step) {
+        drawing.change();
+        picture.follow(drawing.strokes());
+        if (*rc::gen::inRange(0, 12) == 0)
+            scale = *rc::gen::element(1.0, 1.25, 1.5, 2.0);
+        if (*rc::gen::inRange(0, 8) == 0)
+            size = { *rc::gen::inRange(1, 300), *rc::gen::inRange(1, 300) };
+        if (*rc::gen::inRange(0, 2) == 0) {
+            picture.update(size, scale);
+            RC_ASSERT(shownBy(picture, size) == paintedAnew(drawing.strokes(), size, scale));
+        }
+    }
+}
+
+} // namespace
+} // namespace penwick::test
