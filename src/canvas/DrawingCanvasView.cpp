@@ -200,17 +200,18 @@ void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)
     const QSize size = (QSizeF(QWidget::size()) * scale).toSize();
     m_picture.follow(m_pathArray); // a click may have dropped an entry
     m_picture.update(size, scale);
+    const PixelLayer &pixels = m_picture.pixels();
 
     // A pixel more than marked on every side: what is too much is clipped away.
     const platform::Rect dirty = dirtyRect.grownBy(1.0);
     const QRect area
         = QRectF(dirty.x * scale, dirty.y * scale, dirty.width * scale, dirty.height * scale)
               .toAlignedRect()
-        & QRect(QPoint(), size);
+        & QRect(QPoint(), size) & pixels.area();
     QPainter painter(&surface());
     painter.scale(1 / scale, 1 / scale); // pixel for pixel, no matter how many make a point
-    painter.drawImage(QPoint(area.x(), size.height() - area.y() - area.height()),
-        m_picture.pixels().image(), m_picture.pixels().inImage(area));
+    painter.drawImage(QPoint(area.x(), size.height() - area.y() - area.height()), pixels.image(),
+        pixels.inImage(area));
 }
 
 void DrawingCanvasView::draw(const platform::Rect &dirtyRect)

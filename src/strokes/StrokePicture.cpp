@@ -35,9 +35,11 @@ Rect inPoints(const QRect &pixels, double scale)
 
 QRect StrokePicture::follow(const EntryList<StrokeEntry> &strokes)
 {
+    if (strokes.isEmpty())
+        forgetPixels();
     if (m_finished.area().isEmpty()) { // nothing is painted yet, so there is nothing to mend
         m_index.follow(strokes);
-        return {};
+        return strokes.isEmpty() ? QRect() : pixelsOf(strokes.last(), m_scale);
     }
     const QRect grown = addGrowth();
     const EntryListChange change = m_index.changeTo(strokes);
@@ -141,9 +143,23 @@ QRect StrokePicture::addGrowth()
 
 void StrokePicture::update(QSize size, double scale)
 {
+    if (strokes().isEmpty()) {
+        m_scale = scale;
+        return;
+    }
     resize(size, scale);
     addGrowth();
     paintMarked();
+}
+
+void StrokePicture::forgetPixels()
+{
+    m_finished = {};
+    m_below = {};
+    m_newest = {};
+    m_newestArea = {};
+    m_isNewestApart = false;
+    m_marked = {};
 }
 
 void StrokePicture::resize(QSize size, double scale)
@@ -151,21 +167,22 @@ void StrokePicture::resize(QSize size, double scale)
     const QSize wanted = roundedUp(size);
     if (wanted == m_finished.area().size() && scale == m_scale)
         return;
-    if (m_isNewestApart)
-        settleNewest();
     PixelLayer finished(wanted);
-    if (scale == m_scale) {
+    if (scale == m_scale && !m_finished.area().isEmpty()) {
+        if (m_isNewestApart)
+            settleNewest();
         finished.copy(m_finished, m_finished.area());
         m_marked += QRegion(finished.area()) - m_finished.area();
         m_marked &= finished.area();
     } else {
+        m_newestArea = {};
         m_marked = finished.area();
+        takeNewestApart();
     }
     m_scale = scale;
     m_finished = finished;
     m_below = m_finished;
     m_newest.reset(m_finished.area());
-    m_newestElements = strokes().isEmpty() ? 0 : strokes().last().bPath->elementCount();
 }
 
 void StrokePicture::paintMarked()

@@ -27,7 +27,8 @@ public:
     /// point.
     void update(QSize size, double scale);
 
-    /// The finished pixels, at least as large as the canvas; valid after update().
+    /// The finished pixels, at least as large as the canvas, after update(); none at all where
+    /// there are no strokes.
     [[nodiscard]] const PixelLayer &pixels() const { return m_finished; }
 
 private:
@@ -37,6 +38,7 @@ private:
     void settleNewest();
     void dropNewest();
     QRect addGrowth();
+    void forgetPixels();
     void resize(QSize size, double scale);
     void paintMarked();
     void paintPart(const QRect &part);

@@ -70,6 +70,22 @@ TEST_F(DrawingCanvasViewTest, strokesOpacityIsSevenTenthsWhateverTheColoursOwn)
     EXPECT_NEAR(model().pathArray().last().bPathParams.pathColor->alphaF(), 0.7, 1e-4);
 }
 
+TEST_F(DrawingCanvasViewTest, hairlineMarksItsSmoothEdgeWhichIsWiderThanItsBoxGrownByTheWidth)
+{
+    canvas->setBrushThickness(0.5);
+    settle();
+    PaintRecorder painted(*canvas);
+
+    press({ 50.5, 60.5 });
+    drag({ 80.5, 60.5 });
+    settle();
+    EXPECT_EQ(painted.take(), (std::vector<QRect> { { 49, 200 - 62, 33, 3 } }));
+
+    drag({ 80.5, 70.5 });
+    settle();
+    EXPECT_EQ(painted.take(), (std::vector<QRect> { { 79, 200 - 72, 3, 13 } }));
+}
+
 TEST_F(DrawingCanvasViewTest, eachBrushDragAddsASegmentAndMarksOnlyItsBoxGrownByTheWidth)
 {
     window.makeFirstResponder(canvas);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Strokes at random places, for properties that must hold for every drawing.
+// Strokes: a plain one, and any at random places for properties that hold for every drawing.
 #pragma once
 
 #include "history/CanvasContent.h"
@@ -16,6 +16,17 @@
 namespace penwick::test {
 
 constexpr int side = 120; // points; strokes also leave it
+
+/// A horizontal stroke, four points thick.
+inline StrokeEntry lineAt(double y)
+{
+    auto path = std::make_shared<platform::BezierPath>();
+    path->setLineWidth(4.0);
+    path->moveToPoint({ 10, y });
+    path->lineToPoint({ 50, y });
+    const std::int64_t id = path->hash();
+    return { std::move(path), { platform::Point { 50, y }, std::nullopt, Qt::black }, id };
+}
 
 inline platform::Point anyPoint()
 {

@@ -16,16 +16,6 @@ namespace {
 using platform::Point;
 using platform::Rect;
 
-StrokeEntry lineAt(double y)
-{
-    auto path = std::make_shared<platform::BezierPath>();
-    path->setLineWidth(4.0);
-    path->moveToPoint({ 10, y });
-    path->lineToPoint({ 50, y });
-    const std::int64_t id = path->hash();
-    return { std::move(path), { Point { 50, y }, std::nullopt, Qt::black }, id };
-}
-
 TEST(StrokeIndex, findsTheOldestOfTheStrokesUnderAPointAndTheNewestTooWhichStillGrows)
 {
     EntryList<StrokeEntry> strokes;
