@@ -15,11 +15,17 @@ constexpr int borderWidth = 3;
 
 } // namespace
 
-void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments,
+void BoardTest::start(const std::vector<std::string> &arguments, HostProgram program,
     const std::vector<std::string> &variables)
 {
     m_host = std::make_unique<HostProcess>(m_desktop, arguments, program, variables);
     m_host->waitForWindow(QStringLiteral("drawing"));
+}
+
+void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments,
+    const std::vector<std::string> &variables)
+{
+    start(arguments, program, variables);
     waitForLevel(canvas().center() - canvas().topLeft(), 255);
     static_cast<void>(toolBar());
 }
@@ -145,6 +151,11 @@ int BoardTest::darkest(const QImage &image)
             level = std::min(level, qGray(image.pixel(x, y)));
     }
     return level;
+}
+
+std::string managerName(const testing::TestParamInfo<WindowManager> &manager)
+{
+    return manager.param == WindowManager::Xfwm4 ? "xfwm4" : "openbox";
 }
 
 } // namespace penwick::desktop

@@ -17,11 +17,20 @@ namespace penwick::desktop {
 class BoardTest : public testing::Test
 {
 protected:
+    explicit BoardTest(
+        WindowManager windowManager = WindowManager::Openbox, QSize screenSize = { 1280, 800 })
+        : m_desktop(windowManager, screenSize)
+    { }
+
     /// What the brush leaves on white: (41, 41, 41) at alpha 0.7, in each channel.
     static constexpr int inkOnWhite = 105;
     /// The same where two strokes cross.
     static constexpr int inkOnInk = 60;
 
+    /// Opens a drawing window, by default a white board, and returns once it is shown and at rest.
+    void start(const std::vector<std::string> &arguments = {},
+        HostProgram program = HostProgram::AsShipped,
+        const std::vector<std::string> &variables = {});
     /// Opens a white board and returns once it can be seen.
     void open(HostProgram program = HostProgram::AsShipped,
         const std::vector<std::string> &arguments = {},
@@ -68,5 +77,17 @@ private:
     std::unique_ptr<HostProcess> m_host;
     int m_settlingStrokes = 0;
 };
+
+/// Base of the tests that run under each window manager.
+class BoardUnderEachManager : public BoardTest, public testing::WithParamInterface<WindowManager>
+{
+protected:
+    explicit BoardUnderEachManager(QSize screenSize = { 1280, 800 })
+        : BoardTest(GetParam(), screenSize)
+    { }
+};
+
+/// The name of a window manager in that of a test.
+[[nodiscard]] std::string managerName(const testing::TestParamInfo<WindowManager> &manager);
 
 } // namespace penwick::desktop

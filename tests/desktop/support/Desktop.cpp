@@ -42,6 +42,7 @@ Desktop::Desktop(WindowManager windowManager, QSize screenSize)
 Desktop::~Desktop()
 {
     // The server last: a client that loses its server complains.
+    m_compositor.reset();
     m_windowManager.reset();
     m_bus.reset();
     m_connection.reset();
@@ -91,6 +92,26 @@ void Desktop::startServer(QSize screenSize)
     if (!number)
         throw std::runtime_error("the X server ended at once");
     m_displayName = ':' + *number;
+}
+
+void Desktop::startCompositor()
+{
+    // No settings of anybody's: a shadow or a fading window would change the pixels.
+    m_compositor = std::make_unique<ChildProcess>(
+        ChildProcess::Command { { "picom", "--config", "/dev/null", "--backend", "xrender" },
+            environment(), file("compositor.log") });
+    require(
+        [this] {
+            return m_compositor->exitStatus() || m_connection->hasSelectionOwner("_NET_WM_CM_S0");
+        },
+        "a compositing manager");
+    if (m_compositor->exitStatus())
+        throw std::runtime_error("picom ended at once");
+}
+
+void Desktop::splitInto(const std::vector<QRect> &monitors)
+{
+    m_connection->setMonitors(monitors);
 }
 
 const std::string &Desktop::sessionBus()

@@ -8,6 +8,7 @@
 #include "desktop/support/Screen.h"
 #include "desktop/support/Windows.h"
 
+#include <QRect>
 #include <QSize>
 #include <QTemporaryDir>
 
@@ -47,6 +48,11 @@ public:
     /// A name for a file in the desktop's own folder.
     [[nodiscard]] std::string file(const std::string &name) const;
 
+    /// Starts a compositing manager, and returns once it is one. Throws like the constructor.
+    void startCompositor();
+    /// Makes monitors of these parts of the screen, the first one the primary one.
+    void splitInto(const std::vector<QRect> &monitors);
+
     [[nodiscard]] Pointer &pointer() { return *m_pointer; }
     [[nodiscard]] Keyboard &keyboard() { return *m_keyboard; }
     [[nodiscard]] const Screen &screen() const { return *m_screen; }
@@ -64,6 +70,7 @@ private:
     std::unique_ptr<ChildProcess> m_server;
     std::unique_ptr<ChildProcess> m_bus;
     std::unique_ptr<ChildProcess> m_windowManager;
+    std::unique_ptr<ChildProcess> m_compositor;
     std::unique_ptr<XConnection> m_connection;
     std::unique_ptr<Pointer> m_pointer;
     std::unique_ptr<Keyboard> m_keyboard;

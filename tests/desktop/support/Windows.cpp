@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "desktop/support/Windows.h"
 
+#include "desktop/support/WaitUntil.h"
 #include "desktop/support/XConnection.h"
 
 #include <X11/Xlib.h>
@@ -138,7 +139,10 @@ std::vector<unsigned long> Windows::numbers(WindowId window, const char *propert
 {
     const Property found = read(m_connection, window, property, 32);
     const auto *const first = reinterpret_cast<const unsigned long *>(found.data.get());
-    return { first, first + found.count };
+    std::vector<unsigned long> numbers(first, first + found.count);
+    for (unsigned long &number : numbers)
+        number &= 0xFFFFFFFFU; // handed out as signed ones, in longs
+    return numbers;
 }
 
 std::optional<QString> Windows::text(WindowId window, const char *property) const
@@ -148,6 +152,18 @@ std::optional<QString> Windows::text(WindowId window, const char *property) cons
         return std::nullopt;
     return QString::fromUtf8(
         reinterpret_cast<const char *>(found.data.get()), static_cast<qsizetype>(found.count));
+}
+
+std::vector<std::string> Windows::atoms(WindowId window, const char *property) const
+{
+    std::vector<std::string> names;
+    for (const Atom atom : numbers(window, property)) {
+        const std::unique_ptr<char, int (*)(void *)> name(
+            XGetAtomName(m_connection.display(), atom), &XFree);
+        if (name)
+            names.emplace_back(name.get());
+    }
+    return names;
 }
 
 WindowId Windows::root() const
@@ -168,6 +184,16 @@ void Windows::minimise(WindowId window)
 void Windows::activate(WindowId window)
 {
     ask(window, "_NET_ACTIVE_WINDOW", askedByUser, CurrentTime);
+}
+
+void Windows::switchToDesktop(unsigned long number)
+{
+    ask(root(), "_NET_CURRENT_DESKTOP", static_cast<long>(number), CurrentTime);
+    require(
+        [&] {
+            return numbers(root(), "_NET_CURRENT_DESKTOP") == std::vector<unsigned long> { number };
+        },
+        "another virtual desktop");
 }
 
 void Windows::ask(WindowId window, const char *what, long first, long second)

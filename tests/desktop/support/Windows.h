@@ -6,6 +6,7 @@
 #include <QString>
 
 #include <optional>
+#include <string>
 #include <vector>
 
 namespace penwick::desktop {
@@ -36,6 +37,8 @@ public:
     [[nodiscard]] std::vector<unsigned long> numbers(WindowId window, const char *property) const;
     /// The same as text, for an 8-bit property.
     [[nodiscard]] std::optional<QString> text(WindowId window, const char *property) const;
+    /// The names of a property's atoms, in no order that means anything.
+    [[nodiscard]] std::vector<std::string> atoms(WindowId window, const char *property) const;
     [[nodiscard]] WindowId root() const;
 
     /// What a press on the title bar's close button asks for.
@@ -44,6 +47,8 @@ public:
     void minimise(WindowId window);
     /// Brings a minimised window back, and any window to the front.
     void activate(WindowId window);
+    /// Goes to another virtual desktop, counted from 0, and returns once it is the present one.
+    void switchToDesktop(unsigned long number);
     /// Whether the server shows the window, be it covered or not.
     [[nodiscard]] bool isShown(WindowId window) const;
 

@@ -3,8 +3,13 @@
 
 #include "desktop/support/WaitUntil.h"
 
+#include <QRect>
+
 #include <X11/Xlib.h>
 
+#include <X11/extensions/Xrandr.h>
+
+#include <memory>
 #include <stdexcept>
 
 namespace penwick::desktop {
@@ -30,6 +35,37 @@ unsigned long XConnection::root() const
 unsigned long XConnection::atom(const char *name) const
 {
     return XInternAtom(m_display, name, False);
+}
+
+bool XConnection::hasSelectionOwner(const char *name) const
+{
+    return XGetSelectionOwner(m_display, atom(name)) != None;
+}
+
+void XConnection::setMonitors(const std::vector<QRect> &monitors) const
+{
+    const std::unique_ptr<XRRScreenResources, decltype(&XRRFreeScreenResources)> resources(
+        XRRGetScreenResources(m_display, root()), &XRRFreeScreenResources);
+    if (!resources || resources->noutput == 0)
+        throw std::runtime_error("the X server has no monitor");
+    for (const QRect &area : monitors) {
+        const std::string name = "monitor" + std::to_string(&area - monitors.data());
+        const bool isFirst = &area == &monitors.front();
+        XRRMonitorInfo monitor {};
+        monitor.name = atom(name.c_str());
+        monitor.primary = isFirst ? True : False;
+        monitor.x = area.x();
+        monitor.y = area.y();
+        monitor.width = area.width();
+        monitor.height = area.height();
+        monitor.mwidth = area.width() / 4; // about 96 pixels an inch
+        monitor.mheight = area.height() / 4;
+        // The first takes the server's only output away from the monitor that it had been.
+        monitor.noutput = isFirst ? 1 : 0;
+        monitor.outputs = resources->outputs;
+        XRRSetMonitor(m_display, root(), &monitor);
+    }
+    finish();
 }
 
 void XConnection::finish() const

@@ -4,7 +4,9 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
+class QRect;
 struct _XDisplay; // X's own name for what a Display points at
 
 namespace penwick::desktop {
@@ -23,6 +25,12 @@ public:
     [[nodiscard]] _XDisplay *display() const { return m_display; }
     [[nodiscard]] unsigned long root() const;
     [[nodiscard]] unsigned long atom(const char *name) const;
+
+    /// Whether some program holds the selection called `name`.
+    [[nodiscard]] bool hasSelectionOwner(const char *name) const;
+
+    /// Replaces the server's one monitor by these, the first one the primary one.
+    void setMonitors(const std::vector<QRect> &monitors) const;
 
     /// Returns once the server has done everything asked so far.
     void finish() const;
