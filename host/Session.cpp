@@ -41,7 +41,7 @@ bool Session::open(const Options &options, QScreen &screen, const std::optional<
     if (QWindow *const window = m_controller->drawingWindow()->windowHandle()) {
         window->installEventFilter(this);
         if (window->isExposed())
-            announceSharing();
+            announceOnceSeen();
     }
     for (const StartCall &startCall : options.startCalls)
         call(startCall);
@@ -50,9 +50,8 @@ bool Session::open(const Options &options, QScreen &screen, const std::optional<
 
 void Session::call(const StartCall &call)
 {
-    QObject *const window = m_controller ? m_controller->drawingWindow() : nullptr;
     QObject *const controller
-        = window ? window->findChild<QObject *>(QStringLiteral("drawViewController")) : nullptr;
+        = window() ? window()->findChild<QObject *>(QStringLiteral("drawViewController")) : nullptr;
     if (!controller) {
         qWarning("penwick-host: there is no draw view controller to call");
         return;
@@ -67,27 +66,42 @@ bool Session::eventFilter(QObject *watched, QEvent *event)
 {
     // The first exposure: from now on the window can be seen, and so can a banner over it.
     if (event->type() == QEvent::Expose)
-        announceSharing();
+        announceOnceSeen();
     return QObject::eventFilter(watched, event);
 }
 
-void Session::announceSharing()
+void Session::announceOnceSeen()
 {
-    if (!std::exchange(m_announcesSharing, false))
-        return;
-    QMetaObject::invokeMethod(
-        this,
-        [this] {
-            if (m_penwick)
-                m_penwick->showWindowSharingNotification();
-        },
-        Qt::QueuedConnection);
+    if (std::exchange(m_announcesSharing, false))
+        QMetaObject::invokeMethod(this, &Session::announce, Qt::QueuedConnection);
+}
+
+void Session::announce()
+{
+    if (m_penwick)
+        m_penwick->showWindowSharingNotification();
+}
+
+void Session::close()
+{
+    if (platform::Window *const open = window())
+        open->close();
+}
+
+void Session::letGo()
+{
+    m_controller.reset();
+    m_penwick.reset();
+}
+
+platform::Window *Session::window() const
+{
+    return m_controller ? m_controller->drawingWindow() : nullptr;
 }
 
 void Session::end()
 {
-    m_controller.reset();
-    m_penwick.reset();
+    letGo();
     QCoreApplication::quit();
 }
 

@@ -24,8 +24,8 @@ public:
     Session();
     ~Session() override;
 
-    /// Opens the window as `options` say, on `screen`. Returns whether it is there; if it is not,
-    /// the component has printed why.
+    /// Opens the window as `options` say, on `screen`, in place of one that is open. Returns
+    /// whether it is there; if it is not, the component has printed why.
     [[nodiscard]] bool open(
         const Options &options, QScreen &screen, const std::optional<QImage> &image);
 
@@ -33,10 +33,19 @@ public:
     /// it only says so on standard error.
     void call(const StartCall &call);
 
+    /// Shows now that the window is being shared.
+    void announce();
+    /// Closes the window, which ends the session.
+    void close();
+    /// Lets go of the component. A session that has not ended will not end.
+    void letGo();
+    /// The drawing window; null without one.
+    [[nodiscard]] platform::Window *window() const;
+
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
-    void announceSharing();
+    void announceOnceSeen();
     void end();
 
     std::unique_ptr<Penwick> m_penwick;

@@ -1,9 +1,19 @@
 // SPDX-License-Identifier: MIT
-// penwick-host with a way to choose tools while it runs: "tool NAME" and "option NAME#VALUE" lines
-// on standard input, each answered by a line once it has been done.
+// penwick-host that takes orders while it runs: lines on standard input, each answered by a line
+// once it has been carried out.
+//   tool NAME, option NAME#VALUE   chooses, as the tool bar would
+//   announce                       shows that the window is being shared
+//   close                          closes the window
+//   let-go-at-end                  from now on lets go of the component inside the news of the end
+//   open KIND [WIDTHxHEIGHT]       opens another window instead, on an image of that size
+//   open-nowhere                   opens a window on no screen at all
+//   arrow                          gives the canvas the arrow for its pointer, behind its back
 #include "host/Host.h"
 #include "host/Session.h"
 
+#include <penwick/platform/NotificationCenter.h>
+
+#include <QGuiApplication>
 #include <QSocketNotifier>
 
 #include <array>
@@ -13,8 +23,11 @@
 
 namespace {
 
+using penwick::host::Options;
 using penwick::host::Session;
 using penwick::host::StartCall;
+using penwick::platform::Notification;
+using penwick::platform::NotificationCenter;
 
 class Steering final : public QObject
 {
@@ -25,6 +38,8 @@ public:
     {
         connect(&m_input, &QSocketNotifier::activated, this, [this] { readInput(); });
     }
+
+    ~Steering() override { NotificationCenter::defaultCenter().removeObserver(this); }
 
 private:
     void readInput()
@@ -37,21 +52,64 @@ private:
         }
         m_unread.append(buffer.data(), count);
         for (qsizetype end = 0; (end = m_unread.indexOf('\n')) >= 0;) {
-            const QByteArray line = m_unread.left(end);
+            const QString line = QString::fromUtf8(m_unread.left(end));
             m_unread.remove(0, end + 1);
-            obey(QString::fromUtf8(line));
+            obey(line.section(QLatin1Char(' '), 0, 0), line.section(QLatin1Char(' '), 1));
+            std::puts("{\"event\":\"called\"}");
+            std::fflush(stdout);
         }
     }
 
-    void obey(const QString &line)
+    void obey(const QString &order, const QString &rest)
     {
         using Operation = StartCall::Operation;
-        const Operation operation = line.startsWith(QLatin1String("tool "))
-            ? Operation::ToolSelection
-            : Operation::ToolOptionSelection;
-        m_session.call({ operation, line.section(QLatin1Char(' '), 1) });
-        std::puts("{\"event\":\"called\"}");
-        std::fflush(stdout);
+        if (order == QLatin1String("tool"))
+            m_session.call({ Operation::ToolSelection, rest });
+        else if (order == QLatin1String("option"))
+            m_session.call({ Operation::ToolOptionSelection, rest });
+        else if (order == QLatin1String("announce"))
+            m_session.announce();
+        else if (order == QLatin1String("close"))
+            m_session.close();
+        else if (order == QLatin1String("let-go-at-end"))
+            letGoAtEnd();
+        else if (order == QLatin1String("open"))
+            open(rest);
+        else if (order == QLatin1String("open-nowhere"))
+            penwick::Penwick().createDrawingWindowController(
+                penwick::WindowType::whiteboard, nullptr);
+        else if (order == QLatin1String("arrow"))
+            m_session.window()
+                ->findChild<QWidget *>(QStringLiteral("drawingView"))
+                ->setCursor(Qt::ArrowCursor);
+        else
+            qWarning("no such order: %s", qUtf8Printable(order));
+    }
+
+    void letGoAtEnd()
+    {
+        NotificationCenter::defaultCenter().addObserver(this,
+            penwick::penwickSessionEndNotificationKey(),
+            [this](const Notification &) { m_session.letGo(); });
+    }
+
+    void open(const QString &what)
+    {
+        Options options;
+        const QString kind = what.section(QLatin1Char(' '), 0, 0);
+        if (kind == QLatin1String("annotation"))
+            options.windowType = penwick::WindowType::annotation;
+        else if (kind == QLatin1String("imageAnnotation"))
+            options.windowType = penwick::WindowType::imageAnnotation;
+        const QString size = what.section(QLatin1Char(' '), 1);
+        QImage image;
+        if (!size.isEmpty()) {
+            image = QImage(size.section(QLatin1Char('x'), 0, 0).toInt(),
+                size.section(QLatin1Char('x'), 1).toInt(), QImage::Format_RGB32);
+            image.fill(Qt::white);
+        }
+        if (!m_session.open(options, *QGuiApplication::primaryScreen(), image))
+            qWarning("no window");
     }
 
     Session &m_session;

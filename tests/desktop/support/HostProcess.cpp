@@ -79,16 +79,6 @@ int HostProcess::waitForExit(std::chrono::milliseconds bound)
     return *m_process.exitStatus();
 }
 
-void HostProcess::selectTool(const QString &name)
-{
-    steer(QStringLiteral("tool ") + name);
-}
-
-void HostProcess::selectToolOption(const QString &option)
-{
-    steer(QStringLiteral("option ") + option);
-}
-
 const std::vector<PostedNotification> &HostProcess::notifications()
 {
     takeLines();
@@ -142,16 +132,16 @@ void HostProcess::takeEvent(const QJsonObject &event)
     }
 }
 
-void HostProcess::steer(const QString &command)
+void HostProcess::steer(const QString &order)
 {
     const int before = m_callsDone;
-    m_process.writeLine(command.toStdString());
+    m_process.writeLine(order.toStdString());
     requireWhileRunning(
         [&] {
             takeLines();
             return m_callsDone > before;
         },
-        command);
+        order);
 }
 
 template <class Condition>

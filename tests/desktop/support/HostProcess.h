@@ -61,10 +61,12 @@ public:
     /// Waits until it has ended and returns the status, 128 + signal after a signal.
     int waitForExit(std::chrono::milliseconds bound = generousBound);
 
-    /// Chooses a tool or an option in the running program, as its tool bar would, and returns once
-    /// it has been done. Needs the steered program.
-    void selectTool(const QString &name);
-    void selectToolOption(const QString &option);
+    /// Gives the running program an order, as steered/main.cpp lists them, and returns once it has
+    /// been carried out. Needs the steered program.
+    void steer(const QString &order);
+    /// Chooses a tool or an option in it, as its tool bar would.
+    void selectTool(const QString &name) { steer(QStringLiteral("tool ") + name); }
+    void selectToolOption(const QString &option) { steer(QStringLiteral("option ") + option); }
 
     [[nodiscard]] const std::vector<PostedNotification> &notifications();
     /// The state of the window called `name` that was written last; an invisible one before that.
@@ -77,7 +79,6 @@ public:
 private:
     void takeLines();
     void takeEvent(const QJsonObject &event);
-    void steer(const QString &command);
     template <class Condition>
     void requireWhileRunning(Condition &&condition, const QString &what);
 

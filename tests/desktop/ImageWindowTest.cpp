@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: MIT
+// The layer over a still image: how large its window is, and where the image lies in it.
+#include "desktop/support/BoardFixture.h"
+
+#include <cmath>
+
+namespace penwick::desktop {
+
+namespace {
+
+constexpr QColor photoFrame { 128, 128, 128 };
+
+class ImageWindow : public BoardUnderEachManager
+{
+protected:
+    static constexpr int border = 3;
+
+    /// A picture in which no two places near each other look the same.
+    static QImage pictureOf(QSize size)
+    {
+        QImage image(size, QImage::Format_RGB32);
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x)
+                image.setPixel(x, y, qRgb(x % 256, y % 256, (x / 256) * 40 + (y / 256) * 20 + 60));
+        }
+        return image;
+    }
+
+    void startOn(const QImage &image, const std::vector<std::string> &others = {})
+    {
+        const std::string file = desktop().file("picture.png");
+        ASSERT_TRUE(image.save(QString::fromStdString(file)));
+        std::vector<std::string> arguments { "--window", "imageAnnotation", "--image", file };
+        arguments.insert(arguments.end(), others.begin(), others.end());
+        start(arguments);
+        static_cast<void>(toolBar());
+    }
+
+    /// Where on the screen the image's top left corner must lie: its bottom left one is the
+    /// canvas's.
+    [[nodiscard]] QPoint cornerOf(const QImage &image)
+    {
+        return canvas().bottomLeft() - QPoint(0, image.height() - 1);
+    }
+
+    /// The part of the canvas where nothing lies over the image.
+    [[nodiscard]] QRect clearArea()
+    {
+        QRect area = canvas().adjusted(border, border, -border, -border);
+        area.setLeft(toolBar().frame.right() + 10);
+        return area;
+    }
+
+    [[nodiscard]] bool comesToShow(const QImage &image)
+    {
+        const QRect area = clearArea() & QRect(cornerOf(image), image.size());
+        return waitUntil([&] {
+            return desktop().screen().picture(area)
+                == image.copy(area.translated(-cornerOf(image)))
+                       .convertToFormat(QImage::Format_RGB32);
+        });
+    }
+};
+
+} // namespace
+
+TEST_P(ImageWindow, outerFrameIsAsLargeAsTheImage)
+{
+    startOn(pictureOf({ 600, 400 }));
+
+    // A sixth of the screen from its left and bottom edges.
+    EXPECT_EQ(desktop().windows().outerFrame(window()), QRect(213, 267, 600, 400));
+    EXPECT_EQ(host().window(QStringLiteral("drawing")).frame, QRect(213, 267, 600, 400));
+}
+
+TEST_P(ImageWindow, imageLiesInTheCanvassBottomLeftCornerAtItsOwnSize)
+{
+    const QImage image = pictureOf({ 600, 400 });
+    startOn(image);
+
+    EXPECT_TRUE(comesToShow(image));
+}
+
+TEST_P(ImageWindow, hasTheTitleThatTheHostGave)
+{
+    startOn(pictureOf({ 600, 400 }), { "--title", "A captured frame" });
+    EXPECT_EQ(desktop().windows().title(window()), QStringLiteral("A captured frame"));
+}
+
+TEST_P(ImageWindow, withoutATitleHasTheBoards)
+{
+    startOn(pictureOf({ 600, 400 }));
+    EXPECT_EQ(desktop().windows().title(window()), QStringLiteral("Tarnhill Whiteboard"));
+}
+
+TEST_P(ImageWindow, strokeLiesOverTheImage)
+{
+    QImage image(600, 400, QImage::Format_RGB32);
+    image.fill(QColor(200, 100, 0));
+    startOn(image);
+    ASSERT_TRUE(comesToShow(image));
+
+    drag({ { 200, 150 }, { 400, 150 } });
+
+    const auto seen = [this] { return desktop().screen().pixel(onScreen({ 300, 150 })); };
+    const QColor wanted(89, 59, 29); // (41, 41, 41) at alpha 0.7
+    EXPECT_TRUE(waitUntil([&] {
+        return std::abs(seen().red() - wanted.red()) <= 1
+            && std::abs(seen().green() - wanted.green()) <= 1
+            && std::abs(seen().blue() - wanted.blue()) <= 1;
+    }));
+}
+
+TEST_P(ImageWindow, keepsTheImageInItsCornerWhenTheUserMakesItLargerAndShowsThePhotosFrame)
+{
+    const QImage image = pictureOf({ 480, 270 });
+    startOn(image);
+    const QRect before = desktop().windows().outerFrame(window());
+
+    desktop().pointer().drag(
+        { before.bottomRight() - QPoint(2, 2), before.bottomRight() + QPoint(158, 88) });
+
+    ASSERT_TRUE(waitUntil([&] { return canvas().width() > 600; }));
+    const auto frame
+        = [&](QPoint fromCorner) { return desktop().screen().pixel(cornerOf(image) + fromCorner); };
+    EXPECT_TRUE(waitUntil([&] { return frame({ 479, 150 }) == photoFrame; }));
+    EXPECT_EQ(frame({ 300, 0 }), photoFrame);
+    EXPECT_EQ(frame({ 480, 150 }), QColor(Qt::white));
+    EXPECT_EQ(frame({ 300, -1 }), QColor(Qt::white));
+    const QRect inside = clearArea() & QRect(cornerOf(image), image.size()).adjusted(1, 1, -1, -1);
+    EXPECT_EQ(desktop().screen().picture(inside), image.copy(inside.translated(-cornerOf(image))));
+}
+
+INSTANTIATE_TEST_SUITE_P(WindowManagers, ImageWindow,
+    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+
+} // namespace penwick::desktop
