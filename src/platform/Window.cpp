@@ -43,6 +43,7 @@ public:
     BackgroundDrag drag;
     bool isClosed = false;
     bool isMain = false;
+    bool isMinimised = false;
     bool isContentBorrowed = false;
 };
 
@@ -81,10 +82,8 @@ Rect Window::frame() const
 
 void Window::setFrame(const Rect &frame, Animate animate)
 {
-    if (animate == Animate::Yes && isVisible() && !(frame == d->tracker->frame())) {
-        d->glide->start(frame);
-        return;
-    }
+    if (animate == Animate::Yes && isVisible() && !(frame == d->tracker->frame()))
+        return d->glide->start(frame);
     d->glide->stop();
     d->tracker->request(frame);
 }
@@ -263,8 +262,11 @@ std::vector<Window *> Window::childWindows() const
 void Window::showFamily()
 {
     for (Window *const child : childWindows()) {
-        if (child->d->family.isOrderedIn() && !child->isVisible())
-            child->show();
+        if (!child->d->family.isOrderedIn() || child->isVisible())
+            continue;
+        // Some desktops had minimised it together with this one before it was hidden.
+        child->setWindowState(child->windowState() & ~Qt::WindowMinimized);
+        child->show();
     }
 }
 
@@ -281,11 +283,6 @@ void Window::orderFront()
 {
     show();
     raise();
-}
-
-void Window::orderOut()
-{
-    hide();
 }
 
 void Window::orderIn()
@@ -326,6 +323,9 @@ void Window::changeEvent(QEvent *event)
     if (event->type() == QEvent::ActivationChange && std::exchange(d->isMain, isActiveWindow())
         && !isActiveWindow())
         tellDelegate(&WindowDelegate::windowDidResignMain);
+    // Not every desktop takes along what is on all its virtual desktops.
+    if (std::exchange(d->isMinimised, isMinimized()) != isMinimized() && isVisible())
+        isMinimized() ? hideFamily() : showFamily();
 }
 
 void Window::closeEvent(QCloseEvent *event)

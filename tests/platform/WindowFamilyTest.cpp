@@ -185,6 +185,29 @@ TEST_F(WindowFamily, hiddenWindowTakesItsFamilyAndBringsItBack)
     EXPECT_EQ(visible(), all);
 }
 
+TEST_F(WindowFamily, minimisedWindowTakesItsFamilyAndBringsItBack)
+{
+    const std::vector<bool> onlyMinimised { true, false, false };
+    showAll();
+
+    m_window.showMinimized();
+    EXPECT_EQ(visible(), onlyMinimised);
+
+    m_window.showNormal();
+    EXPECT_EQ(visible(), all);
+}
+
+TEST_F(WindowFamily, whatWasHiddenBeforeItWasMinimisedStaysHidden)
+{
+    showAll();
+    m_grandchild.orderOut();
+
+    m_window.showMinimized();
+    m_window.showNormal();
+
+    EXPECT_EQ(visible(), (std::vector<bool> { true, true, false }));
+}
+
 TEST_F(WindowFamily, closedWindowTakesItsFamily)
 {
     showAll();

@@ -146,7 +146,7 @@ public:
     /// window that is not on the screen comes up together with that one.
     void orderFront();
     /// Takes the window and its children off the screen without closing it.
-    void orderOut();
+    void orderOut() { hide(); }
 
     void setVisible(bool visible) override;
 
