@@ -6,6 +6,7 @@
 #include "appearance/ViewBorder.h"
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/OneShotTimer.h"
 #include "platform/Storyboard.h"
 #include "platform/View.h"
 #include "platform/WindowFlags.h"
@@ -20,7 +21,6 @@
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QScreen>
-#include <QTimer>
 
 namespace penwick {
 
@@ -278,7 +278,8 @@ void DrawingWindowController::showSharingNotificationWindow()
     require(m_drawingWindow.data(), "the drawing window is gone");
     centreBanner();
     m_drawingWindow->addChildWindow(*sharingNotificationWindow());
-    QTimer::singleShot(bannerTime, this, &DrawingWindowController::closeSharingNotificationWindow);
+    platform::callLater(
+        *this, bannerTime, &DrawingWindowController::closeSharingNotificationWindow);
 }
 
 void DrawingWindowController::closeSharingNotificationWindow()

@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "session/ToolPanelWindowController.h"
 
+#include "platform/OneShotTimer.h"
 #include "platform/WindowFlags.h"
 #include "platform/foundation/FatalError.h"
 #include "session/PanelClamp.h"
 #include "toolpanel/ToolPanelViewController.h"
-
-#include <QTimer>
 
 namespace penwick {
 
@@ -72,7 +71,7 @@ void ToolPanelWindowController::mouseDown()
 
 void ToolPanelWindowController::mouseUp()
 {
-    QTimer::singleShot(settleTime, this, &ToolPanelWindowController::adjustPosition);
+    platform::callLater(*this, settleTime, &ToolPanelWindowController::adjustPosition);
 }
 
 } // namespace penwick

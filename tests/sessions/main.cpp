@@ -1,0 +1,116 @@
+// SPDX-License-Identifier: MIT
+// penwick-sessions [COUNT]: opens, uses and ends COUNT sessions, 100 by default, in one process,
+// and says what they cost. Its status is 0 if none of them left anything behind, else 1.
+#include "sessions/Ledger.h"
+#include "sessions/Sessions.h"
+#include "sessions/TimedApplication.h"
+
+#include <penwick/platform/NotificationCenter.h>
+
+#include <QElapsedTimer>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+
+using namespace penwick::sessions;
+using penwick::WindowType;
+using penwick::platform::NotificationCenter;
+
+namespace {
+
+// The windowless platform says at every window that it cannot bring it to the front.
+void passOn(QtMsgType, const QMessageLogContext &, const QString &message)
+{
+    if (message != QLatin1String("This plugin does not support raise()"))
+        std::fprintf(stderr, "%s\n", message.toLocal8Bit().constData());
+}
+
+// Enough for every kind of window and of end to have filled what is filled once in a process.
+constexpr int warmUp = 72;
+
+constexpr double microsecondsPerMillisecond = 1000.0;
+
+double milliseconds(std::chrono::microseconds time)
+{
+    return static_cast<double>(time.count()) / microsecondsPerMillisecond;
+}
+
+void sayCosts(const Sessions &sessions)
+{
+    const char *const names[] = { "whiteboard", "annotation", "imageAnnotation" };
+    for (const auto &[kind, cost] : sessions.costs()) {
+        if (cost.openings.empty())
+            continue;
+        auto times = cost.openings;
+        std::sort(times.begin(), times.end());
+        std::printf("%-16s opened in %5.1f ms of the processor, at most %5.1f; "
+                    "the host waited for it at most %5.1f ms\n",
+            names[static_cast<int>(kind)], milliseconds(times[times.size() / 2]),
+            milliseconds(times.back()), milliseconds(cost.longestCall));
+    }
+}
+
+// An observer that a session had left would take this for its own and stop the process.
+void postWhatNoLiveCanvasTakes()
+{
+    const QString end = penwick::penwickSessionEndNotificationKey();
+    const QString prefix = end.chopped(QStringLiteral(".penwick.session.end").size());
+    NotificationCenter::defaultCenter().postNotification(
+        prefix + QStringLiteral(".penwick.notification.drawsubview.update"),
+        QStringLiteral("no operation"));
+}
+
+// Lets pass what takes time to die down: the display's last answers.
+void rest()
+{
+    constexpr int time = 300; // ms
+    QElapsedTimer clock;
+    clock.start();
+    while (clock.elapsed() < time) {
+        QCoreApplication::processEvents(QEventLoop::AllEvents, 20);
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    }
+}
+
+} // namespace
+
+int main(int argumentCount, char **arguments)
+{
+    const int count = argumentCount > 1 ? std::atoi(arguments[1]) : 100;
+    if (count <= 0 || argumentCount > 2) {
+        std::fputs("Usage: penwick-sessions [COUNT]\n", stderr);
+        return 2;
+    }
+    countMemoryExactly(arguments);
+    qInstallMessageHandler(passOn);
+    TimedApplication application(argumentCount, arguments);
+    QApplication::setQuitOnLastWindowClosed(false);
+
+    if (Sessions warming(warmUp); !warming.run())
+        return EXIT_FAILURE;
+    rest();
+    static_cast<void>(application.takeLongestBlock());
+    Sessions sessions(count);
+    const Ledger before = Ledger::taken();
+    if (!sessions.run())
+        return EXIT_FAILURE;
+    const TimedApplication::Block block = application.takeLongestBlock();
+    // At once, so that a timer that is still to fire is seen.
+    const Ledger atOnce = Ledger::taken();
+    rest();
+    const Ledger after = Ledger::taken();
+
+    sayCosts(sessions);
+    std::printf(
+        "longest event    %5.1f ms (%s)\n", milliseconds(block.time), block.what.constData());
+    std::printf("memory kept      %5.1f bytes a session\n",
+        (double(after.memory) - double(before.memory)) / count);
+    QString left = leftBehind(before, after, count);
+    if (atOnce.timers > before.timers)
+        left += QStringLiteral("%1 timers still to fire\n").arg(atOnce.timers - before.timers);
+    std::fputs(left.toLocal8Bit().constData(), stderr);
+    std::fflush(stdout);
+    postWhatNoLiveCanvasTakes();
+    return left.isEmpty() ? EXIT_SUCCESS : EXIT_FAILURE;
+}
