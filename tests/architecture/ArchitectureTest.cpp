@@ -182,7 +182,8 @@ TEST(Architecture, noFileIncludesItselfOnADetour)
         return targets;
     });
 
-    for (const std::string &file : files({ "include", "src", "host", "tests", "bench" }))
+    for (const std::string &file :
+        files({ "include", "src", "host", "examples", "tests", "bench" }))
         finder.walk(file);
 
     EXPECT_EQ(finder.circles(), Findings {});
@@ -220,9 +221,28 @@ TEST(Architecture, exampleHostKnowsOnlyWhatAnyHostMay)
     EXPECT_EQ(findings, Findings {});
 }
 
+TEST(Architecture, examplesKnowOnlyWhatIsInstalled)
+{
+    Findings findings;
+    for (const std::string &file : files({ "examples" })) {
+        const std::string folder = file.substr(0, file.rfind('/'));
+        for (const Include &include : tree().includes(file)) {
+            const std::string target = tree().resolved(include, file);
+            const bool isPublic = !include.isQuoted && isBelow(target, "include");
+            const bool isOwn = include.isQuoted && isBelow(target, folder);
+            const bool isSystem = !include.isQuoted && target.empty();
+            if (!isPublic && !isOwn && !isSystem)
+                findings.push_back(file + " includes " + include.name);
+        }
+    }
+
+    EXPECT_FALSE(files({ "examples" }).empty());
+    EXPECT_EQ(findings, Findings {});
+}
+
 TEST(Architecture, desktopsAreToldApartOnlyInPlatform)
 {
-    const std::vector<std::string> product { "src", "include", "host" };
+    const std::vector<std::string> product { "src", "include", "host", "examples" };
 
     EXPECT_EQ(linesLike(nativeInclude, product, "src/platform"), Findings {});
     EXPECT_EQ(linesLike(privateQtInclude, product, "src/platform"), Findings {});
@@ -241,7 +261,8 @@ TEST(Architecture, nativeCallsAreOnlyInTheNativeFolder)
 TEST(Architecture, everyFileSaysItsLicenceAndItsPurposeFirst)
 {
     Findings findings;
-    for (const std::string &file : files({ "include", "src", "host", "tests", "bench" })) {
+    for (const std::string &file :
+        files({ "include", "src", "host", "examples", "tests", "bench" })) {
         const std::string &text = tree().text(file);
         if (text.compare(0, 32, "// SPDX-License-Identifier: MIT\n") != 0)
             findings.push_back(file + ": no licence line");
@@ -260,7 +281,8 @@ TEST(Architecture, noFileIsLongerThanWasAgreed)
     // File and why it is longer. Past 600 lines there is no why.
     const std::set<std::string> agreed {};
     Findings findings;
-    for (const std::string &file : files({ "include", "src", "host", "tests", "bench" })) {
+    for (const std::string &file :
+        files({ "include", "src", "host", "examples", "tests", "bench" })) {
         const int lines = tree().lineCount(file);
         if (lines > limit && (!agreed.count(file) || lines > 600))
             findings.push_back(file + ": " + std::to_string(lines));

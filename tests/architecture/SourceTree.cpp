@@ -14,7 +14,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-const char *const folders[] = { "include", "src", "host", "tests", "bench" };
+const char *const folders[] = { "include", "src", "host", "examples", "tests", "bench" };
 
 std::string contents(const fs::path &file)
 {
