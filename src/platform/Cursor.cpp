@@ -5,6 +5,7 @@
 
 #include <QGuiApplication>
 #include <QPixmap>
+#include <QPointer>
 #include <QWidget>
 
 #include <cmath>
@@ -19,6 +20,19 @@ constexpr int largestCursor = 128; // points; more than any cursor's own size
 double hotSpotScale(double devicePixelRatio)
 {
     return QGuiApplication::platformName() == QStringLiteral("xcb") ? devicePixelRatio : 1.0;
+}
+
+struct SetCursor
+{
+    QPointer<QWidget> widget;
+    QCursor shown;
+};
+
+// What was set last, and on what. Never destroyed, like the cursor itself.
+SetCursor &lastSet()
+{
+    static auto *const last = new SetCursor;
+    return *last;
 }
 
 } // namespace
@@ -74,12 +88,16 @@ QCursor Cursor::forScale(double devicePixelRatio) const
 void Cursor::set(View &view) const
 {
     current() = *this;
-    view.surface().setCursor(forScale(view.widget().devicePixelRatioF()));
+    const QCursor shown = forScale(view.widget().devicePixelRatioF());
+    view.surface().setCursor(shown);
+    lastSet() = { &view.surface(), shown };
 }
 
 Cursor Cursor::currentCursor()
 {
-    return current();
+    // A host reaches the component's widgets, too.
+    const SetCursor &last = lastSet();
+    return last.widget && last.widget->cursor() != last.shown ? arrow() : current();
 }
 
 } // namespace penwick::platform

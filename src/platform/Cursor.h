@@ -35,7 +35,8 @@ public:
     /// its own.
     void set(View &view) const;
 
-    /// The cursor that was set last, by set() or by the pointer entering a view.
+    /// The cursor that was set last, by set() or by the pointer entering a view; arrow() where
+    /// somebody else has given the view's widget another one since.
     static Cursor currentCursor();
 
     friend bool operator==(const Cursor &a, const Cursor &b) { return a.m_data == b.m_data; }

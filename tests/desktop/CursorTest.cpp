@@ -48,17 +48,38 @@ TEST_F(Cursor, followsTheTool)
     EXPECT_TRUE(waitUntil([&] { return desktop().pointer().look() == brush; }));
 }
 
-TEST_F(Cursor, isTheBrushAgainAfterADragThatLeftTheBoardAndCameBack)
+TEST_F(Cursor, isTheBrushAgainAsSoonAsADragComesBackToTheBoard)
+{
+    open(HostProgram::Steered);
+    const CursorLook brush = waitForBrush();
+    Pointer &pointer = desktop().pointer();
+    pointer.press();
+    pointer.glideTo(onScreen({ -60, 200 }));
+    host().steer(QStringLiteral("arrow"));
+    require([&] { return pointer.look() != brush; }, "the arrow");
+
+    pointer.glideTo(onScreen({ 200, 240 }));
+
+    EXPECT_TRUE(waitUntil([&] { return pointer.look() == brush; })) << "while the button is held";
+    pointer.release();
+    waitForLevel({ 198, 240 }, inkOnWhite);
+    EXPECT_TRUE(waitUntil([&] { return pointer.look() == brush; }));
+}
+
+TEST_F(Cursor, staysTheBrushForADragThatLeavesTheBoardAndComesBack)
 {
     open();
     const CursorLook brush = waitForBrush();
+    Pointer &pointer = desktop().pointer();
 
-    drag({ { 200, 200 }, { -60, 200 }, { 200, 240 } });
+    pointer.press();
+    pointer.glideTo(onScreen({ -60, 200 }));
+    EXPECT_EQ(pointer.look(), brush) << "beside the board, with the button held";
+    pointer.glideTo(onScreen({ 200, 240 }));
+    pointer.release();
 
     waitForLevel({ 198, 240 }, inkOnWhite);
-    EXPECT_TRUE(waitUntil([&] { return desktop().pointer().look() == brush; }));
-    desktop().pointer().glideTo(onScreen({ 300, 300 }));
-    EXPECT_TRUE(waitUntil([&] { return desktop().pointer().look() == brush; }));
+    EXPECT_TRUE(waitUntil([&] { return pointer.look() == brush; }));
 }
 
 TEST_F(Cursor, isNotTheBrushAfterADragThatEndedBesideTheBoard)

@@ -58,6 +58,20 @@ TEST(Cursor, setCursorIsShownOverTheViewAndIsTheCurrentOne)
     EXPECT_EQ(view.cursor().shape(), Qt::ArrowCursor);
 }
 
+TEST(Cursor, cursorThatSomebodyElseReplacedIsNotTheCurrentOne)
+{
+    const SvgFile artwork(20, 10);
+    const Cursor cursor(artwork.icon(), { 3.0, 7.0 });
+    RecordingView view;
+    cursor.set(view);
+
+    view.setCursor(Qt::WaitCursor);
+
+    EXPECT_EQ(Cursor::currentCursor(), Cursor::arrow());
+    cursor.set(view);
+    EXPECT_EQ(Cursor::currentCursor(), cursor);
+}
+
 // Off X11 Qt takes the hot spot in points, whatever the scale.
 TEST_P(CursorScale, imageIsSharpAndTheHotSpotStays)
 {
