@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-#include "sessions/Sessions.h"
+#include "leftovers/Sessions.h"
 
-#include "sessions/Ledger.h"
+#include "leftovers/Ledger.h"
 
 #include <penwick/platform/NotificationCenter.h>
 
@@ -15,7 +15,7 @@
 #include <ctime>
 #include <functional>
 
-namespace penwick::sessions {
+namespace penwick::leftovers {
 
 namespace {
 
@@ -196,4 +196,4 @@ void Sessions::end(End how)
     }
 }
 
-} // namespace penwick::sessions
+} // namespace penwick::leftovers

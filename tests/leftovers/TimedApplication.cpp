@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "sessions/TimedApplication.h"
+#include "leftovers/TimedApplication.h"
 
 #include <QEvent>
 #include <QMetaEnum>
 
 #include <utility>
 
-namespace penwick::sessions {
+namespace penwick::leftovers {
 
 bool TimedApplication::notify(QObject *receiver, QEvent *event)
 {
@@ -33,4 +33,4 @@ TimedApplication::Block TimedApplication::takeLongestBlock()
     return std::exchange(m_longest, {});
 }
 
-} // namespace penwick::sessions
+} // namespace penwick::leftovers

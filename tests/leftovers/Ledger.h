@@ -7,7 +7,7 @@
 
 #include <cstddef>
 
-namespace penwick::sessions {
+namespace penwick::leftovers {
 
 /// The windows, widgets and timers of the process, and the memory it has asked for.
 struct Ledger
@@ -31,4 +31,4 @@ struct Ledger
 /// Makes the allocator count exactly: starts the program anew if it has to, with `arguments`.
 void countMemoryExactly(char **arguments);
 
-} // namespace penwick::sessions
+} // namespace penwick::leftovers

@@ -9,7 +9,7 @@
 #include <memory>
 #include <vector>
 
-namespace penwick::sessions {
+namespace penwick::leftovers {
 
 /// Opens the kinds of drawing windows in turn, uses them and ends them, in each way in turn: closed
 /// by the host, by the tool that ends the session, and by being let go of. GUI thread only.
@@ -55,4 +55,4 @@ private:
     std::map<WindowType, Cost> m_costs;
 };
 
-} // namespace penwick::sessions
+} // namespace penwick::leftovers

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // penwick-sessions [COUNT]: opens, uses and ends COUNT sessions, 100 by default, in one process,
 // and says what they cost. Its status is 0 if none of them left anything behind, else 1.
-#include "sessions/Ledger.h"
-#include "sessions/Sessions.h"
-#include "sessions/TimedApplication.h"
+#include "leftovers/Ledger.h"
+#include "leftovers/Sessions.h"
+#include "leftovers/TimedApplication.h"
 
 #include <penwick/platform/NotificationCenter.h>
 
@@ -13,7 +13,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-using namespace penwick::sessions;
+using namespace penwick::leftovers;
 using penwick::WindowType;
 using penwick::platform::NotificationCenter;
 

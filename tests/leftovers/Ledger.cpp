@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "sessions/Ledger.h"
+#include "leftovers/Ledger.h"
 
 #include <QAbstractEventDispatcher>
 #include <QApplication>
@@ -11,7 +11,7 @@
 
 #include <X11/Xlib.h>
 
-namespace penwick::sessions {
+namespace penwick::leftovers {
 
 namespace {
 
@@ -81,4 +81,4 @@ void countMemoryExactly(char **arguments)
     execv("/proc/self/exe", arguments); // goes on as it is where there is no such file
 }
 
-} // namespace penwick::sessions
+} // namespace penwick::leftovers
