@@ -1,0 +1,92 @@
+// SPDX-License-Identifier: MIT
+// The second model as a whole: one drawing window with its tool bar, popovers and pointer.
+#pragma once
+
+#include "sessions/PlainCanvas.h"
+
+#include <functional>
+#include <map>
+#include <string>
+#include <vector>
+
+namespace penwick::sessions {
+
+/// What a user and a host do to one drawing window, and what must come of it.
+class PlainBoard
+{
+public:
+    PlainBoard();
+    PlainBoard(const PlainBoard &) = delete;
+    PlainBoard &operator=(const PlainBoard &) = delete;
+
+    /// The left button on the drawing window. `target`: canvas, b1, x1.
+    void press(const std::string &target, Spot spot, int clickCount);
+    void drag(Spot spot);
+    void release(Spot spot);
+    [[nodiscard]] bool isHeld() const { return !m_held.empty(); }
+
+    void click(const std::string &tool); ///< its button, by whatever means
+    void choose(const std::string &option); ///< its button: kind#value
+    void pressPanel() { hidePopover(); } ///< its background
+    /// By X-like names: letters, Return, BackSpace, 1 to 9, and C-z, C-y, C-Delete, C-w.
+    void key(const std::string &name);
+
+    void activate(bool isActive);
+    void minimise(bool isMinimised);
+    void hide();
+    void show();
+    void close();
+    void showBanner(bool isShown) { m_isBannerShown = isShown; }
+    void turn(); ///< the event loop has come round, and what is to be painted is
+
+    [[nodiscard]] bool isClosed() const { return m_isClosed; }
+    [[nodiscard]] bool isVisible() const { return m_isVisible; }
+    [[nodiscard]] bool isMinimised() const { return m_isMinimised; }
+    [[nodiscard]] bool isKey() const { return m_isKey; }
+    [[nodiscard]] bool isPopoverVisible() const { return m_isPopoverIn && m_isPanelVisible; }
+    [[nodiscard]] std::string popover() const { return m_popover; } ///< kind; empty before any
+    [[nodiscard]] const PlainCanvas &canvas() const { return m_canvas; }
+
+    /// All that can be seen, as lines of text; what was posted since the last time is the last.
+    [[nodiscard]] std::string inWords();
+
+private:
+    void hear(const std::string &notification);
+    void afterRelease(const std::function<void()> &action);
+    void pressDeleteButton(const std::string &box);
+    void letGo();
+    void performTool(const std::string &tool);
+    void performOption(const std::string &option);
+    void showPopoverFor(const std::string &tool, const std::string &toolBefore);
+    void showPopover(const std::string &kind);
+    void hidePopover();
+    void orderPopoverOut() { m_isPopoverIn = false; }
+    void boxKey(const std::string &box, const std::string &name);
+    void windowKey(const std::string &name);
+
+    PlainDrawing m_drawing;
+    PlainCanvas m_canvas { m_drawing };
+    std::vector<std::string> m_posted;
+
+    std::map<std::string, bool> m_isSelected; // tool buttons
+    std::map<std::string, bool> m_isEnabled;
+    std::map<std::string, std::string> m_chosen; // option of each kind
+    std::string m_popover;
+    bool m_isPopoverIn = false; // asked to the screen
+    bool m_isPanelVisible = true;
+    bool m_isVisible = true;
+    bool m_isMinimised = false;
+    bool m_isKey = true;
+    bool m_isClosed = false;
+    bool m_isBannerShown = false;
+
+    std::string m_held; // what the left button is held down on
+    bool m_isReleasing = false;
+    std::vector<std::function<void()>> m_waiting; // until it is let go
+};
+
+/// The option buttons of a popover, in their order.
+[[nodiscard]] const std::vector<std::string> &optionsOf(const std::string &kind);
+[[nodiscard]] const std::vector<std::string> &toolNames();
+
+} // namespace penwick::sessions

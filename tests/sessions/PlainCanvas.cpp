@@ -1,0 +1,293 @@
+// SPDX-License-Identifier: MIT
+#include "sessions/PlainCanvas.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace penwick::sessions {
+
+// The pointer on the canvas
+
+void PlainCanvas::press(Spot spot)
+{
+    if (currentTool != "brush")
+        return;
+    makeFirstResponder("canvas");
+    m_start = spot;
+    m_drawing.beginStroke(spot, std::stod(thickness));
+}
+
+void PlainCanvas::drag(Spot spot)
+{
+    makeFirstResponder("canvas");
+    if (currentTool == "brush") {
+        m_isDragged = true;
+        m_drawing.extendStroke(spot);
+        copyContent();
+        m_start = spot;
+    } else if (currentTool == "eraser") {
+        erase(spot);
+    }
+}
+
+void PlainCanvas::release(Spot spot)
+{
+    if (currentTool == "brush") {
+        if (m_start == spot && !m_isDragged) {
+            if (!strokes.empty()) {
+                strokes.pop_back();
+                m_hasDropped = true;
+            }
+        } else {
+            m_isDragged = false;
+        }
+    } else if (currentTool == "eraser") {
+        erase(spot);
+    } else if (currentTool == "text") {
+        placeBox(spot);
+    }
+}
+
+void PlainCanvas::erase(Spot spot)
+{
+    if (m_drawing.eraseAt(spot))
+        copyContent();
+}
+
+void PlainCanvas::placeBox(Spot spot)
+{
+    if (m_responder != "canvas") {
+        makeFirstResponder("canvas");
+        return;
+    }
+    const std::string name = m_drawing.addBox();
+    PlainBox &box = allBoxes[name];
+    box.x = spot.x;
+    box.top = spot.y - 24 + 30;
+    copyContent();
+    putOn(name);
+    makeFirstResponder(name);
+}
+
+// The pointer on a box
+
+void PlainCanvas::pressBox(const std::string &name, Spot spot, int clickCount)
+{
+    PlainBox &box = allBoxes.at(name);
+    if (clickCount == 1 && !box.isEditable) {
+        box.hasDashedBorder = false;
+    } else if (clickCount == 2) {
+        box.isEditable = true;
+        box.hasDashedBorder = true;
+        showButton(name);
+    }
+    makeFirstResponder(name);
+    m_canPan = !box.isEditable;
+    m_isPanning = false;
+    m_pressed = spot;
+    m_grabbed = { box.x, box.top };
+}
+
+void PlainCanvas::dragBox(const std::string &name, Spot spot)
+{
+    if (!m_canPan)
+        return;
+    const Spot way { spot.x - m_pressed.x, spot.y - m_pressed.y };
+    m_isPanning = m_isPanning || std::hypot(way.x, way.y) >= 3;
+    if (!m_isPanning)
+        return;
+    allBoxes.at(name).x = m_grabbed.x + way.x;
+    allBoxes.at(name).top = m_grabbed.y + way.y;
+}
+
+void PlainCanvas::releaseBox(const std::string &name, Spot spot)
+{
+    if (m_isPanning)
+        dragBox(name, spot);
+    m_canPan = false;
+    m_isPanning = false;
+    makeFirstResponder(name);
+}
+
+// Keys
+
+std::string PlainCanvas::editedBox() const
+{
+    const auto found = allBoxes.find(m_responder);
+    return found != allBoxes.end() && found->second.isEditable ? m_responder : std::string();
+}
+
+void PlainCanvas::type()
+{
+    ++allBoxes.at(m_responder).letters;
+}
+
+void PlainCanvas::backspace()
+{
+    const std::string name = m_responder;
+    const auto found = allBoxes.find(name);
+    if (found == allBoxes.end())
+        return;
+    PlainBox &box = found->second;
+    if (!box.isEditable)
+        removeAndReport(name);
+    else if (box.letters > 0)
+        --box.letters;
+}
+
+// First responder
+
+void PlainCanvas::makeFirstResponder(const std::string &who)
+{
+    if (who == m_responder)
+        return;
+    const std::string before = m_responder;
+    m_responder.clear();
+    if (allBoxes.count(before))
+        resign(before);
+    if (!who.empty() || m_responder.empty())
+        m_responder = who == "canvas" || isOnCanvas(who) ? who : std::string();
+}
+
+void PlainCanvas::resign(const std::string &name)
+{
+    PlainBox &box = allBoxes.at(name);
+    if (box.isDeleted)
+        return;
+    box.isEditable = false;
+    box.hasDashedBorder = false;
+    box.isButtonShown = false;
+    viewHidden("x" + name.substr(1));
+    if (box.letters == 0) {
+        box.isDeleted = true;
+        leave(name);
+        report(name);
+    }
+}
+
+void PlainCanvas::leave(const std::string &name)
+{
+    if (m_responder == name)
+        makeFirstResponder("");
+    PlainBox &box = allBoxes.at(name);
+    if (!box.isOnCanvas)
+        return;
+    box.isOnCanvas = false;
+    std::erase(views, name);
+    viewHidden(name);
+}
+
+void PlainCanvas::report(const std::string &name)
+{
+    m_drawing.deleteBox(name);
+    makeFirstResponder("canvas");
+    copyContent();
+}
+
+void PlainCanvas::removeAndReport(const std::string &name)
+{
+    const bool wasDeleted = allBoxes.at(name).isDeleted;
+    leave(name);
+    if (wasDeleted || !allBoxes.at(name).isDeleted)
+        report(name);
+}
+
+// Views
+
+bool PlainCanvas::isOnCanvas(const std::string &view) const
+{
+    return std::find(views.begin(), views.end(), view) != views.end();
+}
+
+void PlainCanvas::putOn(const std::string &name)
+{
+    PlainBox &box = allBoxes.at(name);
+    if (box.isOnCanvas)
+        return;
+    box.isOnCanvas = true;
+    box.isDeleted = false;
+    views.push_back(name);
+}
+
+void PlainCanvas::showButton(const std::string &name)
+{
+    const std::string button = "x" + name.substr(1);
+    allBoxes.at(name).isButtonShown = true;
+    if (allBoxes.at(name).isOnCanvas && !isOnCanvas(button))
+        views.push_back(button);
+}
+
+void PlainCanvas::paint()
+{
+    for (const std::string &name : boxes)
+        putOn(name);
+    for (const std::string &view : std::vector(views)) {
+        if (allBoxes.count(view) && allBoxes.at(view).hasDashedBorder)
+            showButton(view);
+    }
+}
+
+void PlainCanvas::turn()
+{
+    if (m_hasDropped)
+        copyContent();
+}
+
+void PlainCanvas::takeOff(const std::string &box)
+{
+    if (isOnCanvas(box))
+        leave(box);
+}
+
+void PlainCanvas::copyContent()
+{
+    strokes = m_drawing.strokes();
+    boxes = m_drawing.boxes();
+    m_hasDropped = false;
+}
+
+// Tools
+
+void PlainCanvas::chooseTool(const std::string &tool)
+{
+    currentTool = tool;
+    if (tool == "text")
+        makeFirstResponder("canvas");
+    if (tool == "text" || tool == "brush" || tool == "eraser")
+        lastTool = tool;
+    if (tool == "clear")
+        clear();
+    if (tool == "undo")
+        m_drawing.undo();
+    if (tool == "redo")
+        m_drawing.redo();
+    currentTool = lastTool;
+}
+
+void PlainCanvas::clear()
+{
+    if (strokes.empty() && boxes.empty() && views.empty())
+        return;
+    for (const std::string &view : std::vector(views)) {
+        if (view.front() == 'x')
+            std::erase(views, view);
+        else
+            leave(view);
+    }
+    m_drawing.clear();
+    copyContent();
+}
+
+void PlainCanvas::chooseOption(const std::string &kind, const std::string &value)
+{
+    if (kind == "color") {
+        color = value;
+        currentTool = lastTool;
+    } else if (kind == "brush") {
+        thickness = value;
+    } else {
+        fontSize = value;
+    }
+}
+
+} // namespace penwick::sessions

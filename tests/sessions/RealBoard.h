@@ -1,0 +1,111 @@
+// SPDX-License-Identifier: MIT
+// The component itself, opened as a host opens it and worked by events without a screen.
+#pragma once
+
+#include "sessions/PlainDrawing.h"
+#include "support/NotificationRecorder.h"
+
+#include <penwick/Penwick.h>
+
+#include <QEvent>
+#include <QPointF>
+
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+class QWidget;
+class QWindow;
+
+namespace penwick {
+
+class DrawViewController;
+class DrawingCanvasView;
+class ToolPanelViewController;
+
+namespace platform {
+class Button;
+class View;
+} // namespace platform
+
+namespace sessions {
+
+/// One session of a host: its entry object and the drawing window that it opened last.
+///
+/// Pointer and keys go through the toolkit's own delivery, at times of a clock that stands still
+/// unless a step is taken. Nothing is left to timers: what one would do is asked for by name.
+class RealBoard
+{
+public:
+    RealBoard();
+    ~RealBoard();
+    RealBoard(const RealBoard &) = delete;
+    RealBoard &operator=(const RealBoard &) = delete;
+
+    /// Opens a drawing window as the host's (only) one, in the place of one that is still open.
+    void open();
+
+    /// What a pointer at `spot` points at: canvas, b1, x1.
+    [[nodiscard]] std::string targetAt(Spot spot) const;
+    [[nodiscard]] Spot size() const; ///< of the canvas
+    /// The middle of what can be seen of a box or a delete button; the canvas's if nothing can.
+    [[nodiscard]] Spot middleOf(const std::string &view) const;
+
+    void press(Spot spot, Qt::MouseButton button = Qt::LeftButton);
+    void pressAgain(Spot spot); ///< soon enough to be a double click
+    void move(Spot spot);
+    void release(Spot spot, Qt::MouseButton button = Qt::LeftButton);
+    [[nodiscard]] Qt::MouseButtons held() const { return m_held; }
+    /// Closes the menu that the pointer opened, if it did.
+    static void closeMenu();
+
+    void clickTool(const std::string &name, bool byPointer);
+    void pressToolElsewhere(const std::string &name); ///< let go beside it
+    void chooseOption(const std::string &name, bool byPointer);
+    void pressPanel(); ///< its background
+    void key(const std::string &name);
+
+    void activate(bool isActive);
+    void minimise(bool isMinimised);
+    void hide();
+    void show();
+    void close();
+    void showBanner(bool isShown);
+    /// The event loop comes round, and what is to be painted is.
+    void turn();
+
+    /// All that can be seen, in the words of the second model.
+    [[nodiscard]] std::string inWords();
+
+private:
+    [[nodiscard]] DrawViewController &controller() const;
+    [[nodiscard]] DrawingCanvasView &canvas() const;
+    [[nodiscard]] ToolPanelViewController &bar() const;
+    [[nodiscard]] platform::Window &window() const;
+    [[nodiscard]] platform::Button &option(const std::string &name) const;
+    [[nodiscard]] std::string nameOf(std::int64_t id) const;
+    [[nodiscard]] std::string nameOf(platform::View *view) const;
+    [[nodiscard]] std::string inWords(const std::string &posted) const;
+    [[nodiscard]] std::string viewsInWords() const;
+    [[nodiscard]] std::string panelInWords() const;
+    [[nodiscard]] QPointF inWindow(Spot spot) const;
+    void paint();
+    void learnNames();
+    void send(QWindow &window, QPointF place, Qt::MouseButton button, QEvent::Type type);
+    void sendTo(QWidget &widget, QPointF place, Qt::MouseButton button, QEvent::Type type);
+
+    std::unique_ptr<Penwick> m_penwick;
+    std::shared_ptr<DrawingWindowController> m_controller;
+    std::unique_ptr<test::NotificationRecorder> m_recorder;
+    std::map<std::int64_t, std::string> m_names; // of strokes and boxes, by identifier
+    std::map<const void *, std::string> m_deleteButtons;
+    int m_strokes = 0;
+    int m_boxes = 0;
+    Qt::MouseButtons m_held;
+    int m_time = 0; // ms
+};
+
+} // namespace sessions
+} // namespace penwick

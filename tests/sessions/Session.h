@@ -1,0 +1,59 @@
+// SPDX-License-Identifier: MIT
+// One session, gone through by the component and by the second model side by side.
+#pragma once
+
+#include "sessions/PlainBoard.h"
+#include "sessions/RealBoard.h"
+#include "sessions/Step.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace penwick::sessions {
+
+/// Takes steps on both sides and compares all that can be seen after each.
+class Session
+{
+public:
+    Session();
+
+    /// Takes `steps`. Answers what differed, and how it came to that; nothing if nothing did.
+    std::optional<std::string> run(const Steps &steps);
+
+private:
+    void open();
+    void take(const Step &step);
+    void takeWindowStep(const Step &step);
+
+    void press(Spot spot, bool isDouble);
+    void pressView(const Step &step);
+    void goTo(Spot spot);
+    void drag(Spot spot);
+    void release(Spot spot);
+    void stroke(const Step &step);
+    void otherButton(const Step &step);
+    void releaseAll(Spot spot);
+    void clickTool(const Step &step);
+    void chooseOption(const Step &step);
+    void write(const Step &step);
+    void key(const Step &step);
+    void hideOrShow();
+    void minimiseOrRestore();
+
+    [[nodiscard]] Spot spotFor(const Step &step, int margin = 6) const;
+    [[nodiscard]] bool canPoint() const;
+    [[nodiscard]] bool isGrabLost() const;
+    [[nodiscard]] std::optional<std::string> difference();
+    void say(const std::string &what) { m_said.push_back(what); }
+
+    RealBoard m_real;
+    std::unique_ptr<PlainBoard> m_plain;
+    std::string m_grab; // where the buttons that are held down were pressed
+    Spot m_at; // the pointer
+    bool m_isBannerShown = false;
+    std::vector<std::string> m_said;
+};
+
+} // namespace penwick::sessions
