@@ -236,6 +236,9 @@ void TnTextBox::mousePressEvent(QMouseEvent *event)
 {
     if (event->button() == Qt::MiddleButton && isEditable())
         QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
+    // Selected text would be dragged, in a loop of events of its own; the host may end the session.
+    if (event->button() == Qt::LeftButton && !event->modifiers().testFlag(Qt::ShiftModifier))
+        setTextCursor(cursorForPosition(event->position().toPoint()));
     ViewOf::mousePressEvent(event);
 }
 

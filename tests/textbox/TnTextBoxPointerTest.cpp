@@ -85,6 +85,22 @@ TEST_F(TnTextBoxPointerTest, dragInABoxThatIsEditedSelectsTextAndMovesNothing)
     EXPECT_EQ(box->textCursor().selectedText(), QStringLiteral("Hello"));
 }
 
+TEST_F(TnTextBoxPointerTest, pressInSelectedTextSelectsAnewAndDragsNoText)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("Hello hello hello"));
+    box->selectAll();
+
+    // A drag of text would wait here until it is dropped, and select nothing.
+    pressOn(*box, { 20, 15 });
+    dragOn(*box, { 60, 15 });
+    releaseOn(*box, { 60, 15 });
+
+    EXPECT_TRUE(box->textCursor().hasSelection());
+    EXPECT_LT(box->textCursor().selectedText().size(), 10);
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello hello hello"));
+}
+
 TEST_F(TnTextBoxPointerTest, boxThatIsEditedAgainIsNotDragged)
 {
     const auto box = placedBox();
