@@ -191,23 +191,4 @@ TEST_F(DangerousSession, imageWindowWithoutAnImageIsDrawnOnAndClosed)
     EXPECT_FALSE(board->drawingWindow()->isVisible());
 }
 
-TEST_F(DangerousSession, draggedSelectionOfTextStartsNoDragOfItsOwn)
-{
-    leaveAnEmptyBoxOpen();
-    for (int letter = 0; letter < 20; ++letter)
-        m_board.key("b");
-    const Spot text { place.x + 20, place.y - 10 };
-    m_board.press(text);
-    m_board.release(text);
-    m_board.pressAgain(text); // selects the word
-    m_board.release(text);
-
-    // A drag would be a loop of events inside this one, until something is dropped.
-    m_board.press(text);
-    m_board.move({ text.x + 60, text.y });
-    m_board.release({ text.x + 60, text.y });
-
-    EXPECT_EQ(line("views"), "views b1:edited:20@200,106 x1");
-}
-
 } // namespace penwick::sessions
