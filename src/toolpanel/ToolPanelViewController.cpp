@@ -133,7 +133,8 @@ void ToolPanelViewController::observe()
 
 void ToolPanelViewController::viewWillAppear()
 {
-    m_popoverVc->setCurrentPopoverWindow(m_popoverW.get());
+    require(m_popoverVc.get(), "the tool panel has no popovers")
+        ->setCurrentPopoverWindow(m_popoverW.get());
     connectToDrawing();
     paintPanel();
     titleEndButton();
