@@ -10,7 +10,9 @@
 #include <X11/Xutil.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <memory>
+#include <utility>
 
 namespace penwick::desktop {
 
@@ -96,12 +98,17 @@ std::vector<WindowId> Windows::stackingOrder() const
 {
     // Not the window manager's own list: some set it only when the order changes.
     const std::vector<Window> frames = familyOf(m_connection, root()).children;
-    std::vector<WindowId> windows = numbers(root(), "_NET_CLIENT_LIST");
-    const auto height = [&](Window window) {
-        return std::find(frames.begin(), frames.end(), frameOf(m_connection, window));
-    };
-    std::sort(windows.begin(), windows.end(),
-        [&](Window one, Window other) { return height(one) < height(other); });
+    // Each is asked for once: a window may go while they are sorted.
+    std::vector<std::pair<std::ptrdiff_t, WindowId>> byHeight;
+    for (const WindowId window : numbers(root(), "_NET_CLIENT_LIST")) {
+        const auto place = std::find(frames.begin(), frames.end(), frameOf(m_connection, window));
+        byHeight.emplace_back(place - frames.begin(), window);
+    }
+    std::stable_sort(byHeight.begin(), byHeight.end(),
+        [](const auto &one, const auto &other) { return one.first < other.first; });
+    std::vector<WindowId> windows;
+    for (const auto &[height, window] : byHeight)
+        windows.push_back(window);
     return windows;
 }
 
