@@ -16,6 +16,7 @@
 #include <penwick/platform/NotificationCenter.h>
 
 #include <QApplication>
+#include <QImage>
 #include <QScreen>
 #include <QTest>
 #include <QWindow>
@@ -61,14 +62,16 @@ RealBoard::~RealBoard()
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 
-void RealBoard::open()
+void RealBoard::open(WindowType type)
 {
     m_held = {};
     m_controller.reset();
     if (!m_penwick)
         m_penwick = std::make_unique<Penwick>();
-    m_controller = m_penwick->createDrawingWindowController(
-        WindowType::whiteboard, QGuiApplication::primaryScreen());
+    QImage image(480, 270, QImage::Format_RGB32);
+    image.fill(Qt::lightGray);
+    m_controller
+        = m_penwick->createDrawingWindowController(type, QGuiApplication::primaryScreen(), image);
     m_controller->showWindow(nullptr);
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     QCoreApplication::processEvents(); // windows come to the screen

@@ -45,7 +45,7 @@ public:
     RealBoard &operator=(const RealBoard &) = delete;
 
     /// Opens a drawing window as the host's (only) one, in the place of one that is still open.
-    void open();
+    void open(WindowType type = WindowType::whiteboard);
 
     /// What a pointer at `spot` points at: canvas, b1, x1.
     [[nodiscard]] std::string targetAt(Spot spot) const;

@@ -30,25 +30,26 @@ std::vector<std::string> linesOf(const std::string &text)
 
 Session::Session() = default;
 
-void Session::open()
+void Session::open(int number)
 {
-    m_real.open();
+    const auto type = static_cast<WindowType>(number % 3);
+    m_real.open(type);
     m_plain = std::make_unique<PlainBoard>();
     m_grab.clear();
     m_isBannerShown = false;
-    say("open");
+    say("open kind " + std::to_string(static_cast<int>(type)));
 }
 
 std::optional<std::string> Session::run(const Steps &steps)
 {
     m_said.clear();
-    open();
+    open(steps.empty() ? 0 : steps.front().b);
     for (const Step &step : steps) {
         take(step);
         if (const auto found = difference())
             return found;
         if (m_plain->isClosed())
-            open(); // the host has been told, drops the window and makes another
+            open(step.b); // the host has been told, drops the window and makes another
     }
     return std::nullopt;
 }
@@ -311,7 +312,7 @@ void Session::takeWindowStep(const Step &step)
     if (step.kind == Kind::Minimise)
         return minimiseOrRestore();
     if (step.kind == Kind::OpenAnother)
-        return open();
+        return open(step.b);
     if (step.kind == Kind::Close) {
         say("close");
         m_real.close();

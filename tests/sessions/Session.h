@@ -23,7 +23,7 @@ public:
     std::optional<std::string> run(const Steps &steps);
 
 private:
-    void open();
+    void open(int number); ///< a window of one of the kinds
     void take(const Step &step);
     void takeWindowStep(const Step &step);
 
