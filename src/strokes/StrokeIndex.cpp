@@ -78,26 +78,22 @@ StrokeIndex::Bounds StrokeIndex::boundsOf(const StrokeEntry &stroke)
     return { below(bounds.x), below(bounds.y), above(bounds.maxX()), above(bounds.maxY()) };
 }
 
-EntryListChange StrokeIndex::changeTo(const EntryList<StrokeEntry> &strokes) const
+EntryListChange StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
 {
-    return changeBetween(m_strokes, strokes,
+    const EntryListChange change = changeBetween(m_strokes, strokes,
         [](const StrokeEntry &a, const StrokeEntry &b) { return a.bPath == b.bPath; });
-}
-
-void StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
-{
-    const EntryListChange change = changeTo(strokes);
     m_strokes = strokes;
     const int last = change.first + change.added;
     if (change.added == 0 && last < strokes.size()) {
         remove(change.first, change.first + change.removed);
-        return;
+        return change;
     }
     // The newest has no place, because it may grow; and numbers are given in the list's order.
     const int wanted = std::max(0, strokes.size() - 1);
     const int present = static_cast<int>(m_places.size());
     remove(std::min({ change.first, wanted, present }), present);
     insert(static_cast<int>(m_places.size()), wanted);
+    return change;
 }
 
 void StrokeIndex::remove(int from, int to)

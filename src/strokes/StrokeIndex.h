@@ -26,10 +26,8 @@ public:
 
     /// The list as it was last told.
     [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_strokes; }
-    /// What would change if it were told `strokes`.
-    [[nodiscard]] EntryListChange changeTo(const EntryList<StrokeEntry> &strokes) const;
-    /// Takes `strokes` for the list from now on.
-    void follow(const EntryList<StrokeEntry> &strokes);
+    /// Takes `strokes` for the list from now on; gives what has changed.
+    EntryListChange follow(const EntryList<StrokeEntry> &strokes);
 
     /// The index of the oldest stroke that `point` lies on.
     [[nodiscard]] std::optional<int> oldestAt(platform::Point point) const;

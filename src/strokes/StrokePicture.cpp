@@ -42,19 +42,18 @@ QRect StrokePicture::follow(const EntryList<StrokeEntry> &strokes)
         return strokes.isEmpty() ? QRect() : pixelsOf(strokes.last(), m_scale);
     }
     const QRect grown = addGrowth();
-    const EntryListChange change = m_index.changeTo(strokes);
-    if (change.isNothing())
-        m_index.follow(strokes);
-    else
-        followChange(change, strokes);
+    const EntryList<StrokeEntry> before = m_index.strokes();
+    const EntryListChange change = m_index.follow(strokes);
+    if (!change.isNothing())
+        followChange(change, before);
     return grown | addGrowth();
 }
 
 void StrokePicture::followChange(
-    const EntryListChange &change, const EntryList<StrokeEntry> &strokes)
+    const EntryListChange &change, const EntryList<StrokeEntry> &before)
 {
     int lastGone = change.first + change.removed;
-    if (m_isNewestApart && lastGone == this->strokes().size()) {
+    if (m_isNewestApart && lastGone == before.size()) {
         if (change.removed > 0) {
             dropNewest(); // which mends its pixels
             --lastGone;
@@ -62,28 +61,27 @@ void StrokePicture::followChange(
             settleNewest();
         }
     }
-    mark(change.first, lastGone);
-    m_index.follow(strokes);
+    mark(before, change.first, lastGone);
 
     int lastCome = change.first + change.added;
-    const bool isNewestNew = change.added > 0 && lastCome == strokes.size();
+    const bool isNewestNew = change.added > 0 && lastCome == strokes().size();
     if (isNewestNew)
         --lastCome;
-    mark(change.first, lastCome);
+    mark(strokes(), change.first, lastCome);
     // Whoever has no colour takes the one before it, and that may be another now.
-    if (lastCome < strokes.size() && !strokes[lastCome].bPathParams.pathColor)
+    if (lastCome < strokes().size() && !strokes()[lastCome].bPathParams.pathColor)
         m_marked = m_finished.area();
     if (isNewestNew)
         takeNewestApart();
-    else if (!m_isNewestApart && !strokes.isEmpty())
-        m_newestElements = strokes.last().bPath->elementCount();
+    else if (!m_isNewestApart && !strokes().isEmpty())
+        m_newestElements = strokes().last().bPath->elementCount();
 }
 
-void StrokePicture::mark(int from, int to)
+void StrokePicture::mark(const EntryList<StrokeEntry> &strokes, int from, int to)
 {
     QRect all;
     for (int index = from; index < to; ++index) {
-        const QRect touched = pixelsOf(strokes()[index], m_scale) & m_finished.area();
+        const QRect touched = pixelsOf(strokes[index], m_scale) & m_finished.area();
         if (to - from <= mostApart)
             m_marked += touched;
         else
@@ -101,14 +99,17 @@ void StrokePicture::takeNewestApart()
 void StrokePicture::settleNewest()
 {
     m_below.copy(m_finished, m_newestArea);
-    m_newest.clear(m_newestArea);
-    m_newestArea = {};
-    m_isNewestApart = false;
+    forgetNewest();
 }
 
 void StrokePicture::dropNewest()
 {
     m_finished.copy(m_below, m_newestArea);
+    forgetNewest();
+}
+
+void StrokePicture::forgetNewest()
+{
     m_newest.clear(m_newestArea);
     m_newestArea = {};
     m_isNewestApart = false;
@@ -128,7 +129,7 @@ QRect StrokePicture::addGrowth()
     if (elements == m_newestElements)
         return {};
     if (!m_isNewestApart) { // it had been settled, and goes on all the same
-        mark(strokes().size() - 1, strokes().size());
+        mark(strokes(), strokes().size() - 1, strokes().size());
         takeNewestApart();
     }
     const int linesPainted = m_newestElements / 2;

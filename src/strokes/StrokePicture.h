@@ -32,11 +32,12 @@ public:
     [[nodiscard]] const PixelLayer &pixels() const { return m_finished; }
 
 private:
-    void followChange(const EntryListChange &change, const EntryList<StrokeEntry> &strokes);
-    void mark(int from, int to);
+    void followChange(const EntryListChange &change, const EntryList<StrokeEntry> &before);
+    void mark(const EntryList<StrokeEntry> &strokes, int from, int to);
     void takeNewestApart();
     void settleNewest();
     void dropNewest();
+    void forgetNewest();
     QRect addGrowth();
     void forgetPixels();
     void resize(QSize size, double scale);
