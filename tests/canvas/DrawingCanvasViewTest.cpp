@@ -75,7 +75,6 @@ TEST_F(DrawingCanvasViewTest, hairlineMarksItsSmoothEdgeWhichIsWiderThanItsBoxGr
     canvas->setBrushThickness(0.5);
     settle();
     PaintRecorder painted(*canvas);
-
     press({ 50.5, 60.5 });
     drag({ 80.5, 60.5 });
     settle();

@@ -244,6 +244,7 @@ void PlainBoard::minimise(bool isMinimised)
 {
     m_isMinimised = isMinimised;
     letGo(); // what is gone under the pointer hears of no release
+    m_isPanelVisible = !isMinimised && !m_isClosed; // what stands above the board goes with it
 }
 
 void PlainBoard::hide()
@@ -323,8 +324,8 @@ std::string PlainBoard::inWords()
         + m_canvas.fontSize + "\nbuttons" + buttons + "\noptions " + m_chosen.at("text") + " "
         + m_chosen.at("color") + " " + m_chosen.at("brush") + "\npopover "
         + (isPopoverVisible() ? m_popover : "") + "\nwindows" + (m_isVisible ? " drawing" : "")
-        + (m_isPanelVisible ? " panel" : "") + (m_isBannerShown && m_isVisible ? " banner" : "")
-        + "\nposted" + joined(m_posted) + "\n";
+        + (m_isPanelVisible ? " panel" : "") + (isBannerVisible() ? " banner" : "") + "\nposted"
+        + joined(m_posted) + "\n";
     m_posted.clear();
     return text;
 }

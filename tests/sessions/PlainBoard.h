@@ -43,6 +43,10 @@ public:
     [[nodiscard]] bool isVisible() const { return m_isVisible; }
     [[nodiscard]] bool isMinimised() const { return m_isMinimised; }
     [[nodiscard]] bool isKey() const { return m_isKey; }
+    [[nodiscard]] bool isBannerVisible() const
+    {
+        return m_isBannerShown && m_isVisible && !m_isMinimised;
+    }
     [[nodiscard]] bool isPopoverVisible() const { return m_isPopoverIn && m_isPanelVisible; }
     [[nodiscard]] std::string popover() const { return m_popover; } ///< kind; empty before any
     [[nodiscard]] const PlainCanvas &canvas() const { return m_canvas; }
