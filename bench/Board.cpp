@@ -4,13 +4,13 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
-#include "strokes/StrokeHitTest.h"
-#include "history/UndoRedoManager.h"
+#include "platform/foundation/FatalError.h"
+
+#include <penwick/platform/Window.h>
 
 #include <QCoreApplication>
+#include <QGuiApplication>
 #include <QMouseEvent>
-
-#include <algorithm>
 
 namespace penwick::bench {
 
@@ -18,60 +18,59 @@ namespace {
 
 using platform::Point;
 
-constexpr double width = 1280.0;
-constexpr double height = 720.0;
-constexpr double thickness = 5.0;
-constexpr double longestStep = 4.0; // of a pointer that writes, along each axis
-constexpr std::size_t placesWanted = 64;
-
-double anyUpTo(std::mt19937 &random, double most)
+void send(QWidget &widget, QEvent::Type type, Qt::MouseButton button, Point point)
 {
-    return std::uniform_real_distribution<double>(0.0, most)(random);
-}
-
-Point pointAfter(std::mt19937 &random, Point point)
-{
-    const auto step = [&random] { return anyUpTo(random, 2 * longestStep) - longestStep; };
-    return { std::clamp(point.x + step(), 0.0, width), std::clamp(point.y + step(), 0.0, height) };
+    const QPointF position(point.x, widget.height() - point.y);
+    QMouseEvent event(
+        type, position, widget.mapToGlobal(position), button, Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(&widget, &event);
 }
 
 } // namespace
 
-void scribble(DrawingCanvasModel &model, int strokes)
+void sendPress(QWidget &widget, Point point)
 {
-    std::mt19937 random(7);
-    const QColor color(41, 41, 41, 178);
-    for (int stroke = 0; stroke < strokes; ++stroke) {
-        Point point { anyUpTo(random, width), anyUpTo(random, height) };
-        model.createPathWithParam(color, thickness, point);
-        for (int segment = 0; segment < segmentsOfAStroke; ++segment) {
-            point = pointAfter(random, point);
-            model.updateTheCurrentPath(point);
-        }
-    }
+    send(widget, QEvent::MouseButtonPress, Qt::LeftButton, point);
+}
+
+void sendDrag(QWidget &widget, Point point)
+{
+    send(widget, QEvent::MouseMove, Qt::NoButton, point);
+}
+
+void paintMarked()
+{
+    QCoreApplication::sendPostedEvents();
+}
+
+void settle()
+{
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    QCoreApplication::processEvents();
 }
 
 Board::Board(int strokes)
-    : m_notShown(std::make_unique<DrawingCanvasView>())
+    : m_window(m_penwick.createDrawingWindowController(
+        WindowType::whiteboard, QGuiApplication::primaryScreen()))
 {
-    m_canvas = new DrawingCanvasView(&m_window);
-    m_window.adoptScene();
-    auto content = std::make_unique<DrawViewController>();
-    m_controller = content.get();
-    content->setDrawingView(m_canvas);
-    content->setView(*m_canvas);
-    m_window.setContentViewController(std::move(content));
-    scribble(*m_controller->drawingCanvasModel(), strokes);
-    m_controller->updateDrawingCanvasElements();
-
-    m_window.show();
-    m_window.resize(static_cast<int>(width), static_cast<int>(height));
-    m_window.makeFirstResponder(m_canvas);
-    QCoreApplication::processEvents();
-    show();
+    platform::Window &window = *platform::require(m_window->drawingWindow(), "no window opened");
+    m_controller = platform::require(
+        dynamic_cast<DrawViewController *>(window.contentViewController()), "no draw controller");
+    m_canvas = platform::require(m_controller->drawingView(), "the board has no canvas");
+    m_window->showWindow(nullptr);
+    settle();
+    resize(canvasWidth, canvasHeight);
+    settle();
+    window.makeFirstResponder(m_canvas);
+    Pen pen(7);
+    scribble(pen, strokes);
 }
 
-Board::~Board() = default;
+Board::~Board()
+{
+    m_window.reset();
+    settle();
+}
 
 void Board::choose(const QString &tool)
 {
@@ -80,55 +79,53 @@ void Board::choose(const QString &tool)
 
 void Board::press(Point point)
 {
-    send(QEvent::MouseButtonPress, point);
+    sendPress(*m_canvas, point);
 }
 
 void Board::drag(Point point)
 {
-    send(QEvent::MouseMove, point);
+    sendDrag(*m_canvas, point);
 }
 
-void Board::show()
+void Board::draw(Pen &pen)
 {
-    QCoreApplication::sendPostedEvents();
+    choose(QStringLiteral("brush"));
+    press(pen.putDown());
+    for (int segment = 0; segment < segmentsOfAStroke; ++segment)
+        drag(pen.next());
+    settle();
 }
 
-void Board::forgetNewestStroke()
+void Board::scribble(Pen &pen, int strokes, int segments)
 {
-    m_controller->setDrawingView(m_notShown.get());
-    m_controller->drawingCanvasModel()->undoRedoManager()->undoAction();
-    m_controller->setDrawingView(m_canvas);
-    m_controller->updateDrawingCanvasElements();
+    bench::scribble(model(), pen, strokes, segments);
+    m_controller->updateDrawingCanvasViewForDisplay();
+    settle();
 }
 
-Point Board::nextPoint()
+void Board::expose()
 {
-    m_point = pointAfter(m_random, m_point);
-    return m_point;
+    m_canvas->setNeedsDisplay();
 }
 
-std::vector<Point> Board::emptyPlaces() const
+void Board::resize(int width, int height)
 {
-    std::mt19937 random(11);
-    const auto &strokes = m_controller->drawingCanvasModel()->pathArray();
-    std::vector<Point> places;
-    while (places.size() < placesWanted) {
-        const Point point { anyUpTo(random, width), anyUpTo(random, height) };
-        const auto hit = strokes.firstIndexWhere(
-            [point](const StrokeEntry &entry) { return strokeContains(*entry.bPath, point); });
-        if (!hit)
-            places.push_back(point);
-    }
-    return places;
+    m_window->drawingWindow()->resize(width, height);
 }
 
-void Board::send(QEvent::Type type, Point point)
+DrawingCanvasModel &Board::model() const
 {
-    const QPointF position(point.x, m_canvas->QWidget::height() - point.y);
-    const bool isPress = type == QEvent::MouseButtonPress;
-    QMouseEvent event(type, position, m_canvas->mapToGlobal(position),
-        isPress ? Qt::LeftButton : Qt::NoButton, Qt::LeftButton, Qt::NoModifier);
-    QCoreApplication::sendEvent(m_canvas, &event);
+    return *m_controller->drawingCanvasModel();
+}
+
+const EntryList<StrokeEntry> &Board::strokes() const
+{
+    return model().pathArray();
+}
+
+double Board::scale() const
+{
+    return m_canvas->devicePixelRatioF();
 }
 
 } // namespace penwick::bench

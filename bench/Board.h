@@ -1,69 +1,76 @@
 // SPDX-License-Identifier: MIT
-// A canvas with many strokes in a window, and a pointer whose every event is carried through to
-// what is painted.
+// A white board as a host opens it, and a pointer whose every event is carried through to what is
+// painted.
 #pragma once
 
-#include <penwick/platform/Geometry.h>
-#include <penwick/platform/Window.h>
+#include "Pen.h"
 
-#include <QEvent>
+#include <penwick/Penwick.h>
+#include <penwick/platform/Geometry.h>
+
+#include "history/CanvasContent.h"
 
 #include <memory>
-#include <random>
-#include <vector>
 
 class QString;
+class QWidget;
 
 namespace penwick {
 
 class DrawViewController;
 class DrawingCanvasModel;
 class DrawingCanvasView;
-class UndoRedoManager;
 
 namespace bench {
 
-constexpr int segmentsOfAStroke = 40;
-
-/// Draws `strokes` scribbles of 40 segments into `model`; the first ones are the same for every
-/// number.
-void scribble(DrawingCanvasModel &model, int strokes);
-
-/// A window of 1280 by 720 whose canvas holds a number of scribbles, all of them painted.
+/// A board whose canvas is 1280 by 720 points and holds scribbles of 40 segments, all painted.
+///
+/// Notifications are process-wide: while another board undoes, this one paints itself again too.
 class Board
 {
 public:
     explicit Board(int strokes);
     ~Board();
 
+    /// What the tool bar does: a drawing tool, or "clear", "undo", "redo".
     void choose(const QString &tool);
 
-    /// The pointer; nothing is painted before show().
+    /// The pointer; nothing is painted before paintMarked().
     void press(platform::Point point);
     void drag(platform::Point point);
 
-    /// Paints what is marked to be painted, and only that.
-    void show();
+    /// Draws a stroke of 40 segments with `pen`, as the pointer would, and shows it.
+    void draw(Pen &pen);
 
-    /// Takes the newest stroke back without painting anything.
-    void forgetNewestStroke();
+    /// Adds scribbles without a pointer, and shows them.
+    void scribble(Pen &pen, int strokes, int segments = segmentsOfAStroke);
 
-    /// Where the next segment of a scribble may lead.
-    [[nodiscard]] platform::Point nextPoint();
+    /// Marks the whole canvas to be painted again.
+    void expose();
+    void resize(int width, int height);
 
-    /// Places on which no stroke lies.
-    [[nodiscard]] std::vector<platform::Point> emptyPlaces() const;
+    [[nodiscard]] DrawingCanvasModel &model() const;
+    [[nodiscard]] const EntryList<StrokeEntry> &strokes() const;
+    /// Pixels a point.
+    [[nodiscard]] double scale() const;
 
 private:
-    void send(QEvent::Type type, platform::Point point);
-
-    platform::Window m_window;
-    DrawingCanvasView *m_canvas = nullptr;
+    Penwick m_penwick;
+    std::shared_ptr<DrawingWindowController> m_window;
     DrawViewController *m_controller = nullptr;
-    std::unique_ptr<DrawingCanvasView> m_notShown;
-    std::mt19937 m_random { 1 };
-    platform::Point m_point { 300.0, 300.0 };
+    DrawingCanvasView *m_canvas = nullptr;
 };
+
+/// A press or, with the left button held, a move at `point`, counted upwards from the bottom left
+/// corner of `widget`.
+void sendPress(QWidget &widget, platform::Point point);
+void sendDrag(QWidget &widget, platform::Point point);
+
+/// Paints what is marked to be painted, and only that.
+void paintMarked();
+
+/// Does whatever else waits in the event loop, so that no measurement pays for it.
+void settle();
 
 } // namespace bench
 } // namespace penwick

@@ -1,175 +1,123 @@
 // SPDX-License-Identifier: MIT
-// How long what the pointer does takes as a drawing grows, and what a segment costs in memory.
-#include "Board.h"
-#include "RatioTable.h"
-
-#include "appearance/PenwickBundle.h"
-#include "canvas/DrawingCanvasModel.h"
-#include "history/UndoRedoManager.h"
-
-#include <benchmark/benchmark.h>
+// Measures what people feel of a drawing program, and holds it against what is to be reached.
+#include "Accuracy.h"
+#include "FigureTable.h"
+#include "Growth.h"
 
 #include <QApplication>
+#include <QCommandLineParser>
+#include <QProcess>
+#include <QTemporaryFile>
 
-#include <chrono>
 #include <cstdio>
-#include <map>
-#include <memory>
-#include <string>
-#include <vector>
-
-#ifdef PENWICK_HAS_MALLINFO2
-#include <malloc.h>
-#endif
+#include <string_view>
+#include <utility>
 
 namespace {
 
-using penwick::bench::Board;
+using namespace penwick::bench;
 
-constexpr int emptyCanvas = 0;
-constexpr int largeCanvas = 1'000;
-constexpr int hugeCanvas = 10'000;
-constexpr int repetitions = 5;
+// In the order of the table.
+constexpr std::pair<const char *, Figures (*)()> sections[] {
+    { "drag", dragFigures },
+    { "longstroke", longStrokeFigures },
+    { "eraser", eraserFigures },
+    { "history", historyFigures },
+    { "window", windowFigures },
+    { "memory", memoryFigures },
+    { "idle", idleFigures },
+    { "opening", openingFigures },
+};
 
-// Made once: painting the largest for the first time takes seconds.
-std::map<int, std::unique_ptr<Board>> &boards()
+/// The next application has one screen, of 1920 by 1080 points, that is not there. The file that
+/// says so must outlive it.
+void prepareScreen(QTemporaryFile &file, int scale)
 {
-    static std::map<int, std::unique_ptr<Board>> made;
-    return made;
+    const QByteArray width = QByteArray::number(1920 * scale);
+    const QByteArray height = QByteArray::number(1080 * scale);
+    file.open();
+    file.write(R"({"screens": [{"name": "screen", "x": 0, "y": 0, "width": )" + width
+        + R"(, "height": )" + height + R"(, "logicalDpi": 96, "logicalBaseDpi": 96, "dpr": 1}]})");
+    file.flush();
+    qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + file.fileName().toLocal8Bit());
+    qputenv("QT_SCALE_FACTOR", QByteArray::number(scale));
 }
 
-Board &boardOf(const benchmark::State &state)
+/// One scale in this process; what is measured goes to standard output line by line.
+void measure(int scale, const QString &only)
 {
-    return *boards().at(static_cast<int>(state.range(0)));
+    for (const auto &[name, figuresOf] : sections) {
+        if (!only.isEmpty() && only != QLatin1String(name))
+            continue;
+        std::fprintf(stderr, "scale %d: %s\n", scale, name);
+        for (const Figure &figure : figuresOf())
+            std::printf("%s\n", lineOf({ scale, figure }).c_str());
+        std::fflush(stdout);
+    }
 }
 
-void brushDrag(benchmark::State &state)
+/// Every scale in a process of its own, because a process has one; then the table.
+int measureAll(const QString &only)
 {
-    using Clock = std::chrono::steady_clock;
-    Board &board = boardOf(state);
-    board.choose(QStringLiteral("brush"));
-    board.press(board.nextPoint());
-    board.drag(board.nextPoint());
-    board.show(); // with whatever else was still to be painted
-    int segments = 1;
-    for (auto _ : state) {
-        if (++segments > penwick::bench::segmentsOfAStroke) {
-            board.forgetNewestStroke();
-            board.press(board.nextPoint());
-            segments = 1;
+    std::vector<ScaledFigure> figures;
+    for (const int scale : { 1, 2 }) {
+        QProcess process;
+        process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+        QStringList arguments { QStringLiteral("--scale"), QString::number(scale) };
+        if (!only.isEmpty())
+            arguments << QStringLiteral("--only") << only;
+        process.start(QCoreApplication::applicationFilePath(), arguments);
+        process.waitForFinished(-1);
+        if (process.exitStatus() != QProcess::NormalExit || process.exitCode() != 0)
+            return EXIT_FAILURE;
+        for (const QByteArray &line : process.readAllStandardOutput().split('\n')) {
+            if (const auto figure = figureFrom(line.toStdString()))
+                figures.push_back(*figure);
         }
-        const penwick::platform::Point point = board.nextPoint();
-        const auto start = Clock::now();
-        board.drag(point);
-        board.show();
-        state.SetIterationTime(std::chrono::duration<double>(Clock::now() - start).count());
     }
-    board.forgetNewestStroke();
+    return printTable(figures) ? EXIT_SUCCESS : EXIT_FAILURE;
 }
 
-void eraserMiss(benchmark::State &state)
+int scaleFrom(int argc, char **argv)
 {
-    // Where nothing lies on the largest canvas, nothing lies on the others.
-    static const auto places = boards().at(hugeCanvas)->emptyPlaces();
-    Board &board = boardOf(state);
-    board.choose(QStringLiteral("eraser"));
-    board.press(places.front());
-    board.show(); // what the other canvases' undo, which everybody hears of, has marked
-    std::size_t next = 0;
-    for (auto _ : state) {
-        board.drag(places[next++ % places.size()]);
-        board.show();
+    for (int index = 1; index + 1 < argc; ++index) {
+        if (std::string_view(argv[index]) == "--scale")
+            return std::max(1, std::atoi(argv[index + 1]));
     }
-}
-
-void undoAndRedo(benchmark::State &state)
-{
-    Board &board = boardOf(state);
-    board.choose(QStringLiteral("brush"));
-    board.press(board.nextPoint());
-    for (int left = penwick::bench::segmentsOfAStroke; left > 0; --left)
-        board.drag(board.nextPoint());
-    board.show();
-    for (auto _ : state) {
-        board.choose(QStringLiteral("undo"));
-        board.show();
-        board.choose(QStringLiteral("redo"));
-        board.show();
-    }
-    board.forgetNewestStroke();
-}
-
-BENCHMARK(brushDrag)
-    ->Arg(emptyCanvas)
-    ->Arg(largeCanvas)
-    ->Arg(hugeCanvas)
-    ->UseManualTime()
-    ->MinTime(0.2)
-    ->Repetitions(repetitions)
-    ->ReportAggregatesOnly()
-    ->Unit(benchmark::kMicrosecond);
-BENCHMARK(eraserMiss)
-    ->Arg(emptyCanvas)
-    ->Arg(largeCanvas)
-    ->Arg(hugeCanvas)
-    ->MinTime(0.2)
-    ->Repetitions(repetitions)
-    ->ReportAggregatesOnly()
-    ->Unit(benchmark::kMicrosecond);
-// Both repaint the whole canvas: once is enough on the largest.
-BENCHMARK(undoAndRedo)
-    ->Arg(emptyCanvas)
-    ->Arg(largeCanvas)
-    ->Arg(hugeCanvas)
-    ->Iterations(1)
-    ->Repetitions(repetitions)
-    ->ReportAggregatesOnly()
-    ->Unit(benchmark::kMicrosecond);
-
-void printMemory()
-{
-#ifdef PENWICK_HAS_MALLINFO2
-    const auto inUse = [] {
-        const struct mallinfo2 info = ::mallinfo2();
-        return static_cast<double>(info.uordblks + info.hblkhd);
-    };
-    const double before = inUse();
-    const auto model = std::make_shared<penwick::DrawingCanvasModel>();
-    const auto history = std::make_shared<penwick::UndoRedoManager>();
-    history->setDrawingCanvasModel(model);
-    model->setUndoRedoManager(history);
-    penwick::bench::scribble(*model, hugeCanvas);
-    const double segments = static_cast<double>(hugeCanvas) * penwick::bench::segmentsOfAStroke;
-    std::printf("Memory of a segment, its part of stroke and record included: %.1f bytes\n",
-        (inUse() - before) / segments);
-#else
-    std::printf("Memory of a segment: not measured with this C library\n");
-#endif
+    return 1;
 }
 
 } // namespace
 
 int main(int argc, char **argv)
 {
-    qputenv("QT_QPA_PLATFORM", "offscreen");
+    QTemporaryFile screen;
+    const int scale = scaleFrom(argc, argv); // needed before there is an application
+    prepareScreen(screen, scale);
     const QApplication application(argc, argv);
-    // In turn, so that a machine that grows slower does so for every canvas.
-    std::string interleaving = "--benchmark_enable_random_interleaving=true";
-    std::vector<char *> arguments(argv, argv + argc);
-    arguments.insert(arguments.begin() + 1, interleaving.data());
-    int count = static_cast<int>(arguments.size());
-    benchmark::Initialize(&count, arguments.data());
-    if (benchmark::ReportUnrecognizedArguments(count, arguments.data()))
-        return 1;
-    penwick::setPenwickBundle(
-        std::make_shared<penwick::platform::Bundle>(QStringLiteral(":/penwick/images")));
-    for (const int strokes : { emptyCanvas, largeCanvas, hugeCanvas })
-        boards()[strokes] = std::make_unique<Board>(strokes);
+    QCommandLineParser parser;
+    const QCommandLineOption scaleOption(QStringLiteral("scale"),
+        QStringLiteral("Measure at <pixels> a point only, and print lines for the table."),
+        QStringLiteral("pixels"));
+    const QCommandLineOption onlyOption(QStringLiteral("only"),
+        QStringLiteral("Measure one part: drag, longstroke, eraser, history, window, memory, "
+                       "idle or opening."),
+        QStringLiteral("part"));
+    const QCommandLineOption growthOption(QStringLiteral("growth"),
+        QStringLiteral("Print, as CSV, how costs grow up to 100,000 strokes."));
+    const QCommandLineOption accuracyOption(
+        QStringLiteral("accuracy"), QStringLiteral("Print how true the edges of strokes are."));
+    parser.addOptions({ scaleOption, onlyOption, growthOption, accuracyOption });
+    parser.addHelpOption();
+    parser.process(application);
 
-    penwick::bench::RatioTable table;
-    benchmark::RunSpecifiedBenchmarks(&table);
-    table.print();
-    printMemory();
-    boards().clear();
-    return 0;
+    if (parser.isSet(growthOption))
+        printGrowth();
+    else if (parser.isSet(accuracyOption))
+        printAccuracy();
+    else if (parser.isSet(scaleOption))
+        measure(scale, parser.value(onlyOption));
+    else
+        return measureAll(parser.value(onlyOption));
+    return EXIT_SUCCESS;
 }

@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: MIT
+// What the eraser costs where nothing lies and where something does, and what it paints again.
+#include "Board.h"
+#include "Figure.h"
+#include "Turns.h"
+
+#include "strokes/StrokePainter.h"
+#include "strokes/StrokePicture.h"
+
+#include <QString>
+
+#include <algorithm>
+
+namespace penwick::bench {
+
+namespace {
+
+constexpr int manyStrokes = 10'000;
+constexpr int eventsAtOnce = 64;
+constexpr int rounds = 400;
+
+Figure missFigure()
+{
+    Board full(manyStrokes);
+    Board empty(0);
+    const auto places = freePlaces();
+    const auto missOn = [&places](Board &board) {
+        return [&places, &board](int number) {
+            for (int event = 0; event < eventsAtOnce; ++event) {
+                const int place = number * eventsAtOnce + event;
+                board.drag(places[static_cast<std::size_t>(place) % places.size()]);
+                paintMarked();
+            }
+        };
+    };
+    Turns turns;
+    const auto onFull = turns.add(missOn(full), eventsAtOnce);
+    const auto onEmpty = turns.add(missOn(empty), eventsAtOnce);
+    for (Board *const board : { &full, &empty }) {
+        board->choose(QStringLiteral("eraser"));
+        board->press(places.front());
+    }
+    settle();
+    turns.take(rounds);
+    return timeOf("3 eraser where nothing lies: 10,000 strokes against none", turns.of(onFull),
+        turns.of(onEmpty), { 5.0, 3.0 });
+}
+
+/// How many pixels of a picture are written when the stroke at `index` goes: those that do not
+/// have a colour any more which no stroke has.
+double pixelsPaintedWithout(const Board &board, int index, const QRect &area)
+{
+    const QSize size = QSize(canvasWidth, canvasHeight) * board.scale();
+    StrokePicture picture;
+    picture.follow(board.strokes());
+    picture.update(size, board.scale());
+    constexpr QRgb untouched = 0x01010101;
+    const QImage &image = picture.pixels().image();
+    // The picture gives nobody its pixels to write to. Lines of an image that nobody shares may
+    // be written all the same.
+    for (int y = 0; y < image.height(); ++y) {
+        auto *const line = reinterpret_cast<QRgb *>(const_cast<uchar *>(image.constScanLine(y)));
+        std::fill_n(line, image.width(), untouched);
+    }
+    EntryList<StrokeEntry> without = board.strokes();
+    without.removeAt(index);
+    picture.follow(without);
+    picture.update(size, board.scale());
+
+    double painted = 0.0;
+    for (int y = 0; y < image.height(); ++y) {
+        const auto *const line = reinterpret_cast<const QRgb *>(image.constScanLine(y));
+        painted += static_cast<double>(
+            image.width() - std::count(line, line + image.width(), untouched));
+    }
+    return painted / (static_cast<double>(area.width()) * area.height());
+}
+
+Figure paintedFigure()
+{
+    const Board board(manyStrokes);
+    const int index = manyStrokes / 2;
+    const QRect area = pixelsOf(board.strokes()[index], board.scale());
+    return { "3 pixels painted again by an erasure, in the stroke's rectangles", "",
+        pixelsPaintedWithout(board, index, area), std::nullopt, { 1.0, std::nullopt } };
+}
+
+} // namespace
+
+Figures eraserFigures()
+{
+    return { missFigure(), paintedFigure() };
+}
+
+} // namespace penwick::bench

@@ -1,0 +1,81 @@
+// SPDX-License-Identifier: MIT
+#include "Pen.h"
+
+#include "canvas/DrawingCanvasModel.h"
+
+#include <QColor>
+
+#include <algorithm>
+#include <cmath>
+
+namespace penwick::bench {
+
+namespace {
+
+using platform::Point;
+
+constexpr double thickness = 5.0;
+constexpr double gap = 80.0; // between free places, along each axis
+constexpr double freeRadius = 9.0; // a step across it keeps half a thickness from its centre
+
+bool isFree(Point point)
+{
+    const auto away
+        = [](double coordinate) { return coordinate - (std::floor(coordinate / gap) + 0.5) * gap; };
+    return std::hypot(away(point.x), away(point.y)) < freeRadius;
+}
+
+} // namespace
+
+Pen::Pen(unsigned seed, double longestStep)
+    : m_random(seed)
+    , m_longestStep(longestStep)
+{ }
+
+double Pen::anyUpTo(double most)
+{
+    return std::uniform_real_distribution<double>(0.0, most)(m_random);
+}
+
+Point Pen::putDown()
+{
+    do {
+        m_point = { anyUpTo(canvasWidth), anyUpTo(canvasHeight) };
+    } while (isFree(m_point));
+    return m_point;
+}
+
+Point Pen::next()
+{
+    const Point from = m_point;
+    const auto step = [this] { return anyUpTo(2 * m_longestStep) - m_longestStep; };
+    do {
+        const double x = from.x + step();
+        const double y = from.y + step();
+        m_point
+            = { std::clamp(x, 0.0, double(canvasWidth)), std::clamp(y, 0.0, double(canvasHeight)) };
+    } while (isFree(m_point));
+    return m_point;
+}
+
+std::vector<Point> freePlaces()
+{
+    std::vector<Point> places;
+    for (double x = gap / 2; x < canvasWidth; x += gap) {
+        for (double y = gap / 2; y < canvasHeight; y += gap)
+            places.push_back({ x, y });
+    }
+    return places;
+}
+
+void scribble(DrawingCanvasModel &model, Pen &pen, int strokes, int segments)
+{
+    const QColor color(41, 41, 41, 178);
+    for (int stroke = 0; stroke < strokes; ++stroke) {
+        model.createPathWithParam(color, thickness, pen.putDown());
+        for (int segment = 0; segment < segments; ++segment)
+            model.updateTheCurrentPath(pen.next());
+    }
+}
+
+} // namespace penwick::bench
