@@ -77,6 +77,11 @@ void Board::choose(const QString &tool)
     m_controller->handleToolSelection(tool);
 }
 
+void Board::takePointer()
+{
+    m_canvas->cursorType().set(*m_canvas);
+}
+
 void Board::press(Point point)
 {
     sendPress(*m_canvas, point);

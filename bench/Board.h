@@ -35,6 +35,9 @@ public:
     /// What the tool bar does: a drawing tool, or "clear", "undo", "redo".
     void choose(const QString &tool);
 
+    /// The pointer comes over the canvas. Its shape is the process's: with two boards, each would
+    /// give it its own again at every event, as no pointer makes them do.
+    void takePointer();
     /// The pointer; nothing is painted before paintMarked().
     void press(platform::Point point);
     void drag(platform::Point point);

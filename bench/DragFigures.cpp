@@ -25,14 +25,18 @@ Figures dragFigures()
     Pen pen(1);
     platform::Point point;
     Turns turns;
-    const auto onFull = turns.add([&](int) {
-        full.drag(point);
-        paintMarked();
-    });
-    const auto onEmpty = turns.add([&](int) {
-        empty.drag(point);
-        paintMarked();
-    });
+    const auto onFull = turns.add(
+        [&](int) {
+            full.drag(point);
+            paintMarked();
+        },
+        [&full] { full.takePointer(); });
+    const auto onEmpty = turns.add(
+        [&](int) {
+            empty.drag(point);
+            paintMarked();
+        },
+        [&empty] { empty.takePointer(); });
     const auto onFloor = turns.add([&](int) {
         floor.drag(point);
         paintMarked();

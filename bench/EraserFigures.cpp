@@ -34,8 +34,10 @@ Figure missFigure()
         };
     };
     Turns turns;
-    const auto onFull = turns.add(missOn(full), eventsAtOnce);
-    const auto onEmpty = turns.add(missOn(empty), eventsAtOnce);
+    const auto onFull = turns.add(
+        missOn(full), [&full] { full.takePointer(); }, eventsAtOnce);
+    const auto onEmpty = turns.add(
+        missOn(empty), [&empty] { empty.takePointer(); }, eventsAtOnce);
     for (Board *const board : { &full, &empty }) {
         board->choose(QStringLiteral("eraser"));
         board->press(places.front());

@@ -49,7 +49,7 @@ double missTime(Board &board)
                 paintMarked();
             }
         },
-        missesAtOnce);
+        {}, missesAtOnce);
     board.choose(QStringLiteral("eraser"));
     board.press(places.front());
     settle();

@@ -22,17 +22,41 @@ using namespace std::chrono_literals;
 constexpr auto idleTime = 10s;
 constexpr auto settlingTime = 1s; // for whatever goes on when a window has opened
 
-/// How often a thread of this process has gone to sleep because it had nothing to do.
-long sleeps()
+/// How often a thread of this process went to sleep because it had nothing to do, and so how often
+/// one was to be woken.
+class Sleeps
 {
+public:
+    Sleeps()
+    {
+        m_connection = QObject::connect(QAbstractEventDispatcher::instance(),
+            &QAbstractEventDispatcher::aboutToBlock, [this] { ++m_blocks; });
+    }
+    ~Sleeps() { QObject::disconnect(m_connection); }
+
+    [[nodiscard]] long count() const
+    {
 #ifdef PENWICK_HAS_GETRUSAGE
-    rusage usage {};
-    ::getrusage(RUSAGE_SELF, &usage);
-    return usage.ru_nvcsw;
+        return ofAllThreads() - m_atFirst;
 #else
-    return 0;
+        return m_blocks; // of the event loop alone, which may only have thought of sleeping
 #endif
-}
+    }
+
+private:
+#ifdef PENWICK_HAS_GETRUSAGE
+    static long ofAllThreads()
+    {
+        rusage usage {};
+        ::getrusage(RUSAGE_SELF, &usage);
+        return usage.ru_nvcsw;
+    }
+
+    const long m_atFirst = ofAllThreads();
+#endif
+    QMetaObject::Connection m_connection;
+    long m_blocks = 0;
+};
 
 void runEventLoop(std::chrono::milliseconds time)
 {
@@ -50,20 +74,16 @@ Figures idleFigures()
     board.draw(pen);
     runEventLoop(settlingTime);
 
-    long blocks = 0;
-    const auto connection = QObject::connect(QAbstractEventDispatcher::instance(),
-        &QAbstractEventDispatcher::aboutToBlock, [&blocks] { ++blocks; });
-    const long sleepsBefore = sleeps();
+    const Sleeps sleeps;
     const Stopwatch watch;
     runEventLoop(idleTime);
     const double cpu = watch.elapsed().cpu;
-    const long slept = sleeps() - sleepsBefore;
-    QObject::disconnect(connection);
+    const double slept = static_cast<double>(sleeps.count());
 
     // The end of the ten seconds is a wake-up too, and it is ours.
-    const double wakeUps = static_cast<double>(std::max({ blocks - 1, slept - 1, 0L }));
     return {
-        { "7 wake-ups in 10 s of idling", "", wakeUps, std::nullopt, { 0.0, std::nullopt } },
+        { "7 wake-ups in 10 s of idling", "", std::max(slept - 1.0, 0.0), std::nullopt,
+            { 0.0, std::nullopt } },
         { "7 processor time in 10 s of idling", "us", cpu, std::nullopt, {} },
     };
 }

@@ -31,14 +31,18 @@ Figures longStrokeFigures()
     settle();
 
     Turns turns;
-    const auto end = turns.add([&](int) {
-        atEnd.drag(point);
-        paintMarked();
-    });
-    const auto start = turns.add([&](int) {
-        atStart.drag(point);
-        paintMarked();
-    });
+    const auto end = turns.add(
+        [&](int) {
+            atEnd.drag(point);
+            paintMarked();
+        },
+        [&atEnd] { atEnd.takePointer(); });
+    const auto start = turns.add(
+        [&](int) {
+            atStart.drag(point);
+            paintMarked();
+        },
+        [&atStart] { atStart.takePointer(); });
     for (int segment = 0; segment < segmentsMeasured; ++segment) {
         if (segment % segmentsOfAStart == 0) {
             atStart.choose(QStringLiteral("clear"));

@@ -18,9 +18,10 @@ public:
     /// Does one event; it is told which one.
     using Event = std::function<void(int number)>;
 
-    /// Adds something to be measured, and gives its place. `events` is how many events one call
-    /// does; many where a single one is too short for the clock.
-    std::size_t add(Event event, int events = 1);
+    /// Adds something to be measured, and gives its place. `prepare` comes before each event and
+    /// is not measured. `events` is how many events one call does; many where a single one is too
+    /// short for the clock.
+    std::size_t add(Event event, std::function<void()> prepare = {}, int events = 1);
 
     /// Lets each do an event, `rounds` times; a different one begins every round.
     void take(int rounds);
@@ -32,6 +33,7 @@ private:
     struct Measured
     {
         Event event;
+        std::function<void()> prepare;
         int events = 1;
         Samples samples;
     };
