@@ -43,6 +43,13 @@ void prepareScreen(QTemporaryFile &file, int scale)
     qputenv("QT_SCALE_FACTOR", QByteArray::number(scale));
 }
 
+/// Without the screen plug-in's word, for each window, that it raises none.
+void printProblem(QtMsgType type, const QMessageLogContext &, const QString &message)
+{
+    if (type != QtDebugMsg && type != QtInfoMsg && !message.contains(QLatin1String("raise()")))
+        std::fprintf(stderr, "%s\n", message.toLocal8Bit().constData());
+}
+
 /// One scale in this process; what is measured goes to standard output line by line.
 void measure(int scale, const QString &only)
 {
@@ -94,6 +101,7 @@ int main(int argc, char **argv)
     QTemporaryFile screen;
     const int scale = scaleFrom(argc, argv); // needed before there is an application
     prepareScreen(screen, scale);
+    qInstallMessageHandler(printProblem);
     const QApplication application(argc, argv);
     QCommandLineParser parser;
     const QCommandLineOption scaleOption(QStringLiteral("scale"),
