@@ -10,7 +10,7 @@ namespace penwick::bench {
 
 namespace {
 
-constexpr const char *rowFormat = "| %-60s | %5s | %11s | %11s | %11s | %7s | %-21s | %-3s |\n";
+constexpr const char *rowFormat = "| %-64s | %5s | %11s | %11s | %11s | %7s | %-27s | %-3s |\n";
 
 std::string fixed(double value, int decimals)
 {
