@@ -19,6 +19,7 @@ class QScreen;
 
 namespace penwick {
 
+class DrawViewController;
 class ToolPanelWindowController;
 
 /// Builds and places the drawing window and announces the end of the session when it closes.
@@ -86,6 +87,7 @@ public:
     bool keyDown(const QKeyEvent &event) override;
 
 private:
+    [[nodiscard]] DrawViewController &content() const;
     void coverScreen(const QScreen &screen);
     void showBoardBorder();
     void placeAsBoard(const platform::Rect &frame);

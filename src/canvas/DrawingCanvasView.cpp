@@ -15,6 +15,7 @@ using platform::require;
 
 constexpr double initialThickness = 5.0; // points
 constexpr double initialFontSize = 24.0; // points
+constexpr double widestHairline = 1.5; // pixels
 constexpr float strokeOpacity = 0.7F; // of every stroke, whatever its colour
 
 } // namespace
@@ -39,16 +40,16 @@ DrawingCanvasView::~DrawingCanvasView() = default;
 void DrawingCanvasView::setPathArray(const EntryList<StrokeEntry> &strokes)
 {
     m_pathArray = strokes;
-    markPixels(m_picture.follow(m_pathArray));
+    markHairline(m_picture.follow(m_pathArray));
     m_hasDroppedEntry = false;
 }
 
 // The controller marks what a segment needs; the smooth edge of a hairline reaches farther.
-void DrawingCanvasView::markPixels(const QRect &pixels)
+void DrawingCanvasView::markHairline(const QRect &pixels)
 {
-    if (pixels.isEmpty())
-        return;
     const double scale = QWidget::devicePixelRatioF();
+    if (pixels.isEmpty() || m_pathArray.last().bPath->lineWidth() * scale > widestHairline)
+        return;
     const double height = QWidget::height();
     const QRectF area(pixels.x() / scale, height - (pixels.bottom() + 1) / scale,
         pixels.width() / scale, pixels.height() / scale);
@@ -194,21 +195,35 @@ void DrawingCanvasView::resetCursorRects()
     addCursorRect(bounds(), m_cursorType);
 }
 
+void DrawingCanvasView::setCoversWindow(bool covers)
+{
+    m_coversWindow = covers;
+    surface().setAttribute(Qt::WA_OpaquePaintEvent, covers);
+}
+
 void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)
 {
     const double scale = QWidget::devicePixelRatioF();
     const QSize size = (QSizeF(QWidget::size()) * scale).toSize();
+    const QColor paper
+        = m_coversWindow && window() ? window()->attributes().backgroundColor : Qt::transparent;
     m_picture.follow(m_pathArray); // a click may have dropped an entry
-    m_picture.update(size, scale);
-    const PixelLayer &pixels = m_picture.pixels();
+    m_picture.update(size, scale, paper);
 
+    QPainter painter(&surface());
+    if (m_coversWindow)
+        painter.setCompositionMode(QPainter::CompositionMode_Source);
+    const PixelLayer &pixels = m_picture.pixels();
+    if (pixels.area().isEmpty()) {
+        painter.fillRect(surface().rect(), paper);
+        return;
+    }
     // A pixel more than marked on every side: what is too much is clipped away.
     const platform::Rect dirty = dirtyRect.grownBy(1.0);
     const QRect area
         = QRectF(dirty.x * scale, dirty.y * scale, dirty.width * scale, dirty.height * scale)
               .toAlignedRect()
-        & QRect(QPoint(), size) & pixels.area();
-    QPainter painter(&surface());
+        & QRect(QPoint(), size);
     painter.scale(1 / scale, 1 / scale); // pixel for pixel, no matter how many make a point
     painter.drawImage(QPoint(area.x(), size.height() - area.y() - area.height()), pixels.image(),
         pixels.inImage(area));

@@ -56,6 +56,10 @@ public:
     [[nodiscard]] const platform::Cursor &cursorType() const { return m_cursorType; }
     void setCursorType(const platform::Cursor &cursor) { m_cursorType = cursor; }
 
+    /// Tells that nothing lies between the canvas and its window, so that it may paint the window's
+    /// background itself, together with the strokes.
+    void setCoversWindow(bool covers);
+
     /// The window in which the tool bar shows its options; null where there is none. Weak.
     [[nodiscard]] platform::Window *popoverWindow() const { return m_popoverWindow; }
     void setPopoverWindow(platform::Window *window) { m_popoverWindow = window; }
@@ -77,7 +81,7 @@ private:
     [[nodiscard]] DrawingCanvasModel &model() const;
     void dropEntryOfClick();
     void takeArraysAnew();
-    void markPixels(const QRect &pixels);
+    void markHairline(const QRect &pixels);
     void showStrokes(const platform::Rect &dirtyRect);
 
     platform::Point m_lastPoint;
@@ -94,6 +98,7 @@ private:
     platform::Cursor m_cursorType = platform::Cursor::arrow();
     QPointer<platform::Window> m_popoverWindow;
     platform::WeakReference<DrawingCanvasDelegate> m_drawingCanvasDelegate;
+    bool m_coversWindow = false;
     bool m_hasDroppedEntry = false; // the copy lacks what a click without a drag dropped
 };
 

@@ -3,11 +3,22 @@
 
 #include <QPainter>
 
+#include <algorithm>
+
 namespace penwick::platform {
+
+bool Layer::hasBorderIn(const QRectF &part, const QRectF &bounds) const
+{
+    if (borderWidth <= 0.0 || borderColor.alpha() == 0)
+        return false;
+    constexpr double softEdge = 1.0; // points
+    const double depth = std::max(borderWidth, cornerRadius) + softEdge;
+    return !bounds.adjusted(depth, depth, -depth, -depth).contains(part);
+}
 
 void Layer::paintBackground(QPainter &painter, const QRectF &bounds) const
 {
-    if (backgroundColor.alpha() == 0)
+    if (!hasBackground())
         return;
     painter.setRenderHint(QPainter::Antialiasing, cornerRadius > 0.0);
     painter.setPen(Qt::NoPen);
@@ -17,7 +28,7 @@ void Layer::paintBackground(QPainter &painter, const QRectF &bounds) const
 
 void Layer::paintBorder(QPainter &painter, const QRectF &bounds) const
 {
-    if (borderWidth <= 0.0 || borderColor.alpha() == 0)
+    if (!hasBorderIn(bounds, bounds))
         return;
     const double inset = borderWidth / 2;
     const double radius = cornerRadius > inset ? cornerRadius - inset : 0.0;

@@ -18,6 +18,9 @@ struct Layer
     double borderWidth = 0.0; ///< points
     double cornerRadius = 0.0; ///< points; rounds the background and the border
 
+    [[nodiscard]] bool hasBackground() const { return backgroundColor.alpha() > 0; }
+    /// Whether anything of the border along the inside of `bounds` lies in `part` of them.
+    [[nodiscard]] bool hasBorderIn(const QRectF &part, const QRectF &bounds) const;
     /// Fills `bounds`, in the painter's own coordinates, with the background.
     void paintBackground(QPainter &painter, const QRectF &bounds) const;
     /// Draws the border along the inside of `bounds`.

@@ -82,14 +82,15 @@ protected:
     {
         Layer *const ownLayer = layer();
         const QRectF area(surface().rect());
-        if (ownLayer) {
+        const QRect dirty = event->region().boundingRect();
+        if (ownLayer && ownLayer->hasBackground()) {
             QPainter painter(&surface());
             ownLayer->paintBackground(painter, area);
         }
         m_paintEvent = event;
-        draw(fromSurface(event->region().boundingRect()));
+        draw(fromSurface(dirty));
         m_paintEvent = nullptr;
-        if (ownLayer) {
+        if (ownLayer && ownLayer->hasBorderIn(dirty, area)) {
             QPainter painter(&surface());
             ownLayer->paintBorder(painter, area);
         }

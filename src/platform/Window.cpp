@@ -115,6 +115,8 @@ void Window::applyAttributes()
             show();
     }
     update();
+    if (m_contentView) // it may show the background itself
+        m_contentView->setNeedsDisplay();
 }
 
 // Content

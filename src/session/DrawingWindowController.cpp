@@ -209,6 +209,7 @@ void DrawingWindowController::coverScreen(const QScreen &screen)
 void DrawingWindowController::placeAsBoard(const Rect &frame)
 {
     showBoardBorder();
+    content().drawingView()->setCoversWindow(true);
     m_drawingWindow->setFrame(frame, Animate::Yes);
 }
 
@@ -224,11 +225,14 @@ void DrawingWindowController::setAnnotationImage(
 {
     if (title)
         m_drawingWindow->setWindowTitle(*title);
-    auto *const content
-        = require(dynamic_cast<DrawViewController *>(m_drawingWindow->contentViewController()),
-            "the drawing window's content is no drawing");
-    content->configureAnnotatingImageView(image);
-    content->annotatedImageView()->setImageFrameStyle(platform::ImageFrameStyle::Photo);
+    content().configureAnnotatingImageView(image);
+    content().annotatedImageView()->setImageFrameStyle(platform::ImageFrameStyle::Photo);
+}
+
+DrawViewController &DrawingWindowController::content() const
+{
+    return *require(dynamic_cast<DrawViewController *>(m_drawingWindow->contentViewController()),
+        "the drawing window's content is no drawing");
 }
 
 void DrawingWindowController::placeToolBar()

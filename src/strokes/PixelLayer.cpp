@@ -3,8 +3,6 @@
 
 #include "strokes/CoverageMask.h"
 
-#include <QColor>
-
 #include <algorithm>
 
 namespace penwick {
@@ -26,10 +24,13 @@ inline std::uint32_t shareOf(std::uint32_t pixel, std::uint32_t share)
 
 } // namespace
 
-PixelLayer::PixelLayer(QSize size)
-    : m_image(size, QImage::Format_ARGB32_Premultiplied)
+// Without transparency where there can be none, so that showing it is plain copying.
+PixelLayer::PixelLayer(QSize size, const QColor &paper)
+    : m_image(
+        size, paper.alpha() == 255 ? QImage::Format_RGB32 : QImage::Format_ARGB32_Premultiplied)
+    , m_paper(qPremultiply(paper.rgba()))
 {
-    m_image.fill(Qt::transparent);
+    m_image.fill(m_paper);
 }
 
 QRect PixelLayer::inImage(const QRect &area) const
@@ -58,7 +59,7 @@ void PixelLayer::copy(const PixelLayer &other, const QRect &area)
 void PixelLayer::clear(const QRect &area)
 {
     for (int y = area.y(); y <= area.bottom(); ++y)
-        std::ranges::fill(row(area.x(), y, area.width()), 0U);
+        std::ranges::fill(row(area.x(), y, area.width()), m_paper);
 }
 
 void PixelLayer::blend(const CoverageMask &mask, const QColor &color, const QRect &area)

@@ -2,19 +2,19 @@
 // Painted pixels of a canvas.
 #pragma once
 
+#include <QColor>
 #include <QImage>
 #include <QRect>
 
 #include <cstdint>
 #include <span>
 
-class QColor;
-
 namespace penwick {
 
 class CoverageMask;
 
-/// A transparent picture of part of a canvas, from the canvas's bottom left corner on.
+/// A picture of part of a canvas, from the canvas's bottom left corner on. What nothing was painted
+/// on shows the paper: a colour, or nothing.
 ///
 /// Coordinates are device pixels and rows are counted upwards, as in CoverageMask, so that a pixel
 /// stays the same pixel however the canvas is resized. The alpha is premultiplied.
@@ -22,7 +22,7 @@ class PixelLayer
 {
 public:
     PixelLayer() = default;
-    explicit PixelLayer(QSize size);
+    explicit PixelLayer(QSize size, const QColor &paper = Qt::transparent);
 
     [[nodiscard]] QRect area() const { return { QPoint(), m_image.size() }; }
     /// The picture as it stands; its first line is the highest row.
@@ -32,7 +32,7 @@ public:
 
     /// Takes the pixels of `area` from `other`; of what lies outside of either, nothing.
     void copy(const PixelLayer &other, const QRect &area);
-    /// Makes `area`, which lies inside, transparent.
+    /// Leaves nothing but paper in `area`, which lies inside.
     void clear(const QRect &area);
     /// Lays `color` over the pixels of `area`, which lies inside both, as far as `mask` covers
     /// them.
@@ -42,6 +42,7 @@ private:
     [[nodiscard]] std::span<std::uint32_t> row(int x, int y, int width);
 
     QImage m_image;
+    std::uint32_t m_paper = 0;
 };
 
 } // namespace penwick

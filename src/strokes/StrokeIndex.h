@@ -8,6 +8,7 @@
 #include <penwick/platform/Geometry.h>
 
 #include <cstdint>
+#include <deque>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -55,7 +56,8 @@ private:
     void visit(const platform::Rect &area, Visit visit) const;
 
     EntryList<StrokeEntry> m_strokes;
-    std::vector<Place> m_places; // of all strokes but the newest, which may grow
+    // Of all strokes but the newest, which may grow. A deque has no room to spare.
+    std::deque<Place> m_places;
     std::uint32_t m_nextNumber = 0;
     std::unique_ptr<Tree> m_tree;
 };

@@ -5,8 +5,6 @@
 
 #include <penwick/platform/BezierPath.h>
 
-#include <QColor>
-
 namespace penwick {
 
 using platform::Rect;
@@ -142,13 +140,13 @@ QRect StrokePicture::addGrowth()
     return grown;
 }
 
-void StrokePicture::update(QSize size, double scale)
+void StrokePicture::update(QSize size, double scale, const QColor &paper)
 {
     if (strokes().isEmpty()) {
         m_scale = scale;
         return;
     }
-    resize(size, scale);
+    resize(size, scale, paper);
     addGrowth();
     paintMarked();
 }
@@ -163,13 +161,14 @@ void StrokePicture::forgetPixels()
     m_marked = {};
 }
 
-void StrokePicture::resize(QSize size, double scale)
+void StrokePicture::resize(QSize size, double scale, const QColor &paper)
 {
     const QSize wanted = roundedUp(size);
-    if (wanted == m_finished.area().size() && scale == m_scale)
+    const bool isSameGround = scale == m_scale && paper == m_paper;
+    if (wanted == m_finished.area().size() && isSameGround)
         return;
-    PixelLayer finished(wanted);
-    if (scale == m_scale && !m_finished.area().isEmpty()) {
+    PixelLayer finished(wanted, paper);
+    if (isSameGround && !m_finished.area().isEmpty()) {
         if (m_isNewestApart)
             settleNewest();
         finished.copy(m_finished, m_finished.area());
@@ -181,6 +180,7 @@ void StrokePicture::resize(QSize size, double scale)
         takeNewestApart();
     }
     m_scale = scale;
+    m_paper = paper;
     m_finished = finished;
     m_below = m_finished;
     m_newest.reset(m_finished.area());

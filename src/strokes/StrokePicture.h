@@ -6,6 +6,7 @@
 #include "strokes/PixelLayer.h"
 #include "strokes/StrokeIndex.h"
 
+#include <QColor>
 #include <QRect>
 #include <QRegion>
 
@@ -24,8 +25,8 @@ public:
     QRect follow(const EntryList<StrokeEntry> &strokes);
 
     /// Brings the pixels up to date for a canvas of `size` device pixels with `scale` pixels a
-    /// point.
-    void update(QSize size, double scale);
+    /// point, on `paper`.
+    void update(QSize size, double scale, const QColor &paper = Qt::transparent);
 
     /// The finished pixels, at least as large as the canvas, after update(); none at all where
     /// there are no strokes.
@@ -40,7 +41,7 @@ private:
     void forgetNewest();
     QRect addGrowth();
     void forgetPixels();
-    void resize(QSize size, double scale);
+    void resize(QSize size, double scale, const QColor &paper);
     void paintMarked();
     void paintPart(const QRect &part);
     [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_index.strokes(); }
@@ -48,6 +49,7 @@ private:
 
     StrokeIndex m_index;
     double m_scale = 0.0; // pixels a point
+    QColor m_paper = Qt::transparent;
     PixelLayer m_finished;
     QRegion m_marked; // where strokes came or went since they were painted
 

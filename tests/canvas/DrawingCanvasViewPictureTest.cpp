@@ -89,6 +89,26 @@ TEST_F(DrawingCanvasViewPictureTest, laterStrokesArePaintedOverEarlierOnes)
     EXPECT_LT(crossing.red(), 100);
 }
 
+TEST_F(DrawingCanvasViewPictureTest, canvasThatCoversItsWindowPaintsTheWindowsBackground)
+{
+    platform::WindowAttributes attributes = window.attributes();
+    attributes.backgroundColor = QColor(255, 220, 0);
+    window.setAttributes(attributes);
+    canvas->setCoversWindow(true);
+    settle();
+    EXPECT_EQ(onScreen().pixelColor(100, 100), QColor(255, 220, 0));
+
+    stroke({ { 50, 100.5 }, { 150, 100.5 } });
+    EXPECT_EQ(onScreen().pixelColor(100, 50), QColor(255, 220, 0));
+    EXPECT_EQ(onScreen().pixelColor(100, 99), QColor(105, 95, 29)); // 0.7 of (41, 41, 41) over it
+
+    attributes.backgroundColor = Qt::white; // the host may change its mind
+    window.setAttributes(attributes);
+    settle();
+    EXPECT_EQ(greyAt(onScreen(), { 100, 50 }), paper);
+    EXPECT_EQ(greyAt(onScreen(), { 100, 100 }), ink);
+}
+
 TEST_F(DrawingCanvasViewPictureTest, pieceByPieceTheScreenShowsWhatAFullRepaintGives)
 {
     stroke({ { 20, 20 }, { 250, 180 }, { 40, 170 } });

@@ -93,6 +93,22 @@ TEST(Layer, translucentBorderIsNowhereDarkerThanItsColour)
     EXPECT_EQ(counted(image, 3, 77), (Pixels { 156, 84, 0 }));
 }
 
+TEST(Layer, partInsideOfTheBorderHasNothingOfIt)
+{
+    const QRectF bounds(0.0, 0.0, 100.0, 60.0);
+    Layer layer { Qt::transparent, green, 3.0, 0.0 };
+
+    EXPECT_TRUE(layer.hasBorderIn(bounds, bounds));
+    EXPECT_TRUE(layer.hasBorderIn({ 2.0, 30.0, 5.0, 5.0 }, bounds));
+    EXPECT_TRUE(layer.hasBorderIn({ 50.0, 54.0, 5.0, 5.0 }, bounds));
+    EXPECT_FALSE(layer.hasBorderIn({ 4.0, 4.0, 92.0, 52.0 }, bounds));
+    layer.cornerRadius = 10.0; // rounds the corners, and so reaches farther in
+    EXPECT_TRUE(layer.hasBorderIn({ 4.0, 4.0, 5.0, 5.0 }, bounds));
+    EXPECT_FALSE(layer.hasBorderIn({ 11.0, 11.0, 5.0, 5.0 }, bounds));
+    layer.borderWidth = 0.0;
+    EXPECT_FALSE(layer.hasBorderIn(bounds, bounds));
+}
+
 TEST(Layer, backgroundFillsTheBounds)
 {
     const Layer layer { green, Qt::black, 0.0, 0.0 };

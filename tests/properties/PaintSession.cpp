@@ -32,6 +32,7 @@ constexpr int mostStrokes = 40; // then everything is cleared, so that steps sta
 
 PaintSession::PaintSession(std::uint32_t seed)
     : m_random(seed)
+    , m_coversWindow(seed % 2 == 0)
 {
     setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
     m_window.setFrame({ 20, 20, side, side });
@@ -41,6 +42,7 @@ PaintSession::PaintSession(std::uint32_t seed)
     m_controller = content.get();
     content->setDrawingView(m_canvas);
     content->setView(*m_canvas);
+    m_canvas->setCoversWindow(m_coversWindow);
     m_window.setContentViewController(std::move(content));
     m_window.show();
     QCoreApplication::processEvents();
@@ -174,8 +176,8 @@ void PaintSession::send(QEvent::Type type, Qt::MouseButton button)
 
 QImage PaintSession::onScreen()
 {
-    // Twice, because a text box shows its button, a view of its own, when it is painted; and without
-    // waiting until it is time for the next frame.
+    // Twice, because a text box shows its button, a view of its own, when it is painted; and
+    // without waiting until it is time for the next frame.
     for (int turn = 0; turn < 2; ++turn) {
         QCoreApplication::processEvents();
         QEvent paintWhatIsMarked(QEvent::UpdateRequest);
@@ -190,7 +192,7 @@ QImage PaintSession::paintedAnew() const
 {
     const double scale = m_window.devicePixelRatioF();
     const QSize size = (QSizeF(m_canvas->QWidget::size()) * scale).toSize();
-    PixelLayer layer(size);
+    PixelLayer layer(size, m_coversWindow ? QColor(m_paper) : QColor(Qt::transparent));
     CoverageMask scratch;
     const auto &strokes = m_controller->drawingCanvasModel()->pathArray();
     for (int index = 0; index < strokes.size(); ++index)

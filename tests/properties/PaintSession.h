@@ -58,6 +58,7 @@ private:
     void send(QEvent::Type type, Qt::MouseButton button);
 
     std::mt19937 m_random;
+    bool m_coversWindow; // as on a white board; else as over something else
     platform::Window m_window;
     DrawingCanvasView *m_canvas = nullptr;
     DrawViewController *m_controller = nullptr;
