@@ -5,9 +5,12 @@
 
 #include <penwick/platform/NotificationCenter.h>
 
+#include <QAbstractButton>
 #include <QApplication>
+#include <QCloseEvent>
 #include <QElapsedTimer>
-#include <QMouseEvent>
+#include <QKeyEvent>
+#include <QTextEdit>
 #include <QWindow>
 
 #include <algorithm>
@@ -46,29 +49,32 @@ bool processUntil(const std::function<bool()> &condition)
     return true;
 }
 
-void sendPointer(QWidget &canvas, QEvent::Type type, QPointF place)
-{
-    const bool isMove = type == QEvent::MouseMove;
-    QMouseEvent event(type, place, canvas.mapToGlobal(place),
-        isMove ? Qt::NoButton : Qt::LeftButton,
-        type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
-    QCoreApplication::sendEvent(&canvas, &event);
-}
-
-void drag(QWidget &canvas, QPointF from, QPointF way)
-{
-    constexpr int steps = 10;
-    sendPointer(canvas, QEvent::MouseButtonPress, from);
-    for (int step = 1; step <= steps; ++step)
-        sendPointer(canvas, QEvent::MouseMove, from + way * step / steps);
-    sendPointer(canvas, QEvent::MouseButtonRelease, from + way);
-}
-
 void choose(QObject &window, const char *tool)
 {
     auto *const controller = window.findChild<QObject *>(QStringLiteral("drawViewController"));
     QMetaObject::invokeMethod(
         controller, "handleToolSelection", Q_ARG(QString, QLatin1String(tool)));
+}
+
+// A window of the session that is on the screen; null if there is none of that name.
+QWidget *shownWindow(const char *name)
+{
+    for (QWidget *const widget : QApplication::topLevelWidgets()) {
+        if (widget->objectName() == QLatin1String(name) && widget->isVisible())
+            return widget;
+    }
+    return nullptr;
+}
+
+// The button of the tool bar with that identifier.
+QWidget &toolButton(const char *name)
+{
+    for (QAbstractButton *const button :
+        shownWindow("toolPanel")->findChildren<QAbstractButton *>()) {
+        if (button->property("identifier").toString() == QLatin1String(name))
+            return *button;
+    }
+    qFatal("the tool bar has no button %s", name);
 }
 
 // Always false.
@@ -80,8 +86,17 @@ bool complain(int number, const char *what)
 
 } // namespace
 
+int Sessions::wholeRound()
+{
+    int kinds = 0;
+    while (windowTypeFromRawValue(static_cast<std::uintptr_t>(kinds)))
+        ++kinds;
+    return kinds * static_cast<int>(allRoutes().size());
+}
+
 Sessions::Sessions(int count)
     : m_count(count)
+    , m_taken(allRoutes().size())
 {
     for (std::uintptr_t kind = 0; windowTypeFromRawValue(kind); ++kind)
         m_costs[*windowTypeFromRawValue(kind)].openings.reserve(static_cast<std::size_t>(count));
@@ -109,10 +124,36 @@ bool Sessions::run()
 
 bool Sessions::runOne(int number)
 {
-    const WindowType kind = *windowTypeFromRawValue(static_cast<std::uintptr_t>(number % 3));
-    const End how = static_cast<End>(number / 3 % 3);
+    constexpr int kinds = 3;
+    const WindowType kind = *windowTypeFromRawValue(static_cast<std::uintptr_t>(number % kinds));
+    const std::size_t routeIndex = static_cast<std::size_t>(number / kinds) % allRoutes().size();
+    const Route &route = allRoutes()[routeIndex];
     m_ends.clear();
 
+    if (!openAndSee(kind))
+        return complain(number, "the window did not come");
+    use(number);
+    if (!reach(route.moment))
+        return complain(number, "the moment at which it should end did not come");
+    end(route.end);
+
+    if (!processUntil([] { return Ledger::widgetsThatAre().isEmpty(); })) {
+        for (const QWidget *const widget : Ledger::widgetsThatAre())
+            complain(number, widget->metaObject()->className());
+        return complain(number, "these widgets stay");
+    }
+    m_hand.release(); // what it held is gone
+    const std::vector<bool> wanted = route.end == End::HostDrops
+        ? std::vector<bool> {}
+        : std::vector<bool> { kind == WindowType::imageAnnotation };
+    if (m_ends != wanted)
+        return complain(number, "it ended otherwise than it should");
+    ++m_taken[routeIndex];
+    return true;
+}
+
+bool Sessions::openAndSee(WindowType kind)
+{
     const microseconds before = processorTime();
     const auto start = Clock::now();
     open(kind);
@@ -120,29 +161,24 @@ bool Sessions::runOne(int number)
     cost.longestCall = std::max(
         cost.longestCall, std::chrono::duration_cast<microseconds>(Clock::now() - start));
     const auto isSeen = [this] {
-        const QWindow *const window
-            = m_penwick->penwickWindowController()->drawingWindow()->windowHandle();
-        return window && window->isExposed();
+        const QWindow *const native = window().windowHandle();
+        return native && native->isExposed();
     };
     if (!processUntil(isSeen))
-        return complain(number, "the window did not come");
+        return false;
     QCoreApplication::processEvents();
     cost.openings.push_back(processorTime() - before);
-
-    use(number);
-    end(how);
-
-    if (!processUntil([] { return Ledger::widgetsThatAre().isEmpty(); })) {
-        for (const QWidget *const widget : Ledger::widgetsThatAre())
-            complain(number, widget->metaObject()->className());
-        return complain(number, "these widgets stay");
-    }
-    const std::vector<bool> wanted = how == End::ByLettingGo
-        ? std::vector<bool> {}
-        : std::vector<bool> { kind == WindowType::imageAnnotation };
-    if (m_ends != wanted)
-        return complain(number, "it ended otherwise than it should");
     return true;
+}
+
+platform::Window &Sessions::window() const
+{
+    return *m_penwick->penwickWindowController()->drawingWindow();
+}
+
+QWidget &Sessions::canvas() const
+{
+    return *window().findChild<QWidget *>(QStringLiteral("drawingView"));
 }
 
 void Sessions::open(WindowType kind)
@@ -159,39 +195,109 @@ void Sessions::open(WindowType kind)
         ->showWindow(nullptr);
 }
 
-// A stroke, a text box, every button's state, and a banner that is still up at the end.
+// A stroke, a text box, every button's state.
 void Sessions::use(int number)
 {
-    platform::Window &window = *m_penwick->penwickWindowController()->drawingWindow();
-    auto &canvas = *window.findChild<QWidget *>(QStringLiteral("drawingView"));
-    m_penwick->showWindowSharingNotification();
-    drag(canvas, { 150, 100 }, { 100, 50 });
-    choose(window, "undo");
-    choose(window, "redo");
-    choose(window, "text");
-    drag(canvas, { 300, 60 }, { 0, 0 });
+    m_hand.press(canvas(), { 150, 100 });
+    m_hand.glide({ 100, 50 });
+    m_hand.release();
+    choose(window(), "undo");
+    choose(window(), "redo");
+    choose(window(), "text");
+    m_hand.click(canvas(), { 300, 60 });
     QCoreApplication::processEvents();
     if (number % 2 == 0) {
-        choose(window, "eraser");
-        drag(canvas, { 200, 80 }, { 0, 100 });
-        choose(window, "clear");
+        choose(window(), "eraser");
+        m_hand.press(canvas(), { 200, 80 });
+        m_hand.glide({ 0, 100 });
+        m_hand.release();
+        choose(window(), "clear");
     }
     QCoreApplication::processEvents();
 }
 
+bool Sessions::reach(Moment moment)
+{
+    switch (moment) {
+    case Moment::Rest:
+        return true;
+    case Moment::Stroke:
+        beginStroke();
+        return true;
+    case Moment::Edit:
+        beginEdit();
+        return true;
+    case Moment::Popover:
+        return openPopover();
+    case Moment::Banner:
+        return showBanner();
+    case Moment::Settling:
+        dropToolBarOutside();
+        return true;
+    case Moment::Glide: {
+        dropToolBarOutside();
+        const QWidget *const bar = shownWindow("toolPanel");
+        return processUntil([bar, dropped = bar->pos()] { return bar->pos() != dropped; });
+    }
+    }
+    return false;
+}
+
+void Sessions::beginStroke()
+{
+    choose(window(), "brush");
+    m_hand.press(canvas(), { 400, 200 });
+    m_hand.glide({ 60, 40 });
+}
+
+void Sessions::beginEdit()
+{
+    choose(window(), "text");
+    m_hand.click(canvas(), { 320, 220 });
+    const QList<QTextEdit *> boxes = window().findChildren<QTextEdit *>();
+    QKeyEvent key(QEvent::KeyPress, Qt::Key_A, Qt::NoModifier, QStringLiteral("a"));
+    QCoreApplication::sendEvent(boxes.last(), &key);
+}
+
+bool Sessions::openPopover()
+{
+    m_hand.click(toolButton("color"), { 10, 10 });
+    return processUntil([] { return shownWindow("popover") != nullptr; });
+}
+
+bool Sessions::showBanner()
+{
+    m_penwick->showWindowSharingNotification();
+    return processUntil([] { return shownWindow("banner") != nullptr; });
+}
+
+// Well outside, whatever the kind of the window.
+void Sessions::dropToolBarOutside()
+{
+    constexpr double handle = 8.0; // below the upper edge
+    QWidget &bar = *shownWindow("toolPanel");
+    m_hand.press(bar, { bar.width() / 2.0, handle });
+    m_hand.glide({ -(bar.x() + bar.width() * 2.0), 0.0 });
+    QCoreApplication::processEvents();
+    m_hand.release();
+}
+
 void Sessions::end(End how)
 {
-    // Nothing but m_penwick holds it.
-    platform::Window *const window = m_penwick->penwickWindowController()->drawingWindow();
     switch (how) {
-    case End::ByTheHost:
-        window->close();
+    case End::EndButton:
+        m_hand.click(toolButton("state"), { 10, 10 });
         break;
-    case End::ByTheTool:
-        choose(*window, "state");
+    case End::TitleBar: {
+        QCloseEvent event;
+        QCoreApplication::sendEvent(window().windowHandle(), &event);
         break;
-    case End::ByLettingGo:
-        m_penwick.reset();
+    }
+    case End::HostCloses:
+        window().close();
+        break;
+    case End::HostDrops:
+        m_penwick.reset(); // nothing else holds it
         break;
     }
 }

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
-// One session after another, each opened, used and ended the way a host does it.
+// One session after another, each opened, used and ended the way a host or a user does it.
 #pragma once
+
+#include "leftovers/Hand.h"
+#include "leftovers/Route.h"
 
 #include <penwick/Penwick.h>
 
@@ -11,11 +14,14 @@
 
 namespace penwick::leftovers {
 
-/// Opens the kinds of drawing windows in turn, uses them and ends them, in each way in turn: closed
-/// by the host, by the tool that ends the session, and by being let go of. GUI thread only.
+/// Opens the kinds of drawing windows in turn, uses them, and ends them by each route in turn. GUI
+/// thread only.
 class Sessions final
 {
 public:
+    /// How many there are until each route was taken with each kind of window.
+    [[nodiscard]] static int wholeRound();
+
     /// What it writes down of `count` sessions has its memory from the beginning.
     explicit Sessions(int count);
     ~Sessions();
@@ -36,23 +42,30 @@ public:
         std::chrono::microseconds longestCall { 0 };
     };
     [[nodiscard]] const std::map<WindowType, Cost> &costs() const { return m_costs; }
+    /// How often each of allRoutes() was taken to its end.
+    [[nodiscard]] const std::vector<int> &taken() const { return m_taken; }
 
 private:
-    enum class End
-    {
-        ByTheHost,
-        ByTheTool,
-        ByLettingGo
-    };
-
     [[nodiscard]] bool runOne(int number);
+    [[nodiscard]] bool openAndSee(WindowType kind);
     void open(WindowType kind);
     void use(int number);
+    [[nodiscard]] bool reach(Moment moment);
+    void beginStroke();
+    void beginEdit();
+    [[nodiscard]] bool openPopover();
+    [[nodiscard]] bool showBanner();
+    void dropToolBarOutside();
     void end(End how);
+    [[nodiscard]] platform::Window &window() const;
+    [[nodiscard]] QWidget &canvas() const;
+
     const int m_count;
+    Hand m_hand;
     std::unique_ptr<Penwick> m_penwick;
     std::vector<bool> m_ends;
     std::map<WindowType, Cost> m_costs;
+    std::vector<int> m_taken;
 };
 
 } // namespace penwick::leftovers
