@@ -285,6 +285,7 @@ void Window::orderFront()
 {
     show();
     raise();
+    raiseChildrenOf(*this);
 }
 
 void Window::orderIn()

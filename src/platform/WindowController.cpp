@@ -24,8 +24,7 @@ void WindowController::showWindow(QObject *)
 {
     if (!m_window)
         return;
-    m_window->show();
-    m_window->raise();
+    m_window->orderFront();
     m_window->activateWindow();
 }
 

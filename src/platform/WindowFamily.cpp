@@ -38,4 +38,14 @@ void WindowFamily::takeAlong(QPoint delta) const
     }
 }
 
+void raiseChildrenOf(const Window &window)
+{
+    for (Window *const child : window.childWindows()) {
+        if (!child->isVisible())
+            continue;
+        child->raise();
+        raiseChildrenOf(*child);
+    }
+}
+
 } // namespace penwick::platform
