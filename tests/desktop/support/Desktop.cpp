@@ -22,6 +22,7 @@ constexpr std::array passedOn { "PATH", "LD_LIBRARY_PATH", "TMPDIR", "ASAN_OPTIO
 } // namespace
 
 Desktop::Desktop(WindowManager windowManager, QSize screenSize)
+    : m_kindOfManager(windowManager)
 {
     if (!m_folder.isValid())
         throw std::runtime_error("no temporary folder: " + m_folder.errorString().toStdString());
@@ -36,7 +37,7 @@ Desktop::Desktop(WindowManager windowManager, QSize screenSize)
     m_keyboard = std::make_unique<Keyboard>(*m_connection);
     m_screen = std::make_unique<Screen>(*m_connection);
     m_windows = std::make_unique<Windows>(*m_connection);
-    startWindowManager(windowManager);
+    startWindowManager();
 }
 
 Desktop::~Desktop()
@@ -109,6 +110,13 @@ void Desktop::startCompositor()
         throw std::runtime_error("picom ended at once");
 }
 
+void Desktop::endCompositor()
+{
+    m_compositor.reset();
+    require([this] { return !m_connection->hasSelectionOwner("_NET_WM_CM_S0"); },
+        "the compositing manager to be gone");
+}
+
 void Desktop::splitInto(const std::vector<QRect> &monitors)
 {
     m_connection->setMonitors(monitors);
@@ -135,28 +143,31 @@ void Desktop::startBus()
     m_busAddress = *address;
 }
 
-void Desktop::startWindowManager(WindowManager windowManager)
+void Desktop::endSessionBus()
 {
-    if (windowManager == WindowManager::None)
+    m_bus.reset();
+}
+
+void Desktop::endWindowManager()
+{
+    m_connection->forgetWindowManager();
+    m_windowManager.reset();
+    require([this] { return !m_windows->areManaged(); }, "the window manager to be gone");
+}
+
+void Desktop::startWindowManager()
+{
+    if (m_kindOfManager == WindowManager::None)
         return;
-    const std::vector<std::string> command = windowManager == WindowManager::Openbox
+    const std::vector<std::string> command = m_kindOfManager == WindowManager::Openbox
         ? std::vector<std::string> { "openbox", "--sm-disable" }
         : std::vector<std::string> { "xfwm4", "--compositor=off" };
     // Xfwm4 reads its settings over a bus, or does not start.
     m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command { command,
-        windowManager == WindowManager::Xfwm4 ? environmentWithBus(sessionBus()) : environment(),
+        m_kindOfManager == WindowManager::Xfwm4 ? environmentWithBus(sessionBus()) : environment(),
         file("window-manager.log") });
 
-    // It is up when the window that it announces itself by names itself too.
-    const char *const announcement = "_NET_SUPPORTING_WM_CHECK";
-    require(
-        [&] {
-            const std::vector<unsigned long> check
-                = m_windows->numbers(m_windows->root(), announcement);
-            return m_windowManager->exitStatus()
-                || (check.size() == 1 && m_windows->numbers(check.front(), announcement) == check
-                    && !m_windows->numbers(m_windows->root(), "_NET_SUPPORTED").empty());
-        },
+    require([this] { return m_windowManager->exitStatus() || m_windows->areManaged(); },
         command.front() + " to manage the display");
     if (m_windowManager->exitStatus())
         throw std::runtime_error(command.front() + " ended at once");

@@ -50,7 +50,14 @@ public:
 
     /// Starts a compositing manager, and returns once it is one. Throws like the constructor.
     void startCompositor();
-    /// Makes monitors of these parts of the screen, the first one the primary one.
+    void endCompositor(); ///< returns once there is none
+    /// Ends the window manager; its windows stay.
+    void endWindowManager();
+    /// Starts the constructor's one again and returns once it manages the windows that are there.
+    void startWindowManager();
+    void endSessionBus(); ///< one that was started
+    /// Makes monitors of these parts of the screen, the first one the primary one, in place of
+    /// those that were there.
     void splitInto(const std::vector<QRect> &monitors);
 
     [[nodiscard]] Pointer &pointer() { return *m_pointer; }
@@ -60,10 +67,10 @@ public:
 
 private:
     void startServer(QSize screenSize);
-    void startWindowManager(WindowManager windowManager);
     void startBus();
     [[nodiscard]] std::vector<std::string> environmentWithBus(const std::string &address) const;
 
+    const WindowManager m_kindOfManager;
     QTemporaryDir m_folder;
     std::string m_displayName;
     std::string m_busAddress;

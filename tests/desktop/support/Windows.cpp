@@ -100,7 +100,12 @@ std::vector<WindowId> Windows::stackingOrder() const
     const std::vector<Window> frames = familyOf(m_connection, root()).children;
     // Each is asked for once: a window may go while they are sorted.
     std::vector<std::pair<std::ptrdiff_t, WindowId>> byHeight;
-    for (const WindowId window : numbers(root(), "_NET_CLIENT_LIST")) {
+    std::vector<WindowId> managed = numbers(root(), "_NET_CLIENT_LIST");
+    if (!areManaged()) {
+        managed.assign(frames.begin(), frames.end());
+        std::erase_if(managed, [this](WindowId window) { return !isShown(window); });
+    }
+    for (const WindowId window : managed) {
         const auto place = std::find(frames.begin(), frames.end(), frameOf(m_connection, window));
         byHeight.emplace_back(place - frames.begin(), window);
     }
@@ -119,6 +124,16 @@ std::vector<WindowId> Windows::ofProcess(int processId) const
     std::erase_if(
         windows, [&](WindowId window) { return numbers(window, "_NET_WM_PID") != owner; });
     return windows;
+}
+
+bool Windows::areManaged() const
+{
+    // The window that one announces itself by names itself too; what it said of the desktop before
+    // may outlive it.
+    const char *const announcement = "_NET_SUPPORTING_WM_CHECK";
+    const std::vector<unsigned long> check = numbers(root(), announcement);
+    return check.size() == 1 && numbers(check.front(), announcement) == check
+        && !numbers(root(), "_NET_SUPPORTED").empty();
 }
 
 WindowId Windows::active() const
@@ -191,6 +206,12 @@ void Windows::minimise(WindowId window)
 void Windows::activate(WindowId window)
 {
     ask(window, "_NET_ACTIVE_WINDOW", askedByUser, CurrentTime);
+}
+
+void Windows::cutOff(WindowId window)
+{
+    XKillClient(m_connection.display(), window);
+    m_connection.finish();
 }
 
 void Windows::switchToDesktop(unsigned long number)

@@ -23,10 +23,13 @@ public:
     /// Borrows `connection`, which must live longer.
     explicit Windows(const XConnection &connection);
 
-    /// Windows that the window manager manages, the undermost first.
+    /// Windows that the window manager manages, the undermost first; without one, those that are
+    /// shown.
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
     /// Those of process `processId`, the undermost first.
     [[nodiscard]] std::vector<WindowId> ofProcess(int processId) const;
+    /// Whether there is a window manager.
+    [[nodiscard]] bool areManaged() const;
     [[nodiscard]] WindowId active() const; ///< 0 if there is none
 
     [[nodiscard]] QString title(WindowId window) const;
@@ -47,6 +50,8 @@ public:
     void minimise(WindowId window);
     /// Brings a minimised window back, and any window to the front.
     void activate(WindowId window);
+    /// Takes the connection to the server away from the program whose window it is.
+    void cutOff(WindowId window);
     /// Goes to another virtual desktop, counted from 0, and returns once it is the present one.
     void switchToDesktop(unsigned long number);
     /// Whether the server shows the window, be it covered or not.

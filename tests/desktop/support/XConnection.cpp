@@ -65,7 +65,19 @@ void XConnection::setMonitors(const std::vector<QRect> &monitors) const
         monitor.outputs = resources->outputs;
         XRRSetMonitor(m_display, root(), &monitor);
     }
+    deleteMonitorsFrom(monitors.size());
     finish();
+}
+
+void XConnection::deleteMonitorsFrom(std::size_t index) const
+{
+    int count = 0;
+    const std::unique_ptr<XRRMonitorInfo, decltype(&XRRFreeMonitors)> present(
+        XRRGetMonitors(m_display, root(), False, &count), &XRRFreeMonitors);
+    for (; index < static_cast<std::size_t>(count); ++index) {
+        const std::string name = "monitor" + std::to_string(index);
+        XRRDeleteMonitor(m_display, root(), atom(name.c_str()));
+    }
 }
 
 void XConnection::finish() const

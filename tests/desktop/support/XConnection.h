@@ -29,7 +29,7 @@ public:
     /// Whether some program holds the selection called `name`.
     [[nodiscard]] bool hasSelectionOwner(const char *name) const;
 
-    /// Replaces the server's one monitor by these, the first one the primary one.
+    /// Replaces the server's monitors by these, the first one the primary one.
     void setMonitors(const std::vector<QRect> &monitors) const;
 
     /// Returns once the server has done everything asked so far.
@@ -37,6 +37,8 @@ public:
 
     /// Waits until the window manager answers; from then on finishWithWindowManager() asks it, too.
     void awaitWindowManager();
+    /// Asks it no more: it is about to go.
+    void forgetWindowManager() { m_probe = 0; }
 
     /// Returns once the server and the window manager have dealt with everything sent so far.
     ///
@@ -45,6 +47,7 @@ public:
     void finishWithWindowManager() const;
 
 private:
+    void deleteMonitorsFrom(std::size_t index) const;
     [[nodiscard]] unsigned long makeProbe() const;
     void askWindowManager(unsigned long probe) const;
     [[nodiscard]] bool hasAnswered(unsigned long probe) const;

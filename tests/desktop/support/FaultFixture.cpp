@@ -1,0 +1,64 @@
+// SPDX-License-Identifier: MIT
+#include "desktop/support/FaultFixture.h"
+
+#include <cstdlib>
+
+namespace penwick::desktop {
+
+void FaultTest::startKind(const std::string &kind, const std::vector<std::string> &arguments,
+    const std::vector<std::string> &variables)
+{
+    std::vector<std::string> all { "--window", kind };
+    if (kind == "imageAnnotation") {
+        QImage image(600, 400, QImage::Format_RGB32);
+        image.fill(Qt::white);
+        const std::string file = desktop().file("picture.png");
+        ASSERT_TRUE(image.save(QString::fromStdString(file)));
+        all.insert(all.end(), { "--image", file });
+    }
+    all.insert(all.end(), arguments.begin(), arguments.end());
+    start(all, HostProgram::Steered, variables);
+    m_window = window();
+    static_cast<void>(toolBar());
+}
+
+void FaultTest::expectInk()
+{
+    constexpr int distance = 24; // from one stroke to the next
+    constexpr int visible = 15; // of 255 levels
+    const QPoint corner = desktop().windows().clientArea(m_window).topLeft();
+    const QPoint from = corner + QPoint(200, 60 + distance * m_strokes++);
+    const QPoint middle = from + QPoint(50, 0);
+    const auto levelThere = [&] { return desktop().screen().pixel(middle).green(); };
+    const int before = levelThere();
+
+    desktop().pointer().drag({ from, from + QPoint(100, 0) });
+
+    EXPECT_TRUE(waitUntil([&] { return std::abs(levelThere() - before) > visible; }))
+        << "level " << before << " stays at " << middle.x() << ", " << middle.y();
+}
+
+void FaultTest::expectEndByTool()
+{
+    desktop().pointer().click(toolBar().buttons.value(QStringLiteral("state")));
+    EXPECT_EQ(host().waitForExit(), 0);
+    EXPECT_EQ(host().printedLines(), QStringList());
+}
+
+void FaultTest::expectNothingSaid()
+{
+    EXPECT_EQ(host().errorOutput(), QString());
+    EXPECT_EQ(host().printedLines(), QStringList());
+}
+
+std::vector<const char *> allKinds()
+{
+    return { "whiteboard", "annotation", "imageAnnotation" };
+}
+
+std::string kindName(const testing::TestParamInfo<const char *> &kind)
+{
+    return kind.param;
+}
+
+} // namespace penwick::desktop
