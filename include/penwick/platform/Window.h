@@ -99,8 +99,8 @@ public:
     void setAttributes(const WindowAttributes &attributes);
     /// Whether what lies below the window can be seen where the window is transparent. On a
     /// desktop that cannot, a transparent layer over the screen shows a picture of what was below
-    /// it when it was shown; told once, at the information level, to the logging category
-    /// "penwick.desktop".
+    /// it when it was shown; told each time that it is shown, at the information level, to the
+    /// logging category "penwick.desktop".
     [[nodiscard]] bool showsWhatIsBelow() const;
 
     // Child windows
