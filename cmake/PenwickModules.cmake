@@ -15,6 +15,12 @@ if(PENWICK_SANITIZE)
                                                  -fno-sanitize-recover=all -fno-omit-frame-pointer)
   target_link_options(penwick_flags INTERFACE -fsanitize=address,undefined)
 endif()
+# Counts which lines and branches run; see docs/testing.md. Of the product alone: the tests' own
+# lines would only make them slow.
+if(PENWICK_COVERAGE)
+  target_link_options(penwick_flags INTERFACE --coverage)
+  set(penwick_counts_at_end ${PROJECT_SOURCE_DIR}/tests/support/CountsAtEnd.cpp)
+endif()
 
 # penwick_add_module(NAME SOURCES file... [QT component...] [DEPENDS module...] [LIBRARIES target...])
 #
@@ -30,5 +36,8 @@ function(penwick_add_module name)
                                                    ${PROJECT_SOURCE_DIR}/src/resources/ui)
   list(TRANSFORM arg_QT PREPEND Qt6::)
   target_link_libraries(penwick_${name} PUBLIC penwick_flags ${arg_QT} ${arg_LIBRARIES})
+  if(PENWICK_COVERAGE)
+    target_compile_options(penwick_${name} PRIVATE --coverage)
+  endif()
   set_property(GLOBAL APPEND PROPERTY PENWICK_MODULES penwick_${name})
 endfunction()
