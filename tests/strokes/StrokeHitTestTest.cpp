@@ -40,6 +40,17 @@ TEST(StrokeHitTest, pathOfMovesAloneIsHitNowhere)
     EXPECT_FALSE(strokeContains(path, { 20, 10 }));
 }
 
+TEST(StrokeHitTest, lineWithoutThicknessIsHitNowhere)
+{
+    BezierPath path;
+    addLine(path);
+
+    for (const double width : { 0.0, -5.0 }) {
+        path.setLineWidth(width);
+        EXPECT_FALSE(strokeContains(path, { 20, 10 })) << width;
+    }
+}
+
 TEST(StrokeHitTest, lineIsHitUpToHalfItsWidthAway)
 {
     BezierPath path;
