@@ -67,7 +67,7 @@ TEST_F(DrawViewControllerOptionTest, textOptionSetsTheFontSizeAndLeavesTheTool)
 
 TEST_F(DrawViewControllerOptionTest, valueThatIsNoNumberChangesAndPrintsNothing)
 {
-    for (const char *const value : { "", "thick", "7px", "1.2.3", "nan", "inf", "0x7" }) {
+    for (const char *const value : { "", "thick", "7px", "1.2.3", "nan", "inf", "0x7", "1,000" }) {
         const QString ending = QLatin1Char('#') + QString::fromLatin1(value);
 
         EXPECT_EQ(printedByOption(brush + ending), "");

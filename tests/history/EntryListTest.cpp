@@ -37,6 +37,40 @@ TEST(EntryList, newListIsEmpty)
     EXPECT_EQ(list.begin(), list.end());
 }
 
+TEST(EntryList, iteratorStandsAtTheFirstEntryAndStepsOnAfterItIsRead)
+{
+    const EntryList<int> list = listOf({ 4, 5 });
+    auto place = list.begin();
+
+    EXPECT_EQ(*place++, 4);
+    EXPECT_EQ(*place, 5);
+}
+
+TEST(EntryList, sharesWithALongerCopyNoMoreThanItsSettledEntries)
+{
+    const EntryList<int> list = listOf({ 1, 2 });
+    EntryList<int> longer = list;
+    longer.append(3);
+    longer.append(4);
+
+    EXPECT_EQ(list.sharedStart(longer), 1);
+    EXPECT_EQ(longer.sharedStart(list), 1);
+}
+
+TEST(EntryList, removedEntryThatNoCopyShowsIsNotKeptAlive)
+{
+    EntryList<std::shared_ptr<int>> list;
+    for (const int number : { 1, 2, 3 })
+        list.append(std::make_shared<int>(number));
+    const std::weak_ptr<int> second = list[1];
+
+    list.removeLast();
+    list.removeLast();
+
+    EXPECT_TRUE(second.expired());
+    EXPECT_EQ(*list.last(), 1);
+}
+
 TEST(EntryList, keepsTheOrderOfAppending)
 {
     const EntryList<int> list = listOf({ 1, 2, 3 });

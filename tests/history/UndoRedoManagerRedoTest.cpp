@@ -65,6 +65,18 @@ TEST_F(UndoRedoManagerTest, redoOfAnErasedTextBoxTakesItOffTheCanvasAndRedrawsTw
     EXPECT_EQ(textBoxes(), Ids { 2 });
 }
 
+TEST_F(UndoRedoManagerTest, redoOfAnEraseLeavesTheClearBelowItToTheNextRedo)
+{
+    drawStrokes(2);
+    manager.setRedoStack(
+        stackOf({ strokeRecord(ActionType::clear, 1), strokeRecord(ActionType::erase, 2) }));
+
+    manager.redoAction();
+
+    EXPECT_EQ(strokes(), Ids { 1 });
+    EXPECT_EQ(idsOf(manager.redoStack()), Ids { 1 });
+}
+
 TEST_F(UndoRedoManagerTest, redoOfAnEraseOfWhatIsGoneMovesTheRecordAndRedrawsOnce)
 {
     manager.setRedoStack(
