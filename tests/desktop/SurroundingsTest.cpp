@@ -2,12 +2,35 @@
 // A process whose surroundings are poor: no bus, another locale, no home, no more X server.
 #include "desktop/support/FaultFixture.h"
 
+#include <QDir>
+#include <QFile>
+#include <QProcess>
+
 namespace penwick::desktop {
 
 namespace {
 
 class Surroundings : public FaultTest
 { };
+
+/// Makes a configuration of fonts that knows one alone; gives the file.
+std::string onlyOneFont(const Desktop &desktop)
+{
+    QProcess match;
+    match.start(QStringLiteral("fc-match"),
+        { QStringLiteral("-f"), QStringLiteral("%{file}"), QStringLiteral("DejaVu Sans") });
+    match.waitForFinished();
+    const QString font = QString::fromLocal8Bit(match.readAllStandardOutput());
+    const QDir folder(QString::fromStdString(desktop.file("fonts")));
+    EXPECT_TRUE(folder.mkpath(QStringLiteral("."))
+        && QFile::copy(font, folder.filePath(QStringLiteral("only.ttf"))))
+        << font.toStdString();
+    QFile configuration(folder.filePath(QStringLiteral("fonts.conf")));
+    EXPECT_TRUE(configuration.open(QFile::WriteOnly));
+    configuration.write("<fontconfig><dir>" + folder.path().toLocal8Bit() + "</dir><cachedir>"
+        + folder.path().toLocal8Bit() + "</cachedir></fontconfig>");
+    return configuration.fileName().toStdString();
+}
 
 class LostConnection : public FaultOfEachKind
 { };
@@ -56,6 +79,20 @@ TEST_F(Surroundings, withoutAHomeThatCanBeWrittenAreNothingToSpeakOf)
 
     expectInk();
 
+    expectNothingSaid();
+    expectEndByTool();
+}
+
+TEST_F(Surroundings, withOneFontAloneAreWrittenInWithThat)
+{
+    startKind("whiteboard", { "--tool", "text" }, { "FONTCONFIG_FILE=" + onlyOneFont(desktop()) });
+    click({ 300, 200 });
+
+    desktop().keyboard().type("mmm");
+
+    const QRect line(onScreen({ 306, 200 }), QSize(50, 20)); // inside the box's border
+    constexpr int inkLevel = 60; // the placeholder is lighter
+    EXPECT_TRUE(waitUntil([&] { return darkest(desktop().screen().picture(line)) < inkLevel; }));
     expectNothingSaid();
     expectEndByTool();
 }
