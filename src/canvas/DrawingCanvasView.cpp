@@ -120,13 +120,12 @@ void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
     }
 }
 
-bool DrawingCanvasView::eraseAt(Point point)
+void DrawingCanvasView::eraseAt(Point point)
 {
     if (!model().performEraseOperationAtLocation(point))
-        return false;
+        return;
     controller().updateDrawingCanvasElements();
     require(controller().drawingView(), "the canvas's controller has no canvas")->setNeedsDisplay();
-    return true;
 }
 
 void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)

@@ -75,7 +75,7 @@ public:
 private:
     void beginStroke();
     void endStroke(platform::Point point);
-    bool eraseAt(platform::Point point);
+    void eraseAt(platform::Point point);
     void placeTextBox(platform::Point point);
     [[nodiscard]] DrawingCanvasDelegate &controller() const;
     [[nodiscard]] DrawingCanvasModel &model() const;

@@ -66,7 +66,7 @@ std::string PaintSession::doSomething()
         done = m_isPressed ? release() : press();
     } else if (kind < 80) {
         done = m_isPressed ? drag() : press();
-    } else if (kind < 92) {
+    } else if (kind < 90) {
         done = chooseAnything();
     } else if (kind < 97) {
         done = changePen();
@@ -113,7 +113,8 @@ std::string PaintSession::chooseAnything()
 
 std::string PaintSession::changePen()
 {
-    m_canvas->setBrushThickness(oneOf({ 0.5, 1.0, 1.3, 3.0, 5.0, 7.5, 8.0, 12.0, 30.0 }));
+    m_canvas->setBrushThickness(
+        oneOf({ 0.2, 0.5, 0.5, 0.8, 1.0, 1.3, 3.0, 5.0, 7.5, 8.0, 12.0, 30.0 }));
     m_canvas->setBrushColor(
         QColor(anyFrom(0, 255), anyFrom(0, 255), anyFrom(0, 255), oneOf({ 255, 178, 60 })));
     return "another pen";
