@@ -109,6 +109,7 @@ void DrawingCanvasModel::createTextBox(
 
     mutableTextBoxArray().append(entry);
     record({ entry, ActionType::draw, entry.textId });
+    m_strokeIndex.follow(pathArray()); // strokes that this made the history forget are free to go
 }
 
 void DrawingCanvasModel::deleteTextBoxWith(std::int64_t hashValue)

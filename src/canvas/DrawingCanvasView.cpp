@@ -198,6 +198,7 @@ void DrawingCanvasView::setCoversWindow(bool covers)
 {
     m_coversWindow = covers;
     surface().setAttribute(Qt::WA_OpaquePaintEvent, covers);
+    setNeedsDisplay();
 }
 
 void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)

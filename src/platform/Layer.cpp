@@ -13,7 +13,8 @@ bool Layer::hasBorderIn(const QRectF &part, const QRectF &bounds) const
         return false;
     constexpr double softEdge = 1.0; // points
     const double depth = std::max(borderWidth, cornerRadius) + softEdge;
-    return !bounds.adjusted(depth, depth, -depth, -depth).contains(part);
+    const QRectF inside = bounds.adjusted(depth, depth, -depth, -depth);
+    return !inside.isValid() || !inside.contains(part);
 }
 
 void Layer::paintBackground(QPainter &painter, const QRectF &bounds) const

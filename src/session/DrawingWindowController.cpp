@@ -159,6 +159,8 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     m_minWindowWidth = screenFrame.width * 2 / 3;
     m_minWindowHeight = screenFrame.height * 2 / 3;
     require(m_drawingWindow.data(), "the drawing window is gone");
+    if (auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView()))
+        canvas->setCoversWindow(win_type == WindowType::whiteboard);
     switch (win_type) {
     case WindowType::annotation:
         coverScreen(screen);
@@ -209,7 +211,6 @@ void DrawingWindowController::coverScreen(const QScreen &screen)
 void DrawingWindowController::placeAsBoard(const Rect &frame)
 {
     showBoardBorder();
-    content().drawingView()->setCoversWindow(true);
     m_drawingWindow->setFrame(frame, Animate::Yes);
 }
 

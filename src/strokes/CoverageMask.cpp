@@ -22,8 +22,10 @@ constexpr float fullCoverage = 255.0F;
 constexpr float rounding = 0.49F;
 constexpr std::size_t blockSize = 64; // pixels worked on at a time
 
-// Far more than any screen has; what lies beyond is not seen, and numbers stay exact.
+// Far more than any screen has, and small enough for whole numbers. A line that reaches farther is
+// bent there; a radius is larger than the diagonal only if nothing but its inside is seen.
 constexpr double farthest = 1e6; // pixels
+constexpr double largestRadius = 4 * farthest;
 
 double limited(double coordinate)
 {
@@ -233,6 +235,7 @@ std::span<const std::uint8_t> CoverageMask::row(int x, int y, int width) const
 
 QRect CoverageMask::addCapsule(Point from, Point to, double radius)
 {
+    radius = std::min(radius, largestRadius);
     const QRect pixels = pixelsOfCapsule(from, to, radius);
     const QRect touched = pixels & m_area;
     if (touched.isEmpty())

@@ -14,9 +14,10 @@ namespace penwick {
 
 /// What a list of strokes looks like, oldest first, each one shape in its colour.
 ///
-/// Painting copies finished pixels. A change of the list costs what the strokes that came or went
-/// cover, a segment more of the newest stroke what the segment covers, both whatever else there is;
-/// the pixels are those of painting everything anew. GUI thread only.
+/// Painting copies finished pixels. A segment more of the newest stroke costs what the segment
+/// covers; so does taking the newest stroke back, once, by the stroke. Any other stroke that comes
+/// or goes costs the strokes that touch the rectangle around it, and finding it in the list. The
+/// pixels are those of painting everything anew. GUI thread only.
 class StrokePicture
 {
 public:

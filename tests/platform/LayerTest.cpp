@@ -105,6 +105,8 @@ TEST(Layer, partInsideOfTheBorderHasNothingOfIt)
     layer.cornerRadius = 10.0; // rounds the corners, and so reaches farther in
     EXPECT_TRUE(layer.hasBorderIn({ 4.0, 4.0, 5.0, 5.0 }, bounds));
     EXPECT_FALSE(layer.hasBorderIn({ 11.0, 11.0, 5.0, 5.0 }, bounds));
+    const QRectF small(0.0, 0.0, 12.0, 12.0); // nothing of it is inside
+    EXPECT_TRUE(layer.hasBorderIn({ 5.0, 5.0, 2.0, 2.0 }, small));
     layer.borderWidth = 0.0;
     EXPECT_FALSE(layer.hasBorderIn(bounds, bounds));
 }

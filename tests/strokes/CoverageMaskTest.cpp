@@ -171,6 +171,14 @@ TEST(CoverageMask, lineFromFarAwayIsCutOffWithoutHarm)
     EXPECT_EQ(*std::ranges::max_element(coverage), 255);
 }
 
+TEST(CoverageMask, hugeRadiusCoversEverything)
+{
+    for (const double radius : { 1e5, 3e6, 5e9, 1e12, 1e300 }) {
+        const std::vector<int> coverage = coverageOf({ { { -3, 20 }, { 30, 10 } } }, radius);
+        EXPECT_EQ(*std::ranges::min_element(coverage), 255) << radius;
+    }
+}
+
 RC_GTEST_PROP(CoverageMaskProperties, everyLineIsCloseToWhatSamplingItFinelyGives, ())
 {
     const Line line = anyLine();
