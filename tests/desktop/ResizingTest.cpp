@@ -107,12 +107,13 @@ TEST_P(Resizing, toolBarKeepsItsPlaceFromTheBottomLeftCornerOrIsPulledInside)
         },
         "the board to come to rest");
 
-    const QRect frame = windows.outerFrame(board);
-    // What is above the bottom edge by so much has not enough room in a lower board.
-    const int highest = frame.height() - titleAllowance - toolBar().frame.height();
-    const QPoint wanted(before.x(), -std::min(-before.y(), highest));
+    QPoint wanted;
     QPoint seen;
     EXPECT_TRUE(waitUntil([&] {
+        const QRect frame = windows.outerFrame(board); // it may still move by a few pixels
+        // What is above the bottom edge by so much has not enough room in a lower board.
+        const int highest = frame.height() - titleAllowance - toolBar().frame.height();
+        wanted = { before.x(), -std::min(-before.y(), highest) };
         seen = toolBar().frame.bottomLeft() - frame.bottomLeft();
         const QPoint off = seen - wanted;
         return std::abs(off.x()) <= 1 && std::abs(off.y()) <= 1;

@@ -42,7 +42,16 @@ protected:
         start(arguments, program);
     }
 
-    [[nodiscard]] QRect frameOnScreen() { return desktop().windows().outerFrame(window()); }
+    // Soon, not at once: a desktop may put its borders on late.
+    void expectFrame(const QRect &frame)
+    {
+        const WindowId shown = window();
+        QRect seen;
+        EXPECT_TRUE(waitUntil([&] {
+            return (seen = desktop().windows().outerFrame(shown)) == frame;
+        })) << testing::PrintToString(seen)
+            << " instead of " << testing::PrintToString(frame);
+    }
 
     /// In the middle of the left edge, twenty points in; half a pixel goes either way.
     void expectToolBarIn(const QRect &frame)
@@ -73,7 +82,7 @@ TEST_P(Screens, boardStandsOnTheScreenThatItWasGiven)
 {
     startOnSecond();
 
-    EXPECT_EQ(frameOnScreen(), layout().board);
+    expectFrame(layout().board);
     expectToolBarIn(layout().board);
     expectStrokeAppears();
 }
@@ -83,14 +92,14 @@ TEST_P(Screens, boardWithoutAGivenScreenStandsOnThePrimaryOne)
     start();
 
     const QRect primary = layout().monitors.front();
-    EXPECT_EQ(frameOnScreen(), QRect(213, 187, 853, 480).translated(primary.topLeft()));
+    expectFrame(QRect(213, 187, 853, 480).translated(primary.topLeft()));
 }
 
 TEST_P(Screens, overlayCoversExactlyTheScreenThatItWasGiven)
 {
     startOnSecond({ "--window", "annotation" });
 
-    EXPECT_EQ(frameOnScreen(), layout().monitors.at(1));
+    expectFrame(layout().monitors.at(1));
     expectToolBarIn(layout().monitors.at(1));
     expectStrokeAppears();
 }
@@ -104,7 +113,7 @@ TEST_P(Screens, imageWindowStandsOnTheScreenThatItWasGiven)
 
     startOnSecond({ "--window", "imageAnnotation", "--image", file });
 
-    EXPECT_EQ(frameOnScreen(), layout().image);
+    expectFrame(layout().image);
     expectToolBarIn(layout().image);
     expectStrokeAppears();
 }
@@ -129,7 +138,7 @@ TEST_P(Screens, toolBarFollowsTheBoardToTheOtherScreen)
 
     desktop().pointer().drag({ title, title + way });
 
-    ASSERT_TRUE(waitUntil([&] { return frameOnScreen() == layout().board.translated(way); }));
+    expectFrame(layout().board.translated(way));
     EXPECT_TRUE(waitUntil([&] {
         return toolBar().frame.left() == layout().board.translated(way).left() + barInset;
     }));
