@@ -197,7 +197,11 @@ void RealBoard::closeMenu()
 
 void RealBoard::clickTool(const std::string &name, bool byPointer)
 {
-    QAbstractButton &button = *bar().button(text(name));
+    click(*bar().button(text(name)), byPointer);
+}
+
+void RealBoard::click(QAbstractButton &button, bool byPointer)
+{
     if (byPointer) {
         m_time += longAfter;
         const QPointF place(button.rect().center());
@@ -220,15 +224,7 @@ void RealBoard::pressToolElsewhere(const std::string &name)
 
 void RealBoard::chooseOption(const std::string &name, bool byPointer)
 {
-    platform::Button &button = option(name);
-    if (byPointer) {
-        m_time += longAfter;
-        const QPointF place(button.rect().center());
-        sendTo(button, place, Qt::LeftButton, QEvent::MouseButtonPress);
-        sendTo(button, place, Qt::LeftButton, QEvent::MouseButtonRelease);
-    } else {
-        button.click();
-    }
+    click(option(name), byPointer);
 }
 
 void RealBoard::pressPanel()

@@ -19,6 +19,8 @@
 class QWidget;
 class QWindow;
 
+class QAbstractButton;
+
 namespace penwick {
 
 class DrawViewController;
@@ -94,6 +96,7 @@ private:
     void paint();
     void learnNames();
     void send(QWindow &window, QPointF place, Qt::MouseButton button, QEvent::Type type);
+    void click(QAbstractButton &button, bool byPointer);
     void sendTo(QWidget &widget, QPointF place, Qt::MouseButton button, QEvent::Type type);
 
     std::unique_ptr<Penwick> m_penwick;

@@ -29,8 +29,7 @@ public:
         native.sharingType = static_cast<NSWindowSharingType>(values.sharingType);
         native.titleVisibility = static_cast<NSWindowTitleVisibility>(values.titleVisibility);
         native.titlebarAppearsTransparent = values.titlebarAppearsTransparent;
-        native.animationBehavior
-            = static_cast<NSWindowAnimationBehavior>(values.animationBehavior);
+        native.animationBehavior = static_cast<NSWindowAnimationBehavior>(values.animationBehavior);
         native.hasShadow = values.hasShadow;
     }
 
