@@ -23,7 +23,7 @@ constexpr int lookInterval = 50; // ms
 // Steps of one move by the user follow each other faster than this.
 constexpr int longestRest = 500; // ms
 
-// How long after it was shown a window is still being put in its place.
+// How long after it was shown, or framed anew, a window is still being put in its place.
 constexpr int newness = 2000; // ms
 
 } // namespace
@@ -79,7 +79,7 @@ void FrameTracker::prepareToShow()
         m_margins = native.frameMargins();
     }
     followFrame();
-    m_sinceShown.start();
+    m_sinceFramed.start();
     applyRequest();
     m_announced = toDesktop(m_frame);
     awaitAnswer();
@@ -90,10 +90,24 @@ void FrameTracker::followFrame()
     QWindow &native = *m_window.windowHandle();
     m_followed = native.winId();
     m_corner.reset();
+    m_isFrameLost = false;
     NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
+        if (corner.has_value() != m_corner.has_value())
+            onFrameExchanged(corner.has_value());
         m_corner = corner;
         m_check.start();
     });
+}
+
+// The window manager that ends takes its frames along, and the one that comes back builds them
+// elsewhere before it puts them in their place. Neither is a move by the user.
+void FrameTracker::onFrameExchanged(bool hasFrame)
+{
+    if (!m_window.isVisible())
+        return;
+    m_isFrameLost = !hasFrame;
+    m_sinceFramed.start();
+    awaitAnswer();
 }
 
 void FrameTracker::applyRequest()
@@ -121,8 +135,11 @@ bool FrameTracker::eventFilter(QObject *watched, QEvent *event)
 QRect FrameTracker::outerGeometry() const
 {
     const QWindow &native = *m_window.windowHandle();
-    QRect outer = m_window.windowFlags().testFlag(Qt::FramelessWindowHint) ? native.geometry()
-                                                                           : native.frameGeometry();
+    QRect outer = native.frameGeometry();
+    if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
+        outer = native.geometry();
+    else if (m_isFrameLost) // the next window manager puts it around the content that is there
+        outer = native.geometry().marginsAdded(m_margins);
     if (m_corner) {
         // The toolkit keeps a screen's corner in device pixels and scales what lies inside it.
         const QPoint screen = native.screen()->geometry().topLeft();
@@ -163,7 +180,7 @@ void FrameTracker::check()
 // user drags the window, the toolkit may well lag behind.
 void FrameTracker::mendToolkit()
 {
-    const bool isNew = m_sinceShown.isValid() && m_sinceShown.elapsed() < newness;
+    const bool isNew = m_sinceFramed.isValid() && m_sinceFramed.elapsed() < newness;
     const bool isStale = m_corner && isNew && !m_isByUser && !m_userMove.isActive()
         && m_window.windowHandle()->frameGeometry().topLeft() != toDesktop(m_frame).topLeft();
     if (isStale && !std::exchange(m_isMended, true)) {
@@ -179,7 +196,7 @@ void FrameTracker::mendToolkit()
 // still holds. A window that was just shown has no margins at all until it is decorated.
 bool FrameTracker::isDecoratedAnew() const
 {
-    if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
+    if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint) || m_isFrameLost)
         return false; // whatever the toolkit makes of a frame that is still being built
     const QMargins margins = m_window.windowHandle()->frameMargins();
     return margins != m_margins && !(m_isPending && margins.isNull())

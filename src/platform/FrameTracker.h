@@ -22,7 +22,8 @@ namespace penwick::platform {
 ///
 /// Frames are in points, y up, from the primary screen's bottom left corner. A decorated window
 /// has no true frame until the desktop has answered, which may be after the first paint; until
-/// then frame() is what was asked. GUI thread only.
+/// then frame() is what was asked. While there is no window manager after all, its frame counts as
+/// if it were still there, since the next one puts one there. GUI thread only.
 class FrameTracker final : public QObject
 {
     Q_OBJECT
@@ -60,6 +61,7 @@ Q_SIGNALS:
 
 private:
     void followFrame();
+    void onFrameExchanged(bool hasFrame);
     void applyRequest();
     void mendToolkit();
     void check();
@@ -83,7 +85,8 @@ private:
     QTimer m_userMove; // runs while a move by the user may go on
     bool m_isByUser = false;
     bool m_isMended = false; // asked once more already
-    QElapsedTimer m_sinceShown;
+    bool m_isFrameLost = false; // the window manager has ended; m_margins are its frame's
+    QElapsedTimer m_sinceFramed;
 };
 
 } // namespace penwick::platform

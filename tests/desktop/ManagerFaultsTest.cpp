@@ -3,6 +3,8 @@
 #include "desktop/support/FaultFixture.h"
 #include "desktop/support/OtherProgram.h"
 
+#include <tuple>
+
 namespace penwick::desktop {
 
 namespace {
@@ -18,8 +20,40 @@ protected:
     { }
 };
 
-class WindowManagerRestart : public FaultOfEachKind
-{ };
+using ManagerAndKind = std::tuple<WindowManager, const char *>;
+
+class WindowManagerRestart : public FaultTest, public testing::WithParamInterface<ManagerAndKind>
+{
+protected:
+    WindowManagerRestart()
+        : FaultTest(std::get<WindowManager>(GetParam()))
+    { }
+
+    /// Where the server shows the windows, and then where the program believes them to be.
+    [[nodiscard]] std::vector<QRect> places()
+    {
+        std::vector<QRect> places;
+        for (const WindowId window : desktop().windows().ofProcess(host().processId()))
+            places.push_back(desktop().windows().outerFrame(window));
+        for (const char *const name : { "drawing", "toolPanel" })
+            places.push_back(host().window(QString::fromLatin1(name)).frame);
+        return places;
+    }
+    /// The same of what they show, by the server.
+    [[nodiscard]] std::vector<QRect> contents()
+    {
+        std::vector<QRect> contents;
+        for (const WindowId window : desktop().windows().ofProcess(host().processId()))
+            contents.push_back(desktop().windows().clientArea(window));
+        return contents;
+    }
+};
+
+std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info)
+{
+    const auto [manager, kind] = info.param;
+    return std::string(manager == WindowManager::Openbox ? "openbox_" : "xfwm4_") + kind;
+}
 
 class CompositorLost : public FaultTest
 {
@@ -48,20 +82,34 @@ TEST_P(NoWindowManager, windowIsDrawnOnAndEnds)
 
 INSTANTIATE_TEST_SUITE_P(Kinds, NoWindowManager, testing::ValuesIn(allKinds()), kindName);
 
-TEST_P(WindowManagerRestart, leavesAWindowThatIsDrawnOnAndEnds)
+TEST_P(WindowManagerRestart, leavesEverythingInItsPlace)
 {
-    startKind(GetParam());
+    startKind(std::get<const char *>(GetParam()));
     expectInk();
+    std::vector<QRect> placesBefore;
+    ASSERT_TRUE(waitUntil([&] {
+        placesBefore = places();
+        return placesBefore.size() == 4 && placesBefore[0] == placesBefore[2]
+            && placesBefore[1] == placesBefore[3];
+    }));
+    const std::vector<QRect> contentsBefore = contents();
 
     desktop().endWindowManager();
     expectInk();
+    EXPECT_EQ(contents(), contentsBefore);
 
     desktop().startWindowManager();
+    EXPECT_TRUE(waitUntil([&] { return places() == placesBefore; }));
     expectInk();
+    EXPECT_EQ(places(), placesBefore);
+    EXPECT_EQ(contents(), contentsBefore);
     expectEndByTool(); // so the tool bar is there, and above
 }
 
-INSTANTIATE_TEST_SUITE_P(Kinds, WindowManagerRestart, testing::ValuesIn(allKinds()), kindName);
+INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, WindowManagerRestart,
+    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+        testing::ValuesIn(allKinds())),
+    managerAndKindName);
 
 TEST_F(CompositorLost, underAnOpenOverlayItIsBlackMeanwhileAndShowsWhatIsBelowAgainAfterwards)
 {
