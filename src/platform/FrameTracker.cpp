@@ -79,6 +79,7 @@ void FrameTracker::prepareToShow()
         m_margins = native.frameMargins();
     }
     followFrame();
+    m_scale = native.devicePixelRatio();
     m_sinceFramed.start();
     applyRequest();
     m_announced = toDesktop(m_frame);
@@ -153,6 +154,7 @@ void FrameTracker::check()
 {
     if (!m_window.isVisible() || m_window.isMinimized())
         return;
+    adoptScale();
     if (isDecoratedAnew()) {
         m_margins = m_window.windowHandle()->frameMargins();
         applyRequest();
@@ -172,6 +174,20 @@ void FrameTracker::check()
     if (wasPending)
         Q_EMIT confirmed();
     announce();
+}
+
+// On a screen of another scale the same window and the same title bar measure other points, so
+// nothing that was asked before holds.
+void FrameTracker::adoptScale()
+{
+    const QWindow &native = *m_window.windowHandle();
+    const double scale = native.devicePixelRatio();
+    if (std::exchange(m_scale, scale) == scale)
+        return;
+    if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
+        m_margins = native.frameMargins();
+    m_isPending = false;
+    Q_EMIT rescaled();
 }
 
 // A window manager may move a frame without a word to its window right after it has decorated it;

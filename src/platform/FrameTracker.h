@@ -58,11 +58,15 @@ Q_SIGNALS:
     void confirmed();
     /// The window's top left corner is somewhere else.
     void moved();
+    /// The window has come to a screen with another number of device pixels a point. Sent before
+    /// all others.
+    void rescaled();
 
 private:
     void followFrame();
     void onFrameExchanged(bool hasFrame);
     void applyRequest();
+    void adoptScale();
     void mendToolkit();
     void check();
     [[nodiscard]] bool isDecoratedAnew() const;
@@ -76,6 +80,7 @@ private:
     Rect m_frame;
     QRect m_announced; // Qt's desktop; what the last signals told of
     QMargins m_margins; // of the desktop, as last used to place the window
+    double m_scale = 0.0; // device pixels a point, for which m_margins hold
     bool m_isPending = false; // asked, not yet granted
     WId m_followed = 0;
     std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it

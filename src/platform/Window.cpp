@@ -53,14 +53,15 @@ Window::Window(QWidget *parent)
 {
     setAttribute(Qt::WA_QuitOnClose, false);
     setAttribute(Qt::WA_AlwaysShowToolTips); // a panel is never the active window
-    connect(d->tracker, &FrameTracker::shifted, this,
-        [this](QPoint delta) { d->family.takeAlong(delta); });
-    connect(d->tracker, &FrameTracker::moveBegan, this,
-        [this] { tellDelegate(&WindowDelegate::windowWillMove); });
-    connect(d->tracker, &FrameTracker::moved, this,
-        [this] { tellDelegate(&WindowDelegate::windowDidMove); });
-    connect(d->tracker, &FrameTracker::resized, this,
-        [this] { tellDelegate(&WindowDelegate::windowDidResize); });
+    const FrameTracker *const tracker = d->tracker;
+    connect(tracker, &FrameTracker::rescaled, this, [this] { WindowBackdrop::rescale(*this); });
+    connect(tracker, &FrameTracker::shifted, this, [this](QPoint by) { d->family.takeAlong(by); });
+    const auto tell = [this](auto signal, void (WindowDelegate::*what)()) {
+        connect(d->tracker, signal, this, [this, what] { tellDelegate(what); });
+    };
+    tell(&FrameTracker::moveBegan, &WindowDelegate::windowWillMove);
+    tell(&FrameTracker::moved, &WindowDelegate::windowDidMove);
+    tell(&FrameTracker::resized, &WindowDelegate::windowDidResize);
     applyAttributes();
 }
 
@@ -334,10 +335,8 @@ void Window::changeEvent(QEvent *event)
 void Window::closeEvent(QCloseEvent *event)
 {
     event->accept();
-    if (d->isClosed)
-        return;
-    d->isClosed = true;
-    tellDelegate(&WindowDelegate::windowWillClose);
+    if (!std::exchange(d->isClosed, true))
+        tellDelegate(&WindowDelegate::windowWillClose);
 }
 
 // Whatever no view has taken

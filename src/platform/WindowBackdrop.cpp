@@ -13,6 +13,7 @@
 #include <QLoggingCategory>
 #include <QPainter>
 #include <QScreen>
+#include <QWindow>
 
 namespace penwick::platform {
 
@@ -63,6 +64,13 @@ void WindowBackdrop::prepare(Window &window)
     } else if (window.contentView() && window.contentView()->layer()) {
         window.setMask(rounded(area.size(), window.contentView()->layer()->cornerRadius));
     }
+}
+
+// The toolkit keeps the shape in the pixels of the scale that it was set with.
+void WindowBackdrop::rescale(Window &window)
+{
+    if (!window.mask().isEmpty())
+        window.windowHandle()->setMask(window.mask());
 }
 
 bool WindowBackdrop::paint(QPainter &painter) const

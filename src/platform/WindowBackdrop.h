@@ -18,6 +18,8 @@ public:
     /// Makes ready for `window`, which has its frame and is about to be shown. Says each
     /// time that it takes a picture that the desktop is one that cannot.
     void prepare(Window &window);
+    /// Cuts off the corners of `window` again, which has come to a screen of another scale.
+    static void rescale(Window &window);
     /// Paints the picture, if there is one.
     [[nodiscard]] bool paint(QPainter &painter) const;
 

@@ -52,7 +52,7 @@ protected:
 std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info)
 {
     const auto [manager, kind] = info.param;
-    return std::string(manager == WindowManager::Openbox ? "openbox_" : "xfwm4_") + kind;
+    return managerName({ manager, 0 }) + '_' + kind;
 }
 
 class CompositorLost : public FaultTest
