@@ -3,8 +3,6 @@
 #include "desktop/support/FaultFixture.h"
 #include "desktop/support/OtherProgram.h"
 
-#include <tuple>
-
 namespace penwick::desktop {
 
 namespace {
@@ -20,8 +18,6 @@ protected:
     { }
 };
 
-using ManagerAndKind = std::tuple<WindowManager, const char *>;
-
 class WindowManagerRestart : public FaultTest, public testing::WithParamInterface<ManagerAndKind>
 {
 protected:
@@ -29,17 +25,7 @@ protected:
         : FaultTest(std::get<WindowManager>(GetParam()))
     { }
 
-    /// Where the server shows the windows, and then where the program believes them to be.
-    [[nodiscard]] std::vector<QRect> places()
-    {
-        std::vector<QRect> places;
-        for (const WindowId window : desktop().windows().ofProcess(host().processId()))
-            places.push_back(desktop().windows().outerFrame(window));
-        for (const char *const name : { "drawing", "toolPanel" })
-            places.push_back(host().window(QString::fromLatin1(name)).frame);
-        return places;
-    }
-    /// The same of what they show, by the server.
+    /// Where the server shows what the windows show.
     [[nodiscard]] std::vector<QRect> contents()
     {
         std::vector<QRect> contents;
@@ -48,12 +34,6 @@ protected:
         return contents;
     }
 };
-
-std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info)
-{
-    const auto [manager, kind] = info.param;
-    return managerName({ manager, 0 }) + '_' + kind;
-}
 
 class CompositorLost : public FaultTest
 {
@@ -86,12 +66,8 @@ TEST_P(WindowManagerRestart, leavesEverythingInItsPlace)
 {
     startKind(std::get<const char *>(GetParam()));
     expectInk();
-    std::vector<QRect> placesBefore;
-    ASSERT_TRUE(waitUntil([&] {
-        placesBefore = places();
-        return placesBefore.size() == 4 && placesBefore[0] == placesBefore[2]
-            && placesBefore[1] == placesBefore[3];
-    }));
+    expectPlacesKnown();
+    const std::vector<QRect> placesBefore = places();
     const std::vector<QRect> contentsBefore = contents();
 
     desktop().endWindowManager();

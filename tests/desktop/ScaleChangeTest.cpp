@@ -2,13 +2,9 @@
 // Windows that the user moves to a screen of another scale, and back.
 #include "desktop/support/FaultFixture.h"
 
-#include <tuple>
-
 namespace penwick::desktop {
 
 namespace {
-
-using ManagerAndKind = std::tuple<WindowManager, const char *>;
 
 class ScaleChange : public FaultTest, public testing::WithParamInterface<ManagerAndKind>
 {
@@ -63,12 +59,6 @@ private:
     QSize m_size;
     QPoint m_beforeEnd; // from the tool bar's corner
 };
-
-std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info)
-{
-    const auto [manager, kind] = info.param;
-    return managerName({ manager, 0 }) + '_' + kind;
-}
 
 } // namespace
 

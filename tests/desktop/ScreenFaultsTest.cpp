@@ -10,43 +10,76 @@ constexpr QSize wholeDisplay { 2304, 1000 };
 constexpr QRect first { 0, 0, 1280, 800 };
 constexpr QRect second { 1280, 0, 1024, 768 };
 
-class ScreenLost : public FaultOfEachKind
+class ScreenLost : public FaultTest, public testing::WithParamInterface<ManagerAndKind>
 {
 protected:
     ScreenLost()
-        : FaultOfEachKind(WindowManager::Openbox, wholeDisplay)
+        : FaultTest(std::get<WindowManager>(GetParam()), wholeDisplay)
     {
         desktop().splitInto({ first, second });
     }
+
+    [[nodiscard]] static const char *kind() { return std::get<const char *>(GetParam()); }
+
+    /// Wherever the board went, its tool bar stands beside it as it did.
+    void expectToolBarBeside()
+    {
+        expectPlacesKnown();
+        EXPECT_TRUE(waitUntil([this] { return offsetOfToolBar() == m_offset; }));
+        expectPlacesKnown();
+    }
+    void learnPlaces()
+    {
+        expectPlacesKnown();
+        m_offset = offsetOfToolBar();
+    }
+
+private:
+    [[nodiscard]] QPoint offsetOfToolBar()
+    {
+        const std::vector<QRect> now = places();
+        return now.at(1).topLeft() - now.at(0).topLeft();
+    }
+
+    QPoint m_offset; // from the board's corner to the tool bar's
 };
 
 } // namespace
 
 TEST_P(ScreenLost, leavesAWindowThatIsDrawnOnAndEnds)
 {
-    startKind(GetParam(), { "--screen", "1" });
+    startKind(kind(), { "--screen", "1" });
+    learnPlaces();
     expectInk();
 
     desktop().splitInto({ first });
     expectInk();
+    expectToolBarBeside();
 
     desktop().splitInto({ first, second });
     expectInk();
+    expectToolBarBeside();
 
     expectEndByTool();
 }
 
 TEST_P(ScreenLost, thatIsAnotherThanTheWindowsMattersNothing)
 {
-    startKind(GetParam());
+    startKind(kind());
+    expectPlacesKnown();
+    const std::vector<QRect> before = places();
     expectInk();
 
     desktop().splitInto({ first });
     expectInk();
+    EXPECT_EQ(places(), before);
 
     expectEndByTool();
 }
 
-INSTANTIATE_TEST_SUITE_P(Kinds, ScreenLost, testing::ValuesIn(allKinds()), kindName);
+INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, ScreenLost,
+    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+        testing::ValuesIn(allKinds())),
+    managerAndKindName);
 
 } // namespace penwick::desktop

@@ -38,6 +38,25 @@ void FaultTest::expectInk()
         << "level " << before << " stays at " << middle.x() << ", " << middle.y();
 }
 
+std::vector<QRect> FaultTest::places()
+{
+    std::vector<QRect> places;
+    for (const WindowId window : desktop().windows().ofProcess(host().processId()))
+        places.push_back(desktop().windows().outerFrame(window));
+    for (const char *const name : { "drawing", "toolPanel" })
+        places.push_back(host().window(QString::fromLatin1(name)).frame);
+    return places;
+}
+
+void FaultTest::expectPlacesKnown()
+{
+    std::vector<QRect> seen;
+    EXPECT_TRUE(waitUntil([&] {
+        seen = places();
+        return seen.size() == 4 && seen[0] == seen[2] && seen[1] == seen[3];
+    })) << testing::PrintToString(seen);
+}
+
 void FaultTest::expectEndByTool()
 {
     desktop().pointer().click(toolBar().buttons.value(QStringLiteral("state")));
@@ -59,6 +78,12 @@ std::vector<const char *> allKinds()
 std::string kindName(const testing::TestParamInfo<const char *> &kind)
 {
     return kind.param;
+}
+
+std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info)
+{
+    const auto [manager, kind] = info.param;
+    return managerName({ manager, 0 }) + '_' + kind;
 }
 
 } // namespace penwick::desktop

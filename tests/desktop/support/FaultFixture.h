@@ -4,6 +4,8 @@
 
 #include "desktop/support/BoardFixture.h"
 
+#include <tuple>
+
 namespace penwick::desktop {
 
 /// Base of the tests in which something of the desktop fails while a window is open: afterwards it
@@ -19,6 +21,11 @@ protected:
 
     /// Draws a stroke where there is none yet; fails if it leaves no ink.
     void expectInk();
+    /// The frames of the board and its tool bar: where the server shows them, and then where the
+    /// program believes them to be. More or less than four while they come or go.
+    [[nodiscard]] std::vector<QRect> places();
+    /// Waits until the program believes what the server shows; fails if it never does.
+    void expectPlacesKnown();
     /// Presses END; fails if the program does not end well.
     void expectEndByTool();
     /// Fails if it has written anything that is not its log.
@@ -35,6 +42,11 @@ class FaultOfEachKind : public FaultTest, public testing::WithParamInterface<con
 protected:
     using FaultTest::FaultTest;
 };
+
+using ManagerAndKind = std::tuple<WindowManager, const char *>;
+
+/// Both in the name of a test.
+[[nodiscard]] std::string managerAndKindName(const testing::TestParamInfo<ManagerAndKind> &info);
 
 /// "whiteboard", "annotation" and "imageAnnotation".
 [[nodiscard]] std::vector<const char *> allKinds();
