@@ -6,6 +6,8 @@
 #include <QFile>
 #include <QProcess>
 
+#include <algorithm>
+
 namespace penwick::desktop {
 
 namespace {
@@ -13,15 +15,15 @@ namespace {
 class Surroundings : public FaultTest
 { };
 
-/// Makes a configuration of fonts that knows one alone; gives the file.
-std::string onlyOneFont(const Desktop &desktop)
+/// Makes a configuration of fonts that knows `family` alone; gives the file.
+std::string onlyOneFont(const Desktop &desktop, const QString &family)
 {
     QProcess match;
-    match.start(QStringLiteral("fc-match"),
-        { QStringLiteral("-f"), QStringLiteral("%{file}"), QStringLiteral("DejaVu Sans") });
+    match.start(
+        QStringLiteral("fc-match"), { QStringLiteral("-f"), QStringLiteral("%{file}"), family });
     match.waitForFinished();
     const QString font = QString::fromLocal8Bit(match.readAllStandardOutput());
-    const QDir folder(QString::fromStdString(desktop.file("fonts")));
+    const QDir folder(QString::fromStdString(desktop.file(family.toStdString())));
     EXPECT_TRUE(folder.mkpath(QStringLiteral("."))
         && QFile::copy(font, folder.filePath(QStringLiteral("only.ttf"))))
         << font.toStdString();
@@ -30,6 +32,22 @@ std::string onlyOneFont(const Desktop &desktop)
     configuration.write("<fontconfig><dir>" + folder.path().toLocal8Bit() + "</dir><cachedir>"
         + folder.path().toLocal8Bit() + "</cachedir></fontconfig>");
     return configuration.fileName().toStdString();
+}
+
+int widthOfInk(const QImage &image)
+{
+    constexpr int inkLevel = 60; // the placeholder is lighter
+    int first = image.width();
+    int last = -1;
+    for (int x = 0; x < image.width(); ++x) {
+        for (int y = 0; y < image.height(); ++y) {
+            if (qGray(image.pixel(x, y)) < inkLevel) {
+                first = std::min(first, x);
+                last = x;
+            }
+        }
+    }
+    return std::max(0, last - first + 1);
 }
 
 class LostConnection : public FaultOfEachKind
@@ -85,16 +103,26 @@ TEST_F(Surroundings, withoutAHomeThatCanBeWrittenAreNothingToSpeakOf)
 
 TEST_F(Surroundings, withOneFontAloneAreWrittenInWithThat)
 {
-    startKind("whiteboard", { "--tool", "text" }, { "FONTCONFIG_FILE=" + onlyOneFont(desktop()) });
-    click({ 300, 200 });
+    // "mim" is about 50 pixels wide in the one and 41 in the other.
+    std::vector<int> widths;
+    for (const char *const family : { "DejaVu Sans", "DejaVu Sans Mono" }) {
+        startKind("whiteboard", { "--tool", "text" },
+            { "FONTCONFIG_FILE=" + onlyOneFont(desktop(), QString::fromLatin1(family)) });
+        click({ 300, 200 });
 
-    desktop().keyboard().type("mmm");
+        desktop().keyboard().type("mim");
 
-    const QRect line(onScreen({ 306, 200 }), QSize(50, 20)); // inside the box's border
-    constexpr int inkLevel = 60; // the placeholder is lighter
-    EXPECT_TRUE(waitUntil([&] { return darkest(desktop().screen().picture(line)) < inkLevel; }));
-    expectNothingSaid();
-    expectEndByTool();
+        const QRect line(onScreen({ 306, 200 }), QSize(80, 20)); // inside the box's border
+        int width = 0;
+        EXPECT_TRUE(waitUntil([&] {
+            width = widthOfInk(desktop().screen().picture(line));
+            return width >= 38;
+        })) << width;
+        widths.push_back(width);
+        expectNothingSaid();
+        expectEndByTool();
+    }
+    EXPECT_GT(widths.at(0), widths.at(1) + 5); // more than a caret
 }
 
 TEST_P(LostConnection, endsTheProgramWithoutAWordOfOurs)
