@@ -28,7 +28,7 @@ constexpr int restTime = 80; // milliseconds
 
 QSet<QString> notificationNames()
 {
-    const QString end = penwickSessionEndNotificationKey();
+    const QString &end = penwickSessionEndNotificationKey();
     const QString endSuffix = QStringLiteral(".penwick.session.end");
     Q_ASSERT(end.endsWith(endSuffix));
     const QString prefix = end.chopped(endSuffix.size());

@@ -23,7 +23,7 @@ bool isContrastIncreased()
 ToolPanelButton::ToolPanelButton(QWidget *parent)
     : Button(parent)
 {
-    awakeFromScene();
+    ToolPanelButton::awakeFromScene(); // by name: nothing that derives is there yet
 }
 
 ToolPanelButton::ToolPanelButton(const platform::Rect &frame)

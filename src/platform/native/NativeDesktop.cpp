@@ -25,6 +25,7 @@ std::optional<QMargins> NativeDesktop::frameMarginsBeforeShow(QWindow &)
     return std::nullopt;
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param): a desktop that can follow keeps it
 void NativeDesktop::followFrame(QWindow &, FrameListener) { }
 
 void NativeDesktop::forgetFrame(WId) { }
