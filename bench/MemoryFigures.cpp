@@ -61,7 +61,7 @@ double windowsCached(const EntryList<StrokeEntry> &strokes, double scale)
 Figures byteFigures()
 {
     Board board(manyStrokes);
-    const EntryList<StrokeEntry> all = board.strokes();
+    const EntryList<StrokeEntry> &all = board.strokes();
     EntryList<StrokeEntry> one;
     one.append(all.first());
     return {

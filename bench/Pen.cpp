@@ -61,9 +61,10 @@ Point Pen::next()
 std::vector<Point> freePlaces()
 {
     std::vector<Point> places;
-    for (double x = gap / 2; x < canvasWidth; x += gap) {
-        for (double y = gap / 2; y < canvasHeight; y += gap)
-            places.push_back({ x, y });
+    const auto middle = [](int index) { return (index + 0.5) * gap; };
+    for (int column = 0; middle(column) < canvasWidth; ++column) {
+        for (int row = 0; middle(row) < canvasHeight; ++row)
+            places.push_back({ middle(column), middle(row) });
     }
     return places;
 }

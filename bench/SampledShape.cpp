@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 
 namespace penwick::bench {
 
@@ -56,7 +57,7 @@ double SampledShape::coverage(int x, int y) const
     int covered = 0;
     for (int row = y * samplesAcross; row < (y + 1) * samplesAcross; ++row) {
         const auto start = m_samples.begin() + static_cast<std::ptrdiff_t>(row) * m_size.width()
-            + x * samplesAcross;
+            + static_cast<std::ptrdiff_t>(x) * samplesAcross;
         covered += static_cast<int>(std::count(start, start + samplesAcross, 1));
     }
     return static_cast<double>(covered) / (samplesAcross * samplesAcross);
