@@ -38,9 +38,10 @@ void MonkeyHost::open()
         command.arguments.push_back(m_desktop.file("picture.png"));
     }
     for (const char *const variable : { "QT_QPA_PLATFORM=xcb", "QT_FATAL_WARNINGS=1",
-             "UBSAN_OPTIONS=print_stacktrace=1", "ASAN_OPTIONS=detect_leaks=1",
-             "LSAN_OPTIONS=suppressions=" PENWICK_LEAKS_OF_OTHERS ":print_suppressions=0" })
+             "UBSAN_OPTIONS=print_stacktrace=1", "ASAN_OPTIONS=detect_leaks=1" })
         command.environment.emplace_back(variable);
+    command.environment.emplace_back(
+        "LSAN_OPTIONS=suppressions=" PENWICK_LEAKS_OF_OTHERS ":print_suppressions=0");
     m_process.reset();
     m_process = std::make_unique<ChildProcess>(command);
     ++m_sessions;

@@ -37,6 +37,22 @@ void play(Monkey &monkey, MonkeyHost &host, int events)
     host.end();
 }
 
+// Returns the program's status.
+int playAndTell(Monkey &monkey, MonkeyHost &host, int events)
+{
+    try {
+        play(monkey, host, events);
+    } catch (const std::exception &problem) {
+        std::printf("%s, after:\n", problem.what());
+        for (const std::string &act : monkey.memory())
+            std::printf("  %s\n", act.c_str());
+        std::printf("its errors:\n%s\n", host.errorOutput().c_str());
+        return 1;
+    }
+    std::printf("the host is well after %d session(s)\n", host.sessions());
+    return 0;
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -64,18 +80,14 @@ int main(int argc, char **argv)
     std::printf("penwick-monkey --seed %llu --events %d --window %s\n", seed, events, kind.c_str());
     std::fflush(stdout);
 
-    Desktop desktop;
-    MonkeyHost host(desktop, parser.value(QStringLiteral("host")).toStdString(), kind);
-    Monkey monkey(desktop, host, seed);
     try {
-        play(monkey, host, events);
+        Desktop desktop;
+        MonkeyHost host(desktop, parser.value(QStringLiteral("host")).toStdString(), kind);
+        Monkey monkey(desktop, host, seed);
+        return playAndTell(monkey, host, events);
     } catch (const std::exception &problem) {
-        std::printf("%s, after:\n", problem.what());
-        for (const std::string &act : monkey.memory())
-            std::printf("  %s\n", act.c_str());
-        std::printf("its errors:\n%s\n", host.errorOutput().c_str());
+        // There is no desktop, or no host on it.
+        std::fprintf(stderr, "error: %s\n", problem.what());
         return 1;
     }
-    std::printf("the host is well after %d session(s)\n", host.sessions());
-    return 0;
 }
