@@ -52,22 +52,23 @@ TEST_F(DrawingWindowStopDeathTest, missingBannerSceneStopsTheProcess)
 {
     useBanner({});
 
-    EXPECT_DEATH(makeDrawingWindowScene(), "penwick: fatal error: ");
+    EXPECT_DEATH(static_cast<void>(makeDrawingWindowScene()), "penwick: fatal error: ");
 }
 
 TEST_F(DrawingWindowStopDeathTest, bannerSceneOfAnotherClassStopsTheProcess)
 {
     useBanner([] { return std::make_unique<QObject>(); });
 
-    EXPECT_DEATH(
-        makeDrawingWindowScene(), "penwick: fatal error: the drawing window has no sharing banner");
+    EXPECT_DEATH(static_cast<void>(makeDrawingWindowScene()),
+        "penwick: fatal error: the drawing window has no sharing banner");
 }
 
 TEST_F(DrawingWindowStopDeathTest, loadingWithoutResourcesStopsTheProcess)
 {
     setPenwickBundle(nullptr);
 
-    EXPECT_DEATH(makeDrawingWindowScene(), "penwick: fatal error: the resource bundle is not set");
+    EXPECT_DEATH(static_cast<void>(makeDrawingWindowScene()),
+        "penwick: fatal error: the resource bundle is not set");
     EXPECT_DEATH(m_penwick.createDrawingWindowController(WindowType::whiteboard, primary()),
         "penwick: fatal error: the resource bundle is not set");
 }
