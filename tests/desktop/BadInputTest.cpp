@@ -16,7 +16,7 @@ protected:
     {
         QImage image(size, QImage::Format_RGB32);
         image.fill(Qt::white);
-        const std::string file = desktop().file("picture.png");
+        std::string file = desktop().file("picture.png");
         if (!image.save(QString::fromStdString(file)))
             throw std::runtime_error("cannot write " + file);
         return file;

@@ -56,7 +56,7 @@ TEST(BezierPath, linesThatFollowEachOtherAreAChainOfPointsAndKeepTheirElements)
 {
     BezierPath path;
     EXPECT_TRUE(path.chain().empty());
-    for (double x = 0; x < 3; ++x) {
+    for (const double x : { 0.0, 1.0, 2.0 }) {
         path.moveToPoint({ x, 1 });
         path.lineToPoint({ x + 1, 1 });
     }
@@ -67,7 +67,8 @@ TEST(BezierPath, linesThatFollowEachOtherAreAChainOfPointsAndKeepTheirElements)
     for (int index = 0; index < 6; ++index) {
         const BezierPath::Element element = path.elementAtIndex(index);
         EXPECT_EQ(element.kind, index % 2 == 0 ? Kind::MoveTo : Kind::LineTo) << index;
-        EXPECT_EQ(element.points[0], (Point { (index + 1) / 2 * 1.0, 1 })) << index;
+        const int place = (index + 1) / 2;
+        EXPECT_EQ(element.points[0], (Point { static_cast<double>(place), 1 })) << index;
     }
 }
 

@@ -12,6 +12,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace penwick {
@@ -115,7 +116,7 @@ public:
     explicit Onlooker(std::function<void()> look)
     {
         platform::NotificationCenter::defaultCenter().addObserver(
-            this, QString(), [look](const platform::Notification &) { look(); });
+            this, QString(), [look = std::move(look)](const platform::Notification &) { look(); });
     }
     ~Onlooker() { platform::NotificationCenter::defaultCenter().removeObserver(this); }
     Onlooker(const Onlooker &) = delete;

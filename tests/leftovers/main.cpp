@@ -52,7 +52,7 @@ void sayCosts(const Sessions &sessions)
 // stop the process.
 void postWhatNoLiveCanvasTakes()
 {
-    const QString end = penwick::penwickSessionEndNotificationKey();
+    const QString &end = penwick::penwickSessionEndNotificationKey();
     const QString prefix = end.chopped(QStringLiteral(".penwick.session.end").size());
     NotificationCenter &center = NotificationCenter::defaultCenter();
     center.postNotification(prefix + QStringLiteral(".penwik.notification"),

@@ -76,7 +76,7 @@ void ReferenceCanvas::record(Action action, const Item &item)
 
 void ReferenceCanvas::beginStroke(std::int64_t id, int line, double x)
 {
-    geometry[id] = { line, {} };
+    m_geometry[id] = { line, {} };
     strokes.push_back({ true, id, x });
     record(Action::draw, strokes.back());
     redoStack.clear();
@@ -88,13 +88,13 @@ void ReferenceCanvas::extendStroke(double x)
     if (strokes.empty())
         return;
     Item &newest = strokes.back();
-    geometry[newest.id].stretches.emplace_back(std::minmax(newest.startX, x));
+    m_geometry[newest.id].stretches.emplace_back(std::minmax(newest.startX, x));
     newest.startX = x;
 }
 
 bool ReferenceCanvas::isHit(const Item &stroke, int line, double x, double aboveLine) const
 {
-    const Geometry &shape = geometry.at(stroke.id);
+    const Geometry &shape = m_geometry.at(stroke.id);
     if (shape.line != line)
         return false;
     for (const auto &[left, right] : shape.stretches) {

@@ -52,7 +52,7 @@ public:
     [[nodiscard]] Ids strokeIds() const { return idsOf(strokes); }
     [[nodiscard]] Ids textBoxIds() const { return idsOf(textBoxes); }
     /// The line that the newest stroke lies on.
-    [[nodiscard]] int newestLine() const { return geometry.at(strokes.back().id).line; }
+    [[nodiscard]] int newestLine() const { return m_geometry.at(strokes.back().id).line; }
 
     std::vector<Item> strokes; // oldest first
     std::vector<Item> textBoxes;
@@ -81,7 +81,7 @@ private:
     void undoOne(const Record &record);
     void redoOne(const Record &record);
 
-    std::map<std::int64_t, Geometry> geometry; // of every stroke that ever was
+    std::map<std::int64_t, Geometry> m_geometry; // of every stroke that ever was
 };
 
 } // namespace penwick::test

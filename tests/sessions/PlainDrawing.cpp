@@ -115,7 +115,7 @@ bool PlainDrawing::eraseAt(Spot place)
 
 std::string PlainDrawing::addBox()
 {
-    const std::string name = "b" + std::to_string(++m_boxesMade);
+    std::string name = "b" + std::to_string(++m_boxesMade);
     m_boxes.push_back(name);
     record("draw", name);
     return name;

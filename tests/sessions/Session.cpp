@@ -46,7 +46,7 @@ std::optional<std::string> Session::run(const Steps &steps)
     open(steps.empty() ? 0 : steps.front().b);
     for (const Step &step : steps) {
         take(step);
-        if (const auto found = difference())
+        if (auto found = difference())
             return found;
         if (m_plain->isClosed())
             open(step.b); // the host has been told, drops the window and makes another
@@ -111,9 +111,11 @@ void Session::take(const Step &step)
 Spot Session::spotFor(const Step &step, int margin) const
 {
     const Spot size = m_real.size();
+    // Whole points: what a pointer can point at.
     const auto at = [margin](int part, int parts, double length) {
-        return static_cast<double>(
-            margin + (part % parts) * static_cast<int>(length - 2 * margin) / (parts - 1));
+        const int free = static_cast<int>(length - 2 * margin);
+        const int place = margin + (part % parts) * free / (parts - 1);
+        return static_cast<double>(place);
     };
     return { at(step.a, columns, size.x), at(step.b, rows, size.y) };
 }
@@ -256,7 +258,7 @@ void Session::clickTool(const Step &step)
 {
     // The end is rare, so that there is something to end.
     const auto &names = toolNames();
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     if (name == "state" && step.b > 20)
         return;
     const bool byPointer = !m_real.held() && canPoint() && step.b % 2;
@@ -270,7 +272,7 @@ void Session::chooseOption(const Step &step)
     const auto &options = optionsOf(m_plain->popover());
     if (!m_plain->isPopoverVisible() || options.empty())
         return;
-    const std::string name = options[static_cast<std::size_t>(step.a) % options.size()];
+    const std::string &name = options[static_cast<std::size_t>(step.a) % options.size()];
     const bool byPointer = !m_real.held() && canPoint() && step.b % 2;
     say("option " + name + (byPointer ? " by pointer" : ""));
     m_real.chooseOption(name, byPointer);
@@ -289,7 +291,7 @@ void Session::key(const Step &step)
 {
     static const std::vector<std::string> names { "b", "t", "e", "c", "BackSpace", "BackSpace",
         "Return", "Tab", "Escape", "1", "2", "4", "9", "C-z", "C-z", "C-y", "C-Delete", "C-w" };
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     const bool isEditing = !m_plain->canvas().editedBox().empty();
     // The editor has an undo of its own; and the end is rare.
     const bool isEditors = isEditing && name.starts_with("C-") && name != "C-w";

@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <vector>
 
 namespace penwick::test {
@@ -220,7 +221,8 @@ RC_GTEST_PROP(CoverageMaskProperties, anyPartIsWhatTheWholeHasThere, ())
 
     std::vector<int> expected;
     for (int y = part.y(); y <= part.bottom(); ++y) {
-        const auto start = whole.begin() + (y - area.y()) * area.width() + part.x() - area.x();
+        const auto row = static_cast<std::ptrdiff_t>(y - area.y());
+        const auto start = whole.begin() + row * area.width() + part.x() - area.x();
         expected.insert(expected.end(), start, start + part.width());
     }
 

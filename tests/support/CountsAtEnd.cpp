@@ -4,6 +4,7 @@
 // desktop tests end a host that is no longer needed by SIGTERM.
 #include <csignal>
 
+// NOLINTNEXTLINE(bugprone-reserved-identifier): the compiler's own name
 extern "C" void __gcov_dump(void);
 
 namespace {

@@ -18,8 +18,8 @@ std::optional<std::string> buttonState(const QVariant &object)
     const QVariantMap map = object.toMap();
     if (object.typeId() != QMetaType::QVariantMap || map.size() != 1)
         return std::nullopt;
-    const QString key = map.firstKey();
-    const QVariant value = map.first();
+    const QString &key = map.firstKey();
+    const QVariant &value = map.first();
     const bool isKnown = key == QStringLiteral("enableUndo") || key == QStringLiteral("enableRedo");
     if (!isKnown || value.typeId() != QMetaType::Bool)
         return std::nullopt;

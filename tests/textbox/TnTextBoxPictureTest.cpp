@@ -33,9 +33,9 @@ protected:
     static std::string dashes(int start, int length, int whole)
     {
         std::string pixels(static_cast<std::size_t>(whole), '.');
-        for (int place = 0; place < length; ++place) {
-            if (place % 9 < 5)
-                pixels[static_cast<std::size_t>(start + place)] = '#';
+        for (int place = start; place < start + length; ++place) {
+            if ((place - start) % 9 < 5)
+                pixels[static_cast<std::size_t>(place)] = '#';
         }
         return pixels;
     }

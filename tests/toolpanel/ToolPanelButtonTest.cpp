@@ -265,7 +265,7 @@ TEST_P(ButtonWithOptions, hasATriangleInItsLowerRightCorner)
             if (isInside && x + y >= 54)
                 EXPECT_EQ(level, 0) << x << ", " << y;
             else if (isInside && x + y == 53)
-                EXPECT_NEAR(level, normal.green() / 2, 2) << x << ", " << y;
+                EXPECT_NEAR(level, normal.green() / 2.0, 2) << x << ", " << y;
             else
                 EXPECT_EQ(level, normal.green()) << x << ", " << y;
         }

@@ -27,6 +27,7 @@ public:
 
     /// Throws a runtime_error with the reason when the program cannot be started.
     explicit ChildProcess(const Command &command);
+    // NOLINTNEXTLINE(bugprone-exception-escape): a program that no kill ends is to end the test
     ~ChildProcess();
     ChildProcess(const ChildProcess &) = delete;
     ChildProcess &operator=(const ChildProcess &) = delete;

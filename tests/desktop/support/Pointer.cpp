@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstddef>
 #include <memory>
 #include <stdexcept>
 
@@ -97,7 +98,8 @@ CursorLook Pointer::look() const
         return {};
     QImage image(cursor->width, cursor->height, QImage::Format_ARGB32_Premultiplied);
     for (int y = 0; y < image.height(); ++y) {
-        const unsigned long *const row = cursor->pixels + y * image.width();
+        const auto above = static_cast<std::ptrdiff_t>(y) * image.width();
+        const unsigned long *const row = cursor->pixels + above;
         std::transform(row, row + image.width(), reinterpret_cast<QRgb *>(image.scanLine(y)),
             [](unsigned long pixel) { return static_cast<QRgb>(pixel); });
     }

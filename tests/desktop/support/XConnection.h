@@ -7,7 +7,8 @@
 #include <vector>
 
 class QRect;
-struct _XDisplay; // X's own name for what a Display points at
+// NOLINTNEXTLINE(bugprone-reserved-identifier): X's own name for what a Display points at
+struct _XDisplay;
 
 namespace penwick::desktop {
 
