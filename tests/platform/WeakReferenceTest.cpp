@@ -4,7 +4,8 @@
 
 #include <gtest/gtest.h>
 
-#include <memory>
+#include <optional>
+#include <utility>
 
 namespace penwick::platform {
 
@@ -31,9 +32,9 @@ TEST(WeakReference, newOneIsEmpty)
 
 TEST(WeakReference, targetIsFoundAsItsContractUntilItIsGone)
 {
-    auto target = std::make_unique<Target>();
-    const WeakReference<Contract> reference(target.get());
-    EXPECT_EQ(reference.get(), static_cast<Contract *>(target.get()));
+    std::optional<Target> target(std::in_place);
+    const WeakReference<Contract> reference(&*target);
+    EXPECT_EQ(reference.get(), static_cast<Contract *>(&*target));
 
     target.reset();
 
