@@ -5,6 +5,7 @@
 #include "platform/native/NativeDesktop.h"
 
 #include <QEvent>
+#include <QGuiApplication>
 #include <QScreen>
 #include <QWidget>
 #include <QWindow>
@@ -69,6 +70,9 @@ void FrameTracker::request(const Rect &frame)
 
 void FrameTracker::prepareToShow()
 {
+    // Or it would measure in another screen's points until it is there.
+    if (QScreen *const screen = QGuiApplication::screenAt(toDesktop(m_frame).center()))
+        m_window.setScreen(screen);
     m_window.winId(); // the desktop can only be asked about a window that exists
     QWindow &native = *m_window.windowHandle();
     if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint)) {
@@ -92,6 +96,8 @@ void FrameTracker::followFrame()
     m_followed = native.winId();
     m_corner.reset();
     m_isFrameLost = false;
+    connect(&native, &QWindow::screenChanged, &m_check, qOverload<>(&QTimer::start),
+        Qt::UniqueConnection);
     NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
         if (corner.has_value() != m_corner.has_value())
             onFrameExchanged(corner.has_value());
@@ -101,7 +107,8 @@ void FrameTracker::followFrame()
 }
 
 // The window manager that ends takes its frames along, and the one that comes back builds them
-// elsewhere before it puts them in their place. Neither is a move by the user.
+// elsewhere before it puts them in their place. Neither is a move by the user, unless the window
+// comes to rest elsewhere.
 void FrameTracker::onFrameExchanged(bool hasFrame)
 {
     if (!m_window.isVisible())
@@ -152,8 +159,14 @@ QRect FrameTracker::outerGeometry() const
 
 void FrameTracker::check()
 {
-    if (!m_window.isVisible() || m_window.isMinimized())
+    if (!m_window.isVisible())
         return;
+    if (m_window.isMinimized()) {
+        m_patience.stop(); // nobody answers meanwhile
+        return;
+    }
+    if (m_isPending && !m_patience.isActive())
+        awaitAnswer();
     adoptScale();
     if (isDecoratedAnew()) {
         m_margins = m_window.windowHandle()->frameMargins();
@@ -162,11 +175,11 @@ void FrameTracker::check()
         return;
     }
     const QRect outer = outerGeometry();
-    if (outer != toDesktop(m_frame)) {
+    if (!isWhereItBelongs(outer)) {
         if (m_isPending)
             return; // until the desktop answers or patience ends
         m_frame = fromDesktop(outer);
-        m_isByUser = true;
+        m_isByUser = !m_isRescaled;
     }
     const bool wasPending = std::exchange(m_isPending, false);
     m_patience.stop();
@@ -176,18 +189,35 @@ void FrameTracker::check()
     announce();
 }
 
-// On a screen of another scale the same window and the same title bar measure other points, so
-// nothing that was asked before holds.
+// On a screen of another scale the same window and the same title bar measure other points. What
+// the program has asked for in points still holds.
 void FrameTracker::adoptScale()
 {
     const QWindow &native = *m_window.windowHandle();
     const double scale = native.devicePixelRatio();
-    if (std::exchange(m_scale, scale) == scale)
+    const double before = std::exchange(m_scale, scale);
+    if (before == scale)
         return;
-    if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
+    m_isRescaled = true;
+    if (m_isFrameLost || isArranged())
+        m_margins = m_margins * (before / scale);
+    else if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
         m_margins = native.frameMargins();
-    m_isPending = false;
+    if (m_isPending) {
+        applyRequest();
+        awaitAnswer();
+    }
     Q_EMIT rescaled();
+}
+
+// Borders of a pixel cannot be told in points where a point is more than that.
+bool FrameTracker::isWhereItBelongs(const QRect &outer) const
+{
+    const QRect frame = toDesktop(m_frame);
+    if (m_scale == 1.0)
+        return outer == frame;
+    const QMargins point(1, 1, 1, 1);
+    return frame.marginsAdded(point).contains(outer) && outer.marginsAdded(point).contains(frame);
 }
 
 // A window manager may move a frame without a word to its window right after it has decorated it;
@@ -197,8 +227,10 @@ void FrameTracker::adoptScale()
 void FrameTracker::mendToolkit()
 {
     const bool isNew = m_sinceFramed.isValid() && m_sinceFramed.elapsed() < newness;
-    const bool isStale = m_corner && isNew && !m_isByUser && !m_userMove.isActive()
-        && m_window.windowHandle()->frameGeometry().topLeft() != toDesktop(m_frame).topLeft();
+    QRect believed = toDesktop(m_frame);
+    believed.moveTopLeft(m_window.windowHandle()->frameGeometry().topLeft());
+    const bool isStale = m_corner && isNew && !m_isByUser && !m_userMove.isActive() && !isArranged()
+        && !isWhereItBelongs(believed);
     if (isStale && !std::exchange(m_isMended, true)) {
         m_window.setGeometry(toDesktop(m_frame).marginsRemoved(m_margins).translated(1, 0));
         applyRequest();
@@ -215,8 +247,13 @@ bool FrameTracker::isDecoratedAnew() const
     if (m_window.windowFlags().testFlag(Qt::FramelessWindowHint) || m_isFrameLost)
         return false; // whatever the toolkit makes of a frame that is still being built
     const QMargins margins = m_window.windowHandle()->frameMargins();
-    return margins != m_margins && !(m_isPending && margins.isNull())
-        && !m_window.windowState().testAnyFlags(Qt::WindowMaximized | Qt::WindowFullScreen);
+    return margins != m_margins && !(m_isPending && margins.isNull()) && !isArranged();
+}
+
+// Where the desktop says what size the window has, and often without borders.
+bool FrameTracker::isArranged() const
+{
+    return m_window.windowState().testAnyFlags(Qt::WindowMaximized | Qt::WindowFullScreen);
 }
 
 void FrameTracker::announceUserMove()
@@ -243,6 +280,18 @@ void FrameTracker::lookAgain()
     check();
 }
 
+// As many pixels are other points. A move comes before the size here, so that whatever keeps its
+// distance from the window's corner does so in points.
+void FrameTracker::announceRescaled(QPoint delta, bool hasResized)
+{
+    if (!delta.isNull()) {
+        Q_EMIT shifted(delta);
+        Q_EMIT moved();
+    }
+    if (hasResized)
+        Q_EMIT resized();
+}
+
 void FrameTracker::announce()
 {
     const QRect outer = toDesktop(m_frame);
@@ -250,6 +299,8 @@ void FrameTracker::announce()
     const QPoint delta = outer.topLeft() - m_announced.topLeft();
     m_announced = outer;
     const bool isByUser = std::exchange(m_isByUser, false);
+    if (std::exchange(m_isRescaled, false))
+        return announceRescaled(delta, hasResized);
     if (hasResized)
         Q_EMIT resized();
     if (hasResized && isByUser)

@@ -22,8 +22,8 @@ namespace penwick::platform {
 ///
 /// Frames are in points, y up, from the primary screen's bottom left corner. A decorated window
 /// has no true frame until the desktop has answered, which may be after the first paint; until
-/// then frame() is what was asked. While there is no window manager after all, its frame counts as
-/// if it were still there, since the next one puts one there. GUI thread only.
+/// then frame() is what was asked. While the window manager that has framed a window is gone, the
+/// frame counts as if it were still there, since the next one puts one there. GUI thread only.
 class FrameTracker final : public QObject
 {
     Q_OBJECT
@@ -54,12 +54,13 @@ Q_SIGNALS:
     void shifted(QPoint delta);
     /// The same, because the user pulled at its edges. Sent after resized().
     void resizedByUser();
-    /// The desktop has granted the frame that was asked for.
+    /// The desktop has granted the frame that was asked for, or put a frame of its own around the
+    /// window in the same place.
     void confirmed();
     /// The window's top left corner is somewhere else.
     void moved();
     /// The window has come to a screen with another number of device pixels a point. Sent before
-    /// all others.
+    /// all others, of which shifted() and moved() come before resized() then.
     void rescaled();
 
 private:
@@ -67,20 +68,24 @@ private:
     void onFrameExchanged(bool hasFrame);
     void applyRequest();
     void adoptScale();
+    [[nodiscard]] bool isArranged() const;
     void mendToolkit();
     void check();
     [[nodiscard]] bool isDecoratedAnew() const;
     void awaitAnswer();
     void lookAgain();
     void announce();
+    void announceRescaled(QPoint delta, bool hasResized);
     void announceUserMove();
     [[nodiscard]] QRect outerGeometry() const;
+    [[nodiscard]] bool isWhereItBelongs(const QRect &outer) const;
 
     QWidget &m_window;
     Rect m_frame;
     QRect m_announced; // Qt's desktop; what the last signals told of
     QMargins m_margins; // of the desktop, as last used to place the window
     double m_scale = 0.0; // device pixels a point, for which m_margins hold
+    bool m_isRescaled = false; // and nobody has been told
     bool m_isPending = false; // asked, not yet granted
     WId m_followed = 0;
     std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it

@@ -33,6 +33,14 @@ protected:
             contents.push_back(desktop().windows().clientArea(window));
         return contents;
     }
+
+    /// For longer than the component waits for a window manager's answer.
+    void expectFrameStays(const QRect &frame)
+    {
+        constexpr std::chrono::milliseconds longerThanPatience { 500 };
+        EXPECT_FALSE(waitUntil([&] { return host().frame() != frame; }, longerThanPatience))
+            << testing::PrintToString(host().frame());
+    }
 };
 
 class CompositorLost : public FaultTest
@@ -69,12 +77,15 @@ TEST_P(WindowManagerRestart, leavesEverythingInItsPlace)
     expectPlacesKnown();
     const std::vector<QRect> placesBefore = places();
     const std::vector<QRect> contentsBefore = contents();
+    const QRect frameBefore = host().frame();
 
     desktop().endWindowManager();
+    expectFrameStays(frameBefore);
     expectInk();
     EXPECT_EQ(contents(), contentsBefore);
 
     desktop().startWindowManager();
+    expectFrameStays(frameBefore);
     EXPECT_TRUE(waitUntil([&] { return places() == placesBefore; }));
     expectInk();
     EXPECT_EQ(places(), placesBefore);

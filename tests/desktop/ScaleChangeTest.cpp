@@ -20,19 +20,21 @@ protected:
         desktop().splitInto({ coarse, fine });
     }
 
-    void dragBy(WindowId window, int distance)
+    void dragBy(int distance)
     {
-        const QRect frame = desktop().windows().outerFrame(window);
-        const QPoint title(frame.center().x(), frame.top() + 10);
+        const QRect wanted = frame().translated(distance, 0);
+        const QPoint title(frame().center().x(), frame().top() + 10);
         desktop().pointer().drag({ title, title + QPoint(distance, 0) });
-        EXPECT_TRUE(waitUntil([&] {
-            return desktop().windows().outerFrame(window) == frame.translated(distance, 0);
-        })) << testing::PrintToString(desktop().windows().outerFrame(window));
+        EXPECT_TRUE(waitUntil([&] { return frame() == wanted; }))
+            << testing::PrintToString(frame());
     }
 
-    /// Remembers how the tool bar looks with one pixel a point.
-    void learnToolBar()
+    [[nodiscard]] QRect frame() { return desktop().windows().outerFrame(m_window); }
+
+    /// Remembers the window, and how its tool bar looks with one pixel a point.
+    void learnWindows()
     {
+        m_window = window();
         m_bar = toolBarWindow();
         const WindowState bar = toolBar();
         m_size = bar.frame.size();
@@ -43,18 +45,23 @@ protected:
     /// It shows its last button where that is with `scale` pixels a point.
     void expectWholeToolBar(int scale)
     {
-        const auto frame = [this] { return desktop().windows().outerFrame(m_bar); };
-        EXPECT_TRUE(waitUntil([&] { return frame().size() == m_size * scale; }));
+        constexpr int inset = 20; // points
+        const auto bar = [this] { return desktop().windows().outerFrame(m_bar); };
+        EXPECT_TRUE(waitUntil([&] { return bar().size() == m_size * scale; }));
+        EXPECT_TRUE(waitUntil([&] { // a point or two are lost where it crosses over
+            return std::abs(bar().left() - frame().left() - inset * scale) <= 2 * scale;
+        })) << bar().left() - frame().left();
         const auto color
-            = [&] { return desktop().screen().pixel(frame().topLeft() + m_beforeEnd * scale); };
+            = [&] { return desktop().screen().pixel(bar().topLeft() + m_beforeEnd * scale); };
         EXPECT_TRUE(waitUntil([&] { return color().red() > 200 && color().green() < 120; }))
             << color().name().toStdString();
         // So does the program believe; its log may be later.
         EXPECT_TRUE(
-            waitUntil([&] { return host().window(QStringLiteral("toolPanel")).frame == frame(); }));
+            waitUntil([&] { return host().window(QStringLiteral("toolPanel")).frame == bar(); }));
     }
 
 private:
+    WindowId m_window = 0;
     WindowId m_bar = 0;
     QSize m_size;
     QPoint m_beforeEnd; // from the tool bar's corner
@@ -65,17 +72,19 @@ private:
 TEST_P(ScaleChange, leavesAWindowOfTheSamePixelsThatIsDrawnOnAndItsToolBarWhole)
 {
     startKind(std::get<const char *>(GetParam()), {}, { scales });
-    const WindowId moved = window();
-    learnToolBar();
+    learnWindows();
+    const QRect before = frame();
     expectInk();
 
-    dragBy(moved, fine.x());
+    dragBy(fine.x());
     expectWholeToolBar(2);
     expectInk();
+    EXPECT_EQ(frame(), before.translated(fine.x(), 0));
 
-    dragBy(moved, -fine.x());
+    dragBy(-fine.x());
     expectWholeToolBar(1);
     expectInk();
+    EXPECT_EQ(frame(), before);
     expectNothingSaid();
     expectEndByTool();
 }
@@ -85,18 +94,42 @@ INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, ScaleChange,
         testing::Values("whiteboard", "imageAnnotation")),
     managerAndKindName);
 
-class LayerOfAnotherScale : public FaultTest, public testing::WithParamInterface<WindowManager>
+class OpenedAtAnotherScale : public FaultTest, public testing::WithParamInterface<WindowManager>
 {
 protected:
-    LayerOfAnotherScale()
+    OpenedAtAnotherScale()
         : FaultTest(GetParam(), { 4800, 1800 })
-    { }
+    {
+        desktop().splitInto({ { 0, 0, 1600, 900 }, { 1600, 0, 3200, 1800 } });
+    }
+
+    void startOnFineScreen(const std::string &kind)
+    {
+        startKind(kind, { "--screen", "1" }, { "QT_SCREEN_SCALE_FACTORS=1;2" });
+    }
+
+    /// To two points, which are two pixels each: the title bar's borders are half a point.
+    void expectFrame(const QRect &wanted)
+    {
+        const WindowId board = desktop().windows().ofProcess(host().processId()).front();
+        const auto isNear = [](int one, int other) { return std::abs(one - other) <= 4; };
+        QRect seen;
+        EXPECT_TRUE(waitUntil([&] {
+            seen = desktop().windows().outerFrame(board);
+            return isNear(seen.left(), wanted.left()) && isNear(seen.top(), wanted.top())
+                && isNear(seen.width(), wanted.width()) && isNear(seen.height(), wanted.height());
+        })) << testing::PrintToString(seen);
+        // And stays so: longer than it takes to answer a user's pull at an edge.
+        EXPECT_FALSE(
+            waitUntil([&] { return desktop().windows().outerFrame(board) != seen; }, stays));
+    }
+
+    static constexpr std::chrono::milliseconds stays { 1000 };
 };
 
-TEST_P(LayerOfAnotherScale, coversItsScreenExactly)
+TEST_P(OpenedAtAnotherScale, aLayerCoversItsScreenExactly)
 {
-    desktop().splitInto({ { 0, 0, 1600, 900 }, { 1600, 0, 3200, 1800 } });
-    startKind("annotation", { "--screen", "1" }, { "QT_SCREEN_SCALE_FACTORS=1;2" });
+    startOnFineScreen("annotation");
 
     EXPECT_EQ(desktop().windows().outerFrame(window()), QRect(1600, 0, 3200, 1800));
     EXPECT_EQ(toolBar().frame.size(), QSize(104, 704));
@@ -104,7 +137,30 @@ TEST_P(LayerOfAnotherScale, coversItsScreenExactly)
     expectEndByTool();
 }
 
-INSTANTIATE_TEST_SUITE_P(Managers, LayerOfAnotherScale,
+TEST_P(OpenedAtAnotherScale, aBoardHasTwoThirdsOfItsScreen)
+{
+    startOnFineScreen("whiteboard");
+
+    expectFrame({ 2133, 300, 2134, 1200 });
+    EXPECT_EQ(toolBar().frame.size(), QSize(104, 704));
+}
+
+TEST_P(OpenedAtAnotherScale, anImageHasAPointForEachOfItsPixels)
+{
+    startOnFineScreen("imageAnnotation");
+
+    expectFrame({ 2133, 700, 1200, 800 });
+    EXPECT_EQ(toolBar().frame.size(), QSize(104, 704));
+}
+
+TEST_P(OpenedAtAnotherScale, aBoardStaysWhereItIsOnADesktopOfOneScale)
+{
+    start({}, HostProgram::AsShipped, { "QT_SCALE_FACTOR=2" });
+
+    expectFrame({ 267, 150, 1066, 600 });
+}
+
+INSTANTIATE_TEST_SUITE_P(Managers, OpenedAtAnotherScale,
     testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
 
 } // namespace penwick::desktop

@@ -32,6 +32,7 @@ public:
     explicit NativeDesktopX11(xcb_connection_t *connection)
         : m_connection(connection)
         , m_root(xcb_setup_roots_iterator(xcb_get_setup(connection)).data->root)
+        , m_managerCheck(atom("_NET_SUPPORTING_WM_CHECK"))
         , m_supported(atom("_NET_SUPPORTED"))
         , m_frameExtents(atom("_NET_FRAME_EXTENTS"))
         , m_requestFrameExtents(atom("_NET_REQUEST_FRAME_EXTENTS"))
@@ -42,6 +43,8 @@ public:
 
     std::optional<QMargins> frameMarginsBeforeShow(QWindow &window) override
     {
+        if (!isManaged())
+            return QMargins();
         if (!windowManagerSupports(m_requestFrameExtents))
             return std::nullopt;
         const auto id = static_cast<xcb_window_t>(window.winId());
@@ -108,6 +111,14 @@ private:
         return values;
     }
 
+    // What a window manager has written on the root may outlive it; its own window does not.
+    [[nodiscard]] bool isManaged() const
+    {
+        const auto announced = numbers(m_root, m_managerCheck, XCB_ATOM_WINDOW, 1);
+        return !announced.empty()
+            && numbers(announced.front(), m_managerCheck, XCB_ATOM_WINDOW, 1) == announced;
+    }
+
     [[nodiscard]] bool windowManagerSupports(xcb_atom_t feature) const
     {
         constexpr std::uint32_t moreThanAnyManagerHas = 1024;
@@ -133,6 +144,7 @@ private:
 
     xcb_connection_t *const m_connection;
     const xcb_window_t m_root;
+    const xcb_atom_t m_managerCheck;
     const xcb_atom_t m_supported;
     const xcb_atom_t m_frameExtents;
     const xcb_atom_t m_requestFrameExtents;

@@ -7,6 +7,8 @@
 //   let-go-at-end                  from now on lets go of the component inside the news of the end
 //   open KIND [WIDTHxHEIGHT]       opens another window instead, on an image of that size
 //   open-nowhere                   opens a window on no screen at all
+//   frame                          logs the frame that the component says its window has, as
+//                                  [x, y, width, height] in points, y up
 //   arrow                          gives the canvas the arrow for its pointer, behind its back
 #include "host/Host.h"
 #include "host/Session.h"
@@ -78,12 +80,21 @@ private:
         else if (order == QLatin1String("open-nowhere"))
             penwick::Penwick().createDrawingWindowController(
                 penwick::WindowType::whiteboard, nullptr);
+        else if (order == QLatin1String("frame"))
+            logFrame();
         else if (order == QLatin1String("arrow"))
             m_session.window()
                 ->findChild<QWidget *>(QStringLiteral("drawingView"))
                 ->setCursor(Qt::ArrowCursor);
         else
             qWarning("no such order: %s", qUtf8Printable(order));
+    }
+
+    void logFrame()
+    {
+        const penwick::platform::Rect frame = m_session.window()->frame();
+        std::printf("{\"event\":\"frame\",\"rect\":[%.0f,%.0f,%.0f,%.0f]}\n", frame.x, frame.y,
+            frame.width, frame.height);
     }
 
     void letGoAtEnd()

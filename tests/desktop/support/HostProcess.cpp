@@ -122,6 +122,8 @@ void HostProcess::takeEvent(const QJsonObject &event)
         m_notifications.push_back({ name, event.value(QLatin1String("object")) });
     } else if (kind == QLatin1String("called")) {
         ++m_callsDone;
+    } else if (kind == QLatin1String("frame")) {
+        m_frame = rectangleFrom(event.value(QLatin1String("rect")));
     } else if (kind == QLatin1String("window")) {
         WindowState state { event.value(QLatin1String("visible")).toBool(),
             rectangleFrom(event.value(QLatin1String("rect"))), {} };
@@ -142,6 +144,12 @@ void HostProcess::steer(const QString &order)
             return m_callsDone > before;
         },
         order);
+}
+
+QRect HostProcess::frame()
+{
+    steer(QStringLiteral("frame"));
+    return m_frame;
 }
 
 template <class Condition>

@@ -68,6 +68,10 @@ public:
     void selectTool(const QString &name) { steer(QStringLiteral("tool ") + name); }
     void selectToolOption(const QString &option) { steer(QStringLiteral("option ") + option); }
 
+    /// What the component says of its window's frame: points, y up from the primary screen's
+    /// bottom left corner. Needs the steered program.
+    [[nodiscard]] QRect frame();
+
     [[nodiscard]] const std::vector<PostedNotification> &notifications();
     /// The state of the window called `name` that was written last; an invisible one before that.
     [[nodiscard]] WindowState window(const QString &name);
@@ -88,6 +92,7 @@ private:
     QMap<QString, WindowState> m_windows;
     QStringList m_printedLines;
     int m_callsDone = 0;
+    QRect m_frame;
 };
 
 } // namespace penwick::desktop
