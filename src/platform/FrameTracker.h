@@ -89,10 +89,10 @@ private:
     bool m_isPending = false; // asked, not yet granted
     WId m_followed = 0;
     std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it
-    QTimer m_check;
-    QTimer m_patience;
+    QTimer m_check { this };
+    QTimer m_patience { this };
     int m_looksLeft = 0;
-    QTimer m_userMove; // runs while a move by the user may go on
+    QTimer m_userMove { this }; // runs while a move by the user may go on
     bool m_isByUser = false;
     bool m_isMended = false; // asked once more already
     bool m_isFrameLost = false; // the window manager has ended; m_margins are its frame's

@@ -30,7 +30,7 @@ private:
 
     Window &m_window;
     FrameTracker &m_tracker;
-    QTimer m_rest; // runs while the user may still be pulling
+    QTimer m_rest { this }; // runs while the user may still be pulling
 };
 
 } // namespace penwick::platform

@@ -8,6 +8,7 @@
 #include "textbox/TextBoxFont.h"
 #include "textbox/TextBoxGrowth.h"
 #include "textbox/TextComposition.h"
+#include "textbox/TextEditing.h"
 
 #include <penwick/platform/Window.h>
 
@@ -54,6 +55,7 @@ TnTextBox::TnTextBox(const Rect &frame, double fontSize, const QColor &fontColor
     , m_textFontColor(fontColor)
     , m_panGesture([this](const auto &gesture) { handleGesture(gesture); })
     , m_caret(*this)
+    , m_hiding(*this)
 {
     setFrame(frame);
     customizeTextBox();
@@ -182,7 +184,6 @@ void TnTextBox::showDeleteTextButton()
 
 void TnTextBox::mouseDown(const platform::MouseEvent &event)
 {
-    platform::Window *const ownWindow = window();
     if (event.clickCount == 1 && !isEditable()) {
         m_hasDashedBorder = false;
         addGestureRecognizer(m_panGesture);
@@ -196,7 +197,7 @@ void TnTextBox::mouseDown(const platform::MouseEvent &event)
         showDeleteTextButton();
         setNeedsDisplay();
     }
-    if (ownWindow)
+    if (platform::Window *const ownWindow = window())
         ownWindow->makeFirstResponder(this);
     ViewOf::mouseDown(event);
 }
@@ -236,24 +237,24 @@ void TnTextBox::mousePressEvent(QMouseEvent *event)
 {
     if (event->button() == Qt::MiddleButton && isEditable())
         QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
-    // Selected text would be dragged, in a loop of events of its own; the host may end the session.
-    if (event->button() == Qt::LeftButton && !event->modifiers().testFlag(Qt::ShiftModifier))
-        setTextCursor(cursorForPosition(event->position().toPoint()));
+    if (event->button() == Qt::LeftButton)
+        placeCaret(*this, *event);
     ViewOf::mousePressEvent(event);
 }
 
 void TnTextBox::mouseMoveEvent(QMouseEvent *event)
 {
-    if (event->buttons().testFlag(Qt::LeftButton) && isEditable())
+    if (event->buttons().testFlag(Qt::LeftButton) && isEditable()) {
+        commitCompositionIn(*this);
         QTextEdit::mouseMoveEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
+    }
     ViewOf::mouseMoveEvent(event);
 }
 
 void TnTextBox::mouseReleaseEvent(QMouseEvent *event)
 {
     if (event->button() == Qt::LeftButton || (event->button() == Qt::MiddleButton && isEditable()))
-        // NOLINTNEXTLINE(bugprone-parent-virtual-call): the editor alone
-        QTextEdit::mouseReleaseEvent(event);
+        QTextEdit::mouseReleaseEvent(event); // NOLINT(bugprone-parent-virtual-call): as above
     ViewOf::mouseReleaseEvent(event);
 }
 
@@ -334,11 +335,8 @@ bool TnTextBox::resignFirstResponder()
 {
     if (m_isTextBoxDeleted)
         return true;
-    commitCompositionIn(*this); // what is half composed is the user's, too
+    endEditIn(*this);
     setEditable(false);
-    QTextCursor cursor = textCursor();
-    cursor.clearSelection();
-    setTextCursor(cursor);
     showPlacedBorder();
     m_hasDashedBorder = false;
     addGestureRecognizer(m_panGesture);

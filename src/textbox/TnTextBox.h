@@ -7,6 +7,7 @@
 #include "platform/ViewOf.h"
 #include "platform/WeakReference.h"
 #include "textbox/DeleteTextBoxButton.h"
+#include "textbox/EditorHiding.h"
 #include "textbox/TextBoxDelegate.h"
 #include "textbox/TextCaret.h"
 
@@ -113,6 +114,7 @@ private:
     bool m_isTextBoxDeleted = false;
     platform::PanGestureRecognizer m_panGesture;
     TextCaret m_caret;
+    EditorHiding m_hiding;
     std::optional<platform::Cursor> m_pointer; // for the mode that m_pointerIsForText says
     bool m_pointerIsForText = false;
     bool m_isFitting = false;

@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: MIT
+#include "textbox/EditorHiding.h"
+
+#include "textbox/TextEditing.h"
+
+#include <QCoreApplication>
+#include <QDragLeaveEvent>
+#include <QTextEdit>
+
+#include <utility>
+
+namespace penwick {
+
+EditorHiding::EditorHiding(QTextEdit &editor)
+    : m_editor(editor)
+{
+    editor.viewport()->installEventFilter(this);
+}
+
+bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
+{
+    switch (event->type()) {
+    case QEvent::DragMove: // is sent to nobody but the drag's target
+        m_isDraggedOver = true;
+        break;
+    case QEvent::DragLeave:
+    case QEvent::Drop:
+        m_isDraggedOver = false;
+        break;
+    case QEvent::Hide:
+        closeMenuOf(m_editor);
+        if (std::exchange(m_isDraggedOver, false)) {
+            QDragLeaveEvent leave;
+            QCoreApplication::sendEvent(watched, &leave);
+        }
+        break;
+    default:
+        break;
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+} // namespace penwick

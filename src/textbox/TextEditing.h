@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+// What an editor does when it is pressed and when an edit ends, beyond the toolkit's own.
+#pragma once
+
+class QMouseEvent;
+class QTextEdit;
+
+namespace penwick {
+
+/// Ends an edit: what is half composed becomes text, nothing stays selected, the next edit cannot
+/// undo this one, and a menu that was opened for it closes, because what it offers is not possible
+/// any more.
+void endEditIn(QTextEdit &editor);
+
+/// Puts the caret where the pointer is pressed, before the editor hears of it: it would drag what
+/// is selected in a loop of events of its own, in which the host may end the session. What is half
+/// composed becomes text first, because the editor would count it as text that it is not yet.
+void placeCaret(QTextEdit &editor, const QMouseEvent &press);
+
+/// Closes the menu of `editor`, if it is open. A menu is a window of its own: left alone, it would
+/// stay on the screen when its editor goes.
+void closeMenuOf(const QTextEdit &editor);
+
+} // namespace penwick
