@@ -47,6 +47,13 @@ protected:
         ASSERT_EQ(line("responder"), "responder b1");
     }
 
+    void leaveABoxOpenWith(const std::string &letters)
+    {
+        leaveAnEmptyBoxOpen();
+        for (const char letter : letters)
+            m_board.key(std::string(1, letter));
+    }
+
     RealBoard m_board;
 };
 
@@ -143,6 +150,99 @@ TEST_F(DangerousSession, boardHiddenInTheMiddleOfAStrokeForgetsThePress)
     m_board.turn();
 
     EXPECT_EQ(line("redo"), "redo draw s1,");
+}
+
+TEST_F(DangerousSession, menuOfATextBoxGoesWhenItsBoardIsEndedHiddenMinimisedOrReplaced)
+{
+    for (const char *const how : { "end", "close", "hide", "minimise", "replace" }) {
+        m_board.open();
+        leaveABoxOpenWith("a");
+        m_board.openMenuByKey();
+        ASSERT_EQ(m_board.menu(), "b1") << how;
+
+        if (how == std::string("end"))
+            m_board.clickTool("state", false);
+        else if (how == std::string("close"))
+            m_board.close();
+        else if (how == std::string("hide"))
+            m_board.hide();
+        else if (how == std::string("minimise"))
+            m_board.minimise(true);
+        else
+            m_board.open();
+
+        EXPECT_EQ(m_board.menu(), "") << how;
+    }
+}
+
+TEST_F(DangerousSession, menuOfATextBoxGoesWhenItsEditingEndsOrItsBoxIsUndone)
+{
+    for (const char *const tool : { "text", "undo", "clear" }) {
+        m_board.open();
+        leaveABoxOpenWith("a");
+        m_board.openMenuByKey();
+        ASSERT_EQ(m_board.menu(), "b1") << tool;
+
+        m_board.clickTool(tool, false); // as accessibility does, past the menu
+
+        EXPECT_EQ(m_board.menu(), "") << tool;
+    }
+}
+
+TEST_F(DangerousSession, textDraggedOverABoxThatGoesIsNotToldOfTheNextDrag)
+{
+    leaveAnEmptyBoxOpen();
+    EXPECT_TRUE(m_board.dragOver(m_board.middleOf("b1"), "text"));
+
+    m_board.open(); // the host replaces the board under the drag
+
+    leaveAnEmptyBoxOpen();
+    EXPECT_FALSE(m_board.dragOver(m_board.middleOf("b1"), "")); // a picture, which it refuses
+    m_board.dragAway();
+}
+
+TEST_F(DangerousSession, pressIntoABoxKeepsWhatIsHalfComposedThere)
+{
+    leaveABoxOpenWith("a");
+    m_board.compose("kan");
+
+    m_board.press(m_board.middleOf("b1"));
+    m_board.release(m_board.middleOf("b1"));
+
+    EXPECT_EQ(m_board.textOf("b1"), "akan");
+    EXPECT_EQ(m_board.composedIn("b1"), "");
+    m_board.key("b");
+    EXPECT_EQ(m_board.textOf("b1"), "akanb"); // the press was behind the text
+}
+
+TEST_F(DangerousSession, dragInABoxKeepsWhatIsHalfComposedThere)
+{
+    leaveAnEmptyBoxOpen();
+    m_board.press(m_board.middleOf("b1"));
+    m_board.compose("kan");
+
+    m_board.move(elsewhere);
+    m_board.release(elsewhere);
+
+    EXPECT_EQ(m_board.textOf("b1"), "kan");
+}
+
+TEST_F(DangerousSession, undoInABoxThatIsEditedAgainKeepsWhatWasWrittenBefore)
+{
+    leaveABoxOpenWith("a");
+    m_board.key("Return");
+    m_board.press(m_board.middleOf("b1"));
+    m_board.release(m_board.middleOf("b1"));
+    m_board.pressAgain(m_board.middleOf("b1"));
+    m_board.release(m_board.middleOf("b1"));
+    m_board.key("End");
+    m_board.key("b");
+    ASSERT_EQ(m_board.textOf("b1"), "ab");
+
+    for (int time = 0; time < 3; ++time)
+        m_board.key("C-z");
+
+    EXPECT_EQ(m_board.textOf("b1"), "a");
 }
 
 TEST_F(DangerousSession, windowRestoredAfterTheHostOpenedAnotherIsDrawnOn)

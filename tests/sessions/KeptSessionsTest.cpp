@@ -23,7 +23,7 @@ class KeptSession : public testing::TestWithParam<Kept>
 
 TEST_P(KeptSession, goesAsTheSecondModelSays)
 {
-    const auto failure = runSession(GetParam().seed, GetParam().steps);
+    const auto failure = runSession(GetParam().seed, GetParam().steps, Kinds::Former);
 
     EXPECT_FALSE(failure) << *failure;
 }

@@ -155,6 +155,12 @@ void PlainBoard::showPopoverFor(const std::string &tool, const std::string &tool
         hidePopover();
 }
 
+void PlainBoard::pressPanel()
+{
+    hidePopover();
+    m_frames.pullPanelIn();
+}
+
 void PlainBoard::showPopover(const std::string &kind)
 {
     // Put into the window for the first time it comes up only where its panel is.
@@ -179,51 +185,6 @@ void PlainBoard::performOption(const std::string &option)
     orderPopoverOut();
 }
 
-// Keys
-
-void PlainBoard::key(const std::string &name)
-{
-    const std::string responder = m_canvas.responder();
-    if (m_canvas.allBoxes.count(responder))
-        boxKey(responder, name);
-    else
-        windowKey(name);
-}
-
-void PlainBoard::boxKey(const std::string &box, const std::string &name)
-{
-    const bool isEditable = m_canvas.allBoxes.at(box).isEditable;
-    if (name == "Return" || name == "Tab" || name == "Escape") {
-        m_canvas.endEditing();
-    } else if (name == "BackSpace") {
-        if (!isEditable)
-            windowKey(name);
-        m_canvas.backspace();
-    } else if (isEditable && name.size() == 1) {
-        m_canvas.type();
-    } else {
-        windowKey(name);
-    }
-}
-
-void PlainBoard::windowKey(const std::string &name)
-{
-    static const std::map<std::string, std::string> tools { { "b", "brush" }, { "t", "text" },
-        { "e", "eraser" }, { "c", "color" }, { "C-z", "undo" }, { "C-y", "redo" },
-        { "C-Delete", "clear" }, { "C-w", "state" } };
-    if (isPopoverVisible()) {
-        if (name == "Escape")
-            return hidePopover();
-        const std::size_t digit = name.size() == 1 ? static_cast<std::size_t>(name[0] - '1') : 99;
-        const auto &options = optionsOf(m_popover);
-        if (digit < options.size())
-            return choose(options[digit]);
-    }
-    const auto tool = tools.find(name);
-    if (tool != tools.end())
-        click(tool->second);
-}
-
 // The window
 
 void PlainBoard::turn()
@@ -231,6 +192,22 @@ void PlainBoard::turn()
     m_canvas.turn();
     if (m_isVisible && !m_isMinimised)
         m_canvas.paint();
+}
+
+// Steps of one move follow each other at once; only the first of them is a new move.
+void PlainBoard::moveTo(const PlainFrame &frame)
+{
+    if (!std::exchange(m_isMoving, true))
+        orderPopoverOut();
+    m_frames.moveTo(frame);
+}
+
+void PlainBoard::rest(const PlainFrame &frame)
+{
+    m_isMoving = false;
+    m_frames.keepShape();
+    const PlainFrame &kept = m_frames.board;
+    m_frames.moveTo({ frame.x, frame.y, kept.width, kept.height });
 }
 
 void PlainBoard::activate(bool isActive)
@@ -270,64 +247,6 @@ void PlainBoard::close()
         m_posted.emplace_back("end");
     if (m_isVisible)
         hide();
-}
-
-// What can be seen
-
-namespace {
-
-std::string joined(const std::vector<std::string> &words)
-{
-    std::string text;
-    for (const std::string &word : words)
-        text += " " + word;
-    return text;
-}
-
-std::string joined(const std::vector<PlainDrawing::Record> &records)
-{
-    std::string text;
-    for (const auto &[action, name] : records)
-        text += " " + action + " " + name + ",";
-    return text;
-}
-
-} // namespace
-
-std::string PlainBoard::inWords()
-{
-    std::string strokes;
-    for (const std::string &name : m_drawing.strokes())
-        strokes += " " + name + ":" + std::to_string(m_drawing.stroke(name).segments.size());
-    std::string views;
-    for (const std::string &view : m_canvas.views) {
-        const PlainBox &box = m_canvas.allBoxes.at("b" + view.substr(1));
-        views += " " + view;
-        if (view.front() == 'x') {
-            views += box.isButtonShown ? "" : "-";
-            continue;
-        }
-        views += box.isEditable ? ":edited:" : ":placed:";
-        views += std::to_string(box.letters) + "@" + std::to_string(static_cast<int>(box.x)) + ","
-            + std::to_string(static_cast<int>(box.top));
-    }
-    std::string buttons;
-    for (const std::string &name : toolNames())
-        buttons
-            += " " + name + (m_isSelected.at(name) ? "*" : "") + (m_isEnabled.at(name) ? "" : "-");
-    std::string text = "strokes" + strokes + "\nboxes" + joined(m_drawing.boxes())
-        + "\nshown strokes" + joined(m_canvas.strokes) + "\nshown boxes" + joined(m_canvas.boxes)
-        + "\nundo" + joined(m_drawing.undoStack()) + "\nredo" + joined(m_drawing.redoStack())
-        + "\ncount " + std::to_string(m_drawing.undoCount()) + "\nviews" + views + "\nresponder "
-        + m_canvas.responder() + "\ntool " + m_canvas.currentTool + " after " + m_canvas.lastTool
-        + "\ncolor " + m_canvas.color + " thickness " + m_canvas.thickness + " size "
-        + m_canvas.fontSize + "\nbuttons" + buttons + "\noptions " + m_chosen.at("text") + " "
-        + m_chosen.at("color") + " " + m_chosen.at("brush") + "\npopover "
-        + (isPopoverVisible() ? m_popover : "") + "\nwindows" + (m_isVisible ? " drawing" : "")
-        + (m_isPanelVisible ? " panel" : "") + (isBannerVisible() ? " banner" : "") + "\nposted"
-        + joined(m_posted) + "\n";
-    m_posted.clear();
-    return text;
 }
 
 } // namespace penwick::sessions

@@ -3,9 +3,12 @@
 #pragma once
 
 #include "sessions/PlainCanvas.h"
+#include "sessions/PlainFrames.h"
 
 #include <functional>
 #include <map>
+#include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -27,9 +30,34 @@ public:
 
     void click(const std::string &tool); ///< its button, by whatever means
     void choose(const std::string &option); ///< its button: kind#value
-    void pressPanel() { hidePopover(); } ///< its background
+    void pressPanel(); ///< its background
     /// By X-like names: letters, Return, BackSpace, 1 to 9, and C-z, C-y, C-Delete, C-w.
     void key(const std::string &name);
+
+    // The box that is being edited, by keys that are its editor's, an input method or a drop
+    void edit(const std::string &key);
+    void compose(const std::string &half);
+    void commit(const std::string &whole);
+    void dropOn(const std::string &target, const std::string &dropped);
+    void copyElsewhere(const std::string &text) { m_clipboard = text; }
+    /// What the step has left to the editor is taken over, where it may be that.
+    void adopt(const std::string &box, const std::string &now, const std::string &composed);
+    void adoptClipboard(const std::string &now);
+
+    // The menu of a box; it may stay open while other things happen
+    void openMenu(const std::string &box);
+    void closeMenu() { m_menu.clear(); }
+    void chooseFromMenu(const std::string &item); ///< by its action's name
+    [[nodiscard]] std::string menu(); ///< whose is open; empty if none is
+
+    // The user moves or pulls at the drawing window, and lets it rest
+    void moveTo(const PlainFrame &frame);
+    void resizeTo(const PlainFrame &frame) { m_frames.resizeTo(frame); }
+    /// It has come to rest, and the desktop has granted `frame` for the one that was asked for.
+    void rest(const PlainFrame &frame);
+    /// Where its windows came up.
+    void setFrames(const PlainFrames &frames) { m_frames = frames; }
+    [[nodiscard]] const PlainFrames &frames() const { return m_frames; }
 
     void activate(bool isActive);
     void minimise(bool isMinimised);
@@ -67,6 +95,7 @@ private:
     void orderPopoverOut() { m_isPopoverIn = false; }
     void boxKey(const std::string &box, const std::string &name);
     void windowKey(const std::string &name);
+    void editIn(const std::string &box, const std::string &key);
 
     PlainDrawing m_drawing;
     PlainCanvas m_canvas { m_drawing };
@@ -83,6 +112,15 @@ private:
     bool m_isKey = true;
     bool m_isClosed = false;
     bool m_isBannerShown = false;
+    PlainFrames m_frames;
+    bool m_isMoving = false;
+
+    std::string m_menu; // of this box
+    bool m_isMenuOfEditor = false; // it was being edited
+    std::string m_clipboard;
+    std::optional<std::string> m_copiedFrom; // a text; until it is known which part of it
+    std::string m_copied; // the box that it was
+    bool m_isCut = false;
 
     std::string m_held; // what the left button is held down on
     bool m_isReleasing = false;
@@ -92,5 +130,7 @@ private:
 /// The option buttons of a popover, in their order.
 [[nodiscard]] const std::vector<std::string> &optionsOf(const std::string &kind);
 [[nodiscard]] const std::vector<std::string> &toolNames();
+/// `text` with a stroke for every end of a line.
+[[nodiscard]] std::string inOneLine(std::string text);
 
 } // namespace penwick::sessions

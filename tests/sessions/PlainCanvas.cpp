@@ -77,11 +77,14 @@ void PlainCanvas::pressBox(const std::string &name, Spot spot, int clickCount)
     if (clickCount == 1 && !box.isEditable) {
         box.hasDashedBorder = false;
     } else if (clickCount == 2) {
+        if (!box.isEditable)
+            box.text.begin();
         box.isEditable = true;
         box.hasDashedBorder = true;
         showButton(name);
     }
     makeFirstResponder(name);
+    box.text.commit(); // a press is not for the input method
     m_canPan = !box.isEditable;
     m_isPanning = false;
     m_pressed = spot;
@@ -90,6 +93,7 @@ void PlainCanvas::pressBox(const std::string &name, Spot spot, int clickCount)
 
 void PlainCanvas::dragBox(const std::string &name, Spot spot)
 {
+    allBoxes.at(name).text.commit();
     if (!m_canPan)
         return;
     const Spot way { spot.x - m_pressed.x, spot.y - m_pressed.y };
@@ -117,22 +121,24 @@ std::string PlainCanvas::editedBox() const
     return found != allBoxes.end() && found->second.isEditable ? m_responder : std::string();
 }
 
-void PlainCanvas::type()
+void PlainCanvas::type(const std::string &letter)
 {
-    ++allBoxes.at(m_responder).letters;
+    allBoxes.at(m_responder).text.append(letter);
 }
 
 void PlainCanvas::backspace()
 {
-    const std::string name = m_responder;
-    const auto found = allBoxes.find(name);
-    if (found == allBoxes.end())
-        return;
-    PlainBox &box = found->second;
-    if (!box.isEditable)
+    if (!editedBox().empty())
+        allBoxes.at(m_responder).text.backspace();
+    else
+        releaseBackspace();
+}
+
+void PlainCanvas::releaseBackspace()
+{
+    const std::string name = m_responder; // which changes as it goes
+    if (allBoxes.count(name) && !allBoxes.at(name).isEditable)
         removeAndReport(name);
-    else if (box.letters > 0)
-        --box.letters;
 }
 
 // First responder
@@ -154,11 +160,12 @@ void PlainCanvas::resign(const std::string &name)
     PlainBox &box = allBoxes.at(name);
     if (box.isDeleted)
         return;
+    box.text.commit();
     box.isEditable = false;
     box.hasDashedBorder = false;
     box.isButtonShown = false;
     viewHidden("x" + name.substr(1));
-    if (box.letters == 0) {
+    if (box.text.isEmpty()) {
         box.isDeleted = true;
         leave(name);
         report(name);

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "sessions/PlainDrawing.h"
+#include "sessions/PlainText.h"
 
 #include <functional>
 #include <map>
@@ -19,7 +20,7 @@ struct PlainBox
     bool isDeleted = false;
     bool isOnCanvas = false;
     bool isButtonShown = false;
-    int letters = 0;
+    PlainText text;
     double x = 0.0;
     double top = 0.0;
 };
@@ -44,8 +45,9 @@ public:
     // Keys
     [[nodiscard]] std::string editedBox() const; ///< empty if none is being edited
     [[nodiscard]] std::string responder() const { return m_responder; }
-    void type(); ///< one letter into the edited box
-    void backspace(); ///< pressed and let go
+    void type(const std::string &letter); ///< at the end of the edited box
+    void backspace(); ///< pressed and let go, at the end of the text
+    void releaseBackspace(); ///< let go; the press was the editor's
     void endEditing() { makeFirstResponder("canvas"); }
 
     // What the tool bar asks for; "state" is not the canvas's

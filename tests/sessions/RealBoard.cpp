@@ -21,6 +21,7 @@
 #include <QTest>
 #include <QWindow>
 
+#include <cmath>
 #include <stdexcept>
 
 namespace penwick::sessions {
@@ -29,17 +30,6 @@ namespace {
 
 constexpr int longAfter = 1000; // ms, no double click
 constexpr int soonAfter = 100;
-
-/// While it lives, a window does not hear that it is, or is not any more, the active one.
-class Deaf final : public QObject
-{
-public:
-    explicit Deaf(QWidget &window) { window.installEventFilter(this); }
-    bool eventFilter(QObject *, QEvent *event) override
-    {
-        return event->type() == QEvent::ActivationChange;
-    }
-};
 
 QString text(const std::string &name)
 {
@@ -65,6 +55,7 @@ RealBoard::~RealBoard()
 void RealBoard::open(WindowType type)
 {
     m_held = {};
+    m_isDraggedOver = false;
     m_controller.reset();
     if (!m_penwick)
         m_penwick = std::make_unique<Penwick>();
@@ -74,13 +65,14 @@ void RealBoard::open(WindowType type)
         = m_penwick->createDrawingWindowController(type, QGuiApplication::primaryScreen(), image);
     m_controller->showWindow(nullptr);
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-    QCoreApplication::processEvents(); // windows come to the screen
+    hearDesktop(); // windows come to the screen
     QApplication::setActiveWindow(&window());
     paint();
     m_names.clear();
     m_deleteButtons.clear();
     m_strokes = 0;
     m_boxes = 0;
+    copyElsewhere("");
     m_recorder = std::make_unique<test::NotificationRecorder>();
 }
 
@@ -125,6 +117,11 @@ QPointF RealBoard::inWindow(Spot spot) const
     return { spot.x, window().height() - spot.y };
 }
 
+QPointF RealBoard::onDesktop(Spot spot) const
+{
+    return inWindow(spot) + window().windowHandle()->position();
+}
+
 Spot RealBoard::size() const
 {
     return { canvas().bounds().width, canvas().bounds().height };
@@ -149,7 +146,7 @@ Spot RealBoard::middleOf(const std::string &name) const
                 static_cast<double>(window().height() - seen.center().y()) };
         }
     }
-    return { size().x / 2, size().y / 2 };
+    return { std::floor(size().x / 2), std::floor(size().y / 2) };
 }
 
 void RealBoard::send(QWindow &target, QPointF place, Qt::MouseButton button, QEvent::Type type)
@@ -168,7 +165,16 @@ void RealBoard::sendTo(QWidget &widget, QPointF place, Qt::MouseButton button, Q
 void RealBoard::press(Spot spot, Qt::MouseButton button)
 {
     m_time += longAfter;
-    send(*window().windowHandle(), inWindow(spot), button, QEvent::MouseButtonPress);
+    const bool closesMenu = QApplication::activePopupWidget();
+    QWindow &target = *window().windowHandle();
+    const QPointF place = inWindow(spot);
+    send(target, place, button, QEvent::MouseButtonPress);
+    if (!closesMenu)
+        return;
+    // A press beside a menu closes it, and a desktop that can grab the pointer gives it once more.
+    QMouseEvent again(
+        QEvent::MouseButtonPress, place, onDesktop(spot), button, m_held, Qt::NoModifier);
+    QCoreApplication::sendEvent(&target, &again);
 }
 
 void RealBoard::pressAgain(Spot spot)
@@ -185,12 +191,6 @@ void RealBoard::move(Spot spot)
 void RealBoard::release(Spot spot, Qt::MouseButton button)
 {
     send(*window().windowHandle(), inWindow(spot), button, QEvent::MouseButtonRelease);
-}
-
-void RealBoard::closeMenu()
-{
-    while (QWidget *const menu = QApplication::activePopupWidget())
-        menu->close();
 }
 
 // The tool bar
@@ -242,77 +242,22 @@ void RealBoard::key(const std::string &name)
 {
     static const std::map<std::string, Qt::Key> named { { "Return", Qt::Key_Return },
         { "Tab", Qt::Key_Tab }, { "Escape", Qt::Key_Escape }, { "BackSpace", Qt::Key_Backspace },
-        { "C-Delete", Qt::Key_Delete }, { "C-End", Qt::Key_End } };
-    const bool withControl = name.starts_with("C-");
-    const auto found = named.find(name);
-    const char letter = name.back();
-    const auto key = found != named.end()
-        ? found->second
-        : static_cast<Qt::Key>(QChar::fromLatin1(letter).toUpper().unicode());
-    const Qt::KeyboardModifiers modifiers = withControl ? Qt::ControlModifier : Qt::NoModifier;
-    const QString typed = withControl || found != named.end() ? QString() : text(name);
+        { "Delete", Qt::Key_Delete }, { "Home", Qt::Key_Home }, { "End", Qt::Key_End },
+        { "Left", Qt::Key_Left }, { "Right", Qt::Key_Right }, { "Down", Qt::Key_Down } };
+    Qt::KeyboardModifiers modifiers;
+    std::string last = name;
+    for (; last.size() > 2 && last[1] == '-'; last.erase(0, 2))
+        modifiers |= last[0] == 'C' ? Qt::ControlModifier : Qt::ShiftModifier;
+    const auto found = named.find(last);
+    const bool isLetter = found == named.end();
+    const auto key = isLetter
+        ? static_cast<Qt::Key>(QChar::fromLatin1(last.front()).toUpper().unicode())
+        : found->second;
+    const QString typed
+        = isLetter && !modifiers.testFlag(Qt::ControlModifier) ? text(last) : QString();
     QWindow &target = *window().windowHandle();
     qt_handleKeyEvent(&target, QEvent::KeyPress, key, modifiers, typed);
     qt_handleKeyEvent(&target, QEvent::KeyRelease, key, modifiers, typed);
-}
-
-// The window
-
-void RealBoard::paint()
-{
-    // Twice: what came to the canvas while it was painted is painted next.
-    for (int pass = 0; pass < 2; ++pass) {
-        QEvent update(QEvent::UpdateRequest);
-        QCoreApplication::sendEvent(&window(), &update);
-    }
-}
-
-void RealBoard::activate(bool isActive)
-{
-    QApplication::setActiveWindow(isActive ? &window() : nullptr);
-}
-
-void RealBoard::minimise(bool isMinimised)
-{
-    window().setWindowState(isMinimised ? Qt::WindowMinimized : Qt::WindowNoState);
-    m_held = {};
-}
-
-void RealBoard::hide()
-{
-    window().hide();
-    m_held = {}; // what is let go over a window that is gone is not heard of
-}
-
-void RealBoard::show()
-{
-    {
-        const Deaf deaf(window()); // without a screen every window that is shown becomes active
-        m_controller->showWindow(nullptr);
-        QCoreApplication::processEvents();
-    }
-    QApplication::setActiveWindow(nullptr);
-    QApplication::setActiveWindow(&window());
-    turn();
-}
-
-void RealBoard::close()
-{
-    window().windowHandle()->close(); // as the title bar's button does
-}
-
-void RealBoard::showBanner(bool isShown)
-{
-    if (isShown)
-        m_penwick->showWindowSharingNotification();
-    else
-        m_controller->closeSharingNotificationWindow(); // what the timer does later
-}
-
-void RealBoard::turn()
-{
-    QCoreApplication::sendPostedEvents();
-    paint();
 }
 
 } // namespace penwick::sessions

@@ -3,12 +3,14 @@
 #pragma once
 
 #include "sessions/PlainDrawing.h"
+#include "sessions/PlainFrames.h"
 #include "support/NotificationRecorder.h"
 
 #include <penwick/Penwick.h>
 
 #include <QEvent>
 #include <QPointF>
+#include <QRect>
 
 #include <cstdint>
 #include <map>
@@ -25,6 +27,7 @@ namespace penwick {
 
 class DrawViewController;
 class DrawingCanvasView;
+class TnTextBox;
 class ToolPanelViewController;
 
 namespace platform {
@@ -52,6 +55,7 @@ public:
     /// What a pointer at `spot` points at: canvas, b1, x1.
     [[nodiscard]] std::string targetAt(Spot spot) const;
     [[nodiscard]] Spot size() const; ///< of the canvas
+    [[nodiscard]] QPointF onDesktop(Spot spot) const;
     /// The middle of what can be seen of a box or a delete button; the canvas's if nothing can.
     [[nodiscard]] Spot middleOf(const std::string &view) const;
 
@@ -60,14 +64,39 @@ public:
     void move(Spot spot);
     void release(Spot spot, Qt::MouseButton button = Qt::LeftButton);
     [[nodiscard]] Qt::MouseButtons held() const { return m_held; }
-    /// Closes the menu that the pointer opened, if it did.
-    static void closeMenu();
-
     void clickTool(const std::string &name, bool byPointer);
     void pressToolElsewhere(const std::string &name); ///< let go beside it
     void chooseOption(const std::string &name, bool byPointer);
     void pressPanel(); ///< its background
     void key(const std::string &name);
+
+    // What reaches a box otherwise than by the pointer
+    void compose(const std::string &half); ///< by an input method
+    void commit(const std::string &whole); ///< instead of what it composed
+    /// Another application's text (nothing: its picture) is dragged over a place, as long as it is
+    /// neither dropped nor taken back. Answers whether it could be dropped there.
+    bool dragOver(Spot spot, const std::string &text);
+    void drop(Spot spot, const std::string &text);
+    void dragAway();
+    static void copyElsewhere(const std::string &text); ///< in another application
+    [[nodiscard]] static std::string clipboard();
+
+    // The menu of a box, which a press with the right button opens too
+    void openMenuByKey();
+    [[nodiscard]] std::string menu() const; ///< whose is open; empty if none is
+    [[nodiscard]] static std::vector<std::string> menuItems(); ///< what can be chosen, by name
+    void chooseFromMenu(const std::string &item, bool byPointer);
+    /// Whether nothing, not even a menu, covers the board there.
+    [[nodiscard]] bool isBoardAt(Spot spot) const;
+
+    /// A box's text, and what is half composed in it; nothing if it is not on the canvas.
+    [[nodiscard]] std::string textOf(const std::string &box) const;
+    [[nodiscard]] std::string composedIn(const std::string &box) const;
+
+    [[nodiscard]] QRect outerFrame() const; ///< of the desktop's, y down
+    void moveTo(const QRect &outer); ///< by the user, or pulled to it
+    void rest(); ///< the user has let go of it
+    [[nodiscard]] PlainFrames frames() const;
 
     void activate(bool isActive);
     void minimise(bool isMinimised);
@@ -93,7 +122,9 @@ private:
     [[nodiscard]] std::string viewsInWords() const;
     [[nodiscard]] std::string panelInWords() const;
     [[nodiscard]] QPointF inWindow(Spot spot) const;
+    [[nodiscard]] const TnTextBox *boxCalled(const std::string &name) const;
     void paint();
+    void hearDesktop(); ///< the desktop's answers, and what is done about them at once
     void learnNames();
     void send(QWindow &window, QPointF place, Qt::MouseButton button, QEvent::Type type);
     void click(QAbstractButton &button, bool byPointer);
@@ -108,6 +139,7 @@ private:
     int m_boxes = 0;
     Qt::MouseButtons m_held;
     int m_time = 0; // ms
+    bool m_isDraggedOver = false;
 };
 
 } // namespace sessions

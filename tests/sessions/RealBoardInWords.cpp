@@ -75,8 +75,10 @@ std::string RealBoard::viewsInWords() const
     for (platform::View *const view : canvas().subviews()) {
         words += " " + nameOf(view);
         if (const auto *const box = dynamic_cast<TnTextBox *>(view)) {
+            const std::string composed = composedIn(nameOf(view));
             words += box->isEditable() ? ":edited:" : ":placed:";
-            words += std::to_string(box->toPlainText().size()) + "@"
+            words += inOneLine(textOf(nameOf(view)))
+                + (composed.empty() ? "" : "[" + inOneLine(composed) + "]") + "@"
                 + std::to_string(static_cast<int>(box->frame().x)) + ","
                 + std::to_string(static_cast<int>(box->frame().maxY()));
         } else {
@@ -164,6 +166,8 @@ std::string RealBoard::inWords(const std::string &posted) const
     words += window().isVisible() ? " drawing" : "";
     words += m_controller->tPanelWindowController()->window()->isVisible() ? " panel" : "";
     words += m_controller->sharingNotificationWindow()->isVisible() ? " banner" : "";
+    words += "\nframes" + frames().inWords() + "\nmenu " + menu() + "\nclipboard "
+        + inOneLine(clipboard());
     return words + "\nposted" + posted + "\n";
 }
 

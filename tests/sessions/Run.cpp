@@ -49,12 +49,12 @@ std::uint64_t freshSeed()
     return device() & 0x7fffffffU; // short enough to be copied by hand
 }
 
-std::optional<std::string> runSession(std::uint64_t seed, int steps)
+std::optional<std::string> runSession(std::uint64_t seed, int steps, Kinds kinds)
 {
     tellSeedWhenStopped();
     present = "\nstopped in this session: " + howToRepeat(seed, steps) + "\n";
     Session session;
-    auto shortest = stepsOf(seed, steps);
+    auto shortest = stepsOf(seed, steps, kinds);
     auto found = session.run(shortest.value());
     if (!found)
         return std::nullopt;

@@ -16,6 +16,7 @@ namespace penwick::sessions {
 /// Goes through the session of `seed`, of up to `steps` steps. Answers what differed from the
 /// second model in the shortest such session that was found, and how to repeat it; nothing if
 /// nothing did. A session that ends the process prints its seed before.
-[[nodiscard]] std::optional<std::string> runSession(std::uint64_t seed, int steps);
+[[nodiscard]] std::optional<std::string> runSession(
+    std::uint64_t seed, int steps, Kinds kinds = Kinds::All);
 
 } // namespace penwick::sessions

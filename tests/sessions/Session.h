@@ -27,8 +27,9 @@ private:
     void take(const Step &step);
     void takeWindowStep(const Step &step);
 
-    void press(Spot spot, bool isDouble);
+    void press(Spot spot, int clicks);
     void pressView(const Step &step);
+    void pressText(const Step &step);
     void goTo(Spot spot);
     void drag(Spot spot);
     void release(Spot spot);
@@ -39,20 +40,34 @@ private:
     void chooseOption(const Step &step);
     void write(const Step &step);
     void key(const Step &step);
+    void edit(const Step &step);
+    void copyElsewhere(const Step &step);
+    void compose(const Step &step);
+    void dragText(const Step &step);
+    void workMenu(const Step &step);
+    void moveWindow(const Step &step);
+    void resizeWindow(const Step &step);
+    void rest();
+    void hearPlace();
     void hideOrShow();
     void minimiseOrRestore();
 
     [[nodiscard]] Spot spotFor(const Step &step, int margin = 6) const;
     [[nodiscard]] bool canPoint() const;
     [[nodiscard]] bool isGrabLost() const;
+    [[nodiscard]] bool isMenuOpen() const { return !m_plain->menu().empty(); }
+    [[nodiscard]] bool canType() const; ///< into a box
+    [[nodiscard]] bool isComposing() const;
+    void adopt();
     [[nodiscard]] std::optional<std::string> difference();
     void say(const std::string &what) { m_said.push_back(what); }
 
     RealBoard m_real;
     std::unique_ptr<PlainBoard> m_plain;
     std::string m_grab; // where the buttons that are held down were pressed
-    Spot m_at; // the pointer
+    QPointF m_at; // the pointer, on the desktop
     bool m_isBannerShown = false;
+    bool m_hasTitleBar = false;
     std::vector<std::string> m_said;
 };
 

@@ -1,32 +1,19 @@
 // SPDX-License-Identifier: MIT
 // penwick-soak: random sessions of any number and length, by seed.
 #include "sessions/Run.h"
+#include "sessions/SmallScreen.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
 
 #include <cstdio>
 
-namespace {
-
-QtMessageHandler former = nullptr;
-
-// Without a screen there is no order of windows and no grab; that is said at every step.
-void withoutPlugin(QtMsgType type, const QMessageLogContext &context, const QString &message)
-{
-    if (!message.startsWith(QStringLiteral("This plugin does not support")))
-        former(type, context, message);
-}
-
-} // namespace
-
 int main(int argc, char **argv)
 {
     using penwick::sessions::freshSeed;
     using penwick::sessions::runSession;
 
-    qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" PENWICK_SMALL_SCREEN);
-    former = qInstallMessageHandler(withoutPlugin);
+    penwick::sessions::useSmallScreen();
     const QApplication application(argc, argv);
 
     QCommandLineParser parser;

@@ -37,7 +37,14 @@ struct Step
         PressPanel,
         Banner,
         Close,
-        OpenAnother
+        OpenAnother,
+        PressText, ///< once, twice or three times into what is being edited
+        Edit, ///< a key that is the editor's
+        Compose, ///< an input method goes on, commits or gives up
+        DragText, ///< from another application
+        Menu, ///< of a box: opened by its key, or chosen from
+        MoveWindow,
+        ResizeWindow
     };
 
     Kind kind = Kind::Press;
@@ -47,11 +54,19 @@ struct Step
 
 using Steps = std::vector<Step>;
 
+/// Of which kinds the steps of a session are.
+enum class Kinds
+{
+    All,
+    Former ///< those of the sessions that were kept before there were text steps and moved windows
+};
+
 std::ostream &operator<<(std::ostream &stream, const Step &step);
 
 /// Up to as many steps as the size is large.
-[[nodiscard]] rc::Gen<Steps> anySteps();
+[[nodiscard]] rc::Gen<Steps> anySteps(Kinds kinds = Kinds::All);
 /// The `count` steps that belong to `seed`, and what they can be made shorter to.
-[[nodiscard]] rc::Shrinkable<Steps> stepsOf(std::uint64_t seed, int count);
+[[nodiscard]] rc::Shrinkable<Steps> stepsOf(
+    std::uint64_t seed, int count, Kinds kinds = Kinds::All);
 
 } // namespace penwick::sessions

@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: MIT
+// Where the second model's windows stand.
+#pragma once
+
+#include <string>
+
+namespace penwick::sessions {
+
+/// The outer frame of a window, in points, y up.
+struct PlainFrame
+{
+    double x = 0.0; ///< left edge
+    double y = 0.0; ///< bottom edge
+    double width = 0.0;
+    double height = 0.0;
+
+    [[nodiscard]] double top() const { return y + height; }
+};
+
+/// The drawing window and its tool bar's panel.
+class PlainFrames
+{
+public:
+    PlainFrame board;
+    PlainFrame panel;
+
+    void moveTo(const PlainFrame &frame); ///< of the same size; the panel goes along
+    void resizeTo(const PlainFrame &frame);
+    void keepShape(); ///< 16:9, from the top left corner on
+    void pullPanelIn(); ///< into the drawing window
+
+    [[nodiscard]] std::string inWords() const;
+
+private:
+    void shiftPanel(double x, double y);
+};
+
+} // namespace penwick::sessions

@@ -1,0 +1,165 @@
+// SPDX-License-Identifier: MIT
+// The component's windows: shown, hidden, moved, and told what a desktop tells.
+#include "sessions/RealBoard.h"
+
+#include "platform/FrameTracker.h"
+#include "session/ToolPanelWindowController.h"
+#include "toolpanel/ToolPanelViewController.h"
+
+#include <QApplication>
+#include <QTimer>
+#include <QWindow>
+
+namespace penwick::sessions {
+
+namespace {
+
+constexpr int shortestRest = 200; // ms; shorter times look after a request, or are none
+constexpr int mostLooks = 8;
+
+/// While it lives, a window does not hear that it is, or is not any more, the active one.
+class Deaf final : public QObject
+{
+public:
+    explicit Deaf(QWidget &window) { window.installEventFilter(this); }
+    bool eventFilter(QObject *, QEvent *event) override
+    {
+        return event->type() == QEvent::ActivationChange;
+    }
+};
+
+/// What times a window's frame.
+QList<QTimer *> timersOf(const platform::Window &window)
+{
+    return window.findChild<platform::FrameTracker *>(QString(), Qt::FindDirectChildrenOnly)
+        ->findChildren<QTimer *>();
+}
+
+/// Lets what waits for `timer` happen now.
+void fire(QTimer &timer)
+{
+    QTimerEvent event(timer.timerId());
+    if (timer.isActive())
+        QCoreApplication::sendEvent(&timer, &event);
+}
+
+} // namespace
+
+void RealBoard::paint()
+{
+    // Twice: what came to the canvas while it was painted is painted next.
+    for (int pass = 0; pass < 2; ++pass) {
+        QEvent update(QEvent::UpdateRequest);
+        QCoreApplication::sendEvent(&window(), &update);
+    }
+}
+
+void RealBoard::activate(bool isActive)
+{
+    QApplication::setActiveWindow(isActive ? &window() : nullptr);
+}
+
+void RealBoard::minimise(bool isMinimised)
+{
+    window().setWindowState(isMinimised ? Qt::WindowMinimized : Qt::WindowNoState);
+    m_held = {};
+    if (isMinimised)
+        return;
+    hearDesktop(); // that it was minimised, too
+    turn();
+}
+
+void RealBoard::hide()
+{
+    window().hide();
+    m_held = {}; // what is let go over a window that is gone is not heard of
+}
+
+void RealBoard::show()
+{
+    {
+        const Deaf deaf(window()); // it becomes active as it is shown
+        m_controller->showWindow(nullptr);
+        hearDesktop();
+    }
+    QApplication::setActiveWindow(nullptr);
+    QApplication::setActiveWindow(&window());
+    turn();
+}
+
+void RealBoard::close()
+{
+    window().windowHandle()->close(); // as the title bar's button does
+}
+
+void RealBoard::showBanner(bool isShown)
+{
+    if (isShown)
+        m_penwick->showWindowSharingNotification();
+    else
+        m_controller->closeSharingNotificationWindow(); // what the timer does later
+}
+
+void RealBoard::turn()
+{
+    QCoreApplication::sendPostedEvents();
+    paint();
+}
+
+// What the user does to it on the desktop
+
+QRect RealBoard::outerFrame() const
+{
+    return window().windowHandle()->frameGeometry();
+}
+
+void RealBoard::moveTo(const QRect &outer)
+{
+    QWindow &native = *window().windowHandle();
+    native.setGeometry(outer.marginsRemoved(native.frameMargins()));
+    hearDesktop();
+    turn();
+}
+
+void RealBoard::rest()
+{
+    for (QTimer *const timer : timersOf(window())) {
+        if (timer->interval() >= shortestRest)
+            fire(*timer);
+    }
+    hearDesktop();
+    turn();
+}
+
+void RealBoard::hearDesktop()
+{
+    const std::vector<platform::Window *> family { &window(),
+        m_controller->tPanelWindowController()->window(), bar().popoverW() };
+    {
+        // Without a screen every window that came up since becomes the active one.
+        const bool isActive = window().isActiveWindow();
+        const Deaf deaf(window());
+        QCoreApplication::processEvents(QEventLoop::X11ExcludeTimers);
+        QApplication::setActiveWindow(isActive ? &window() : nullptr);
+    }
+    for (platform::Window *const each : family) {
+        for (QTimer *const timer : timersOf(*each)) {
+            // Until a request is granted, or what stands there is taken for the answer.
+            for (int look = 0; look < mostLooks && timer->interval() < shortestRest; ++look)
+                fire(*timer);
+        }
+    }
+}
+
+PlainFrames RealBoard::frames() const
+{
+    const auto plain = [](const platform::Rect &frame) {
+        return PlainFrame { frame.x, frame.y, frame.width, frame.height };
+    };
+    PlainFrames frames;
+    frames.board = plain(window().frame());
+    frames.panel = plain(m_controller->tPanelWindowController()->window()->frame());
+    return frames;
+}
+
+} // namespace penwick::sessions

@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#include "sessions/SmallScreen.h"
+
+#include <QString>
+
+namespace penwick::sessions {
+
+namespace {
+
+QtMessageHandler former = nullptr;
+
+// Without a screen there is no order of windows and no grab.
+void withoutPlugin(QtMsgType type, const QMessageLogContext &context, const QString &message)
+{
+    if (!message.startsWith(QStringLiteral("This plugin does not support")))
+        former(type, context, message);
+}
+
+} // namespace
+
+void useSmallScreen()
+{
+    qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" PENWICK_SMALL_SCREEN);
+    former = qInstallMessageHandler(withoutPlugin);
+}
+
+} // namespace penwick::sessions
