@@ -7,27 +7,51 @@
 #include <QInputMethodEvent>
 #include <QTextBlock>
 #include <QTextCursor>
+#include <QTextDocument>
 #include <QTextEdit>
 #include <QTextLayout>
 
 namespace penwick {
 
+namespace {
+
+void insertComposition(const QTextBlock &block)
+{
+    QTextLayout &layout = *block.layout();
+    QTextCursor there(block);
+    there.setPosition(block.position() + layout.preeditAreaPosition());
+    const QString left = layout.preeditAreaText();
+    layout.setPreeditArea(-1, {});
+    layout.clearFormats();
+    there.insertText(left);
+}
+
+} // namespace
+
+// In all of the text: the insertion point may have gone on, as when something is dropped elsewhere.
 QString compositionIn(const QTextEdit &editor)
 {
-    return editor.textCursor().block().layout()->preeditAreaText();
+    QString all;
+    for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next())
+        all += block.layout()->preeditAreaText();
+    return all;
 }
 
 void commitCompositionIn(QTextEdit &editor)
 {
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();
-    const QString left = compositionIn(editor);
-    if (left.isEmpty())
-        return;
     // By an input method that does not commit when it is told to.
-    QInputMethodEvent commit;
-    commit.setCommitString(left);
-    QCoreApplication::sendEvent(&editor, &commit);
+    const QString left = editor.textCursor().block().layout()->preeditAreaText();
+    if (!left.isEmpty()) {
+        QInputMethodEvent commit;
+        commit.setCommitString(left);
+        QCoreApplication::sendEvent(&editor, &commit);
+    }
+    for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next()) {
+        if (!block.layout()->preeditAreaText().isEmpty())
+            insertComposition(block);
+    }
 }
 
 } // namespace penwick

@@ -8,7 +8,7 @@ class QTextEdit;
 
 namespace penwick {
 
-/// The composition at the insertion point; empty where there is none.
+/// The composition in the text, wherever it stands; empty where there is none.
 [[nodiscard]] QString compositionIn(const QTextEdit &editor);
 
 /// Makes the composition part of the text. An editor that became read-only would drop it.

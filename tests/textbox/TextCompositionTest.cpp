@@ -75,6 +75,24 @@ TEST_F(TextCompositionTest, keepsABoxThatHasNothingElseFromBeingDeleted)
     EXPECT_FALSE(box->isEditable());
 }
 
+TEST_F(TextCompositionTest, inALineThatTheCaretHasLeftIsPartOfTheTextOnceTheBoxIsLeft)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+    QTextCursor caret = box->textCursor();
+    caret.insertText(QStringLiteral("two\nlines"));
+    box->setTextCursor(caret);
+    ASSERT_EQ(box->toPlainText(), QStringLiteral("two\nlines"));
+    ASSERT_EQ(compositionIn(*box), m_half);
+
+    leave();
+
+    QString text = box->toPlainText();
+    EXPECT_EQ(text.remove(m_half), QStringLiteral("two\nlines"));
+    EXPECT_EQ(box->toPlainText().size(), 13);
+    EXPECT_EQ(compositionIn(*box), QString());
+}
+
 TEST_F(TextCompositionTest, makesTheBoxGrow)
 {
     const auto box = newBox();
