@@ -116,7 +116,7 @@ private:
     bool m_isMoving = false;
 
     std::string m_menu; // of this box
-    bool m_isMenuOfEditor = false; // it was being edited
+    bool m_isMenuOfResponder = false; // it had the keys
     std::string m_clipboard;
     std::optional<std::string> m_copiedFrom; // a text; until it is known which part of it
     std::string m_copied; // the box that it was

@@ -119,17 +119,17 @@ void PlainBoard::dropOn(const std::string &target, const std::string &dropped)
 void PlainBoard::openMenu(const std::string &box)
 {
     m_menu = box;
-    m_isMenuOfEditor = m_canvas.allBoxes.at(box).isEditable;
+    m_isMenuOfResponder = m_canvas.responder() == box;
 }
 
-// A menu stays only while what it was opened for is there: its box, on the screen, in its mode.
+// A menu stays only while its box is there, on the screen, and has not given the keys up.
 std::string PlainBoard::menu()
 {
     if (m_menu.empty())
         return m_menu;
     const PlainBox &box = m_canvas.allBoxes.at(m_menu);
     const bool isShown = m_isVisible && !m_isMinimised && !m_isClosed && box.isOnCanvas;
-    if (!isShown || box.isEditable != m_isMenuOfEditor)
+    if (!isShown || (m_isMenuOfResponder && m_canvas.responder() != m_menu))
         m_menu.clear();
     return m_menu;
 }
