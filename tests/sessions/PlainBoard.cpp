@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "sessions/PlainBoard.h"
 
+#include <cmath>
 #include <utility>
 
 namespace penwick::sessions {
@@ -207,7 +208,9 @@ void PlainBoard::rest(const PlainFrame &frame)
     m_isMoving = false;
     m_frames.keepShape();
     const PlainFrame &kept = m_frames.board;
-    m_frames.moveTo({ frame.x, frame.y, kept.width, kept.height });
+    // A desktop may be out by the width of the border that it draws.
+    if (std::abs(frame.x - kept.x) <= 2 && std::abs(frame.y - kept.y) <= 2)
+        m_frames.moveTo({ frame.x, frame.y, kept.width, kept.height });
 }
 
 void PlainBoard::activate(bool isActive)

@@ -45,6 +45,7 @@ private:
     void compose(const Step &step);
     void dragText(const Step &step);
     void workMenu(const Step &step);
+    void hostGoesOn(const Step &step);
     void moveWindow(const Step &step);
     void resizeWindow(const Step &step);
     void rest();

@@ -125,11 +125,22 @@ void Session::dragText(const Step &step)
     }
 }
 
+// A menu is a loop of its own on some desktops; the host and its user's aids go on meanwhile.
+void Session::hostGoesOn(const Step &step)
+{
+    using Kind = Step::Kind;
+    static const std::vector<Kind> kinds { Kind::Close, Kind::HideOrShow, Kind::Minimise,
+        Kind::OpenAnother, Kind::Tool, Kind::Tool, Kind::Tool, Kind::Deactivate };
+    take({ kinds[static_cast<std::size_t>(step.a) % kinds.size()], step.a / 8, 0 });
+}
+
 // Opens the menu by its key, or chooses from the one that is open.
 void Session::workMenu(const Step &step)
 {
     if (!canPoint())
         return;
+    if (isMenuOpen() && step.b % 4 == 0)
+        return hostGoesOn(step);
     if (isMenuOpen()) {
         const std::vector<std::string> items = RealBoard::menuItems();
         if (items.empty())

@@ -85,13 +85,18 @@ void Session::pressView(const Step &step)
         release(m_real.middleOf(m_grab));
 }
 
-// Into what is being edited: so often that a word, or all of it, is selected.
+// Into what is being edited, so often that a word, or all of it, is selected; or twice into a box,
+// so that it is.
 void Session::pressText(const Step &step)
 {
-    const std::string box = m_plain->canvas().editedBox();
+    std::string box = m_plain->canvas().editedBox();
+    const bool isEdited = !box.empty();
+    const auto &boxes = m_plain->canvas().boxes;
+    if (!isEdited && !boxes.empty())
+        box = boxes[static_cast<std::size_t>(step.a) % boxes.size()];
     if (box.empty())
         return;
-    press(m_real.middleOf(box), 1 + step.a % 3);
+    press(m_real.middleOf(box), isEdited ? 1 + step.a % 3 : 2);
     if (step.b % 2 && m_real.held())
         release(m_real.middleOf(box));
 }
