@@ -18,6 +18,7 @@ COMPARISONS = {'<', '<=', '>', '>=', '==', '!='}
 BODIES = {CursorKind.IF_STMT, CursorKind.FOR_STMT, CursorKind.WHILE_STMT,
           CursorKind.CXX_FOR_RANGE_STMT}
 OPERATORS = {CursorKind.BINARY_OPERATOR, CursorKind.COMPOUND_ASSIGNMENT_OPERATOR}
+NAMES = {CursorKind.DECL_REF_EXPR, CursorKind.MEMBER_REF_EXPR}
 WRAPPERS = {CursorKind.UNEXPOSED_EXPR, CursorKind.PAREN_EXPR}
 
 
@@ -42,16 +43,23 @@ class Site:
 class SourceFile:
     def __init__(self, path, flags):
         self.path, self.flags = path, flags
-        # A constant can be changed only if it need not be known to the compiler. Of the same length,
-        # so that places stay what they are.
-        self.source = re.sub(rb'\bconstexpr (?=(?:int|double|float|std::uint32_t) \w+ = )',
-                             b'const     ', path.read_bytes())
+        self.source = self._with_changeable_constants(path.read_bytes())
         self.sites = {}
         unit = self._parse(self.source)
         errors = self._errors(unit)
         if errors:
             raise SystemExit(f'{path} cannot be parsed: {errors[0][1]}')
         self._visit(unit.cursor, None, None)
+
+    def _with_changeable_constants(self, source):
+        """A constant can be changed only if it need not be known to the compiler."""
+        constant = re.compile(rb'\bconstexpr (?=(?:int|double|float|std::uint32_t) \w+ = )')
+        for match in constant.finditer(source):
+            # Of the same length, so that places stay what they are.
+            changed = source[:match.start()] + b'const     ' + source[match.end():]
+            if not self._errors(self._parse(changed)):
+                source = changed
+        return source
 
     def mutants(self):
         return [mutant for site in self._in_order() for mutant in site.mutants]
@@ -119,7 +127,8 @@ class SourceFile:
         unsaved = [('/penwick_mutant/penwick_mutant.h', 'bool penwick_mutant(int);\n'),
                    (str(self.path), text.decode())]
         return Index.create().parse(
-            str(self.path), args=self.flags + ['-I/penwick_mutant', '-Wno-everything'],
+            str(self.path),
+            args=self.flags + ['-I/penwick_mutant', '-Wno-everything', '-ferror-limit=0'],
             unsaved_files=unsaved, options=TranslationUnit.PARSE_NONE)
 
     @staticmethod
@@ -145,8 +154,23 @@ class SourceFile:
             if cursor.kind == CursorKind.VAR_DECL and b'constexpr ' in self._text(cursor):
                 return
             self._look(cursor, children, parent, grandparent)
+            if self._is_constant_if(cursor):
+                children = children[1:]
+            children = [c for c in children if not self._is_template_argument(c, cursor)]
         for child in children:
             self._visit(child, cursor, parent)
+
+    def _is_constant_if(self, cursor):
+        return cursor.kind == CursorKind.IF_STMT and self._text(cursor).startswith(b'if constexpr')
+
+    @staticmethod
+    def _is_template_argument(child, parent):
+        """Behind a name that is used, or a part of the type before a name that is declared."""
+        if not child.kind.is_expression():
+            return False
+        if parent.kind in NAMES:
+            return child.location.offset > parent.location.offset
+        return parent.kind.is_declaration() and child.location.offset < parent.location.offset
 
     def _look(self, cursor, children, parent, grandparent):
         kind, text = cursor.kind, self._text(cursor)
@@ -162,7 +186,7 @@ class SourceFile:
             other = b'false' if text == b'true' else b'true'
             self._add(cursor, f'{text.decode()} -> {other.decode()}', other)
         elif kind in (CursorKind.IF_STMT, CursorKind.WHILE_STMT, CursorKind.CONDITIONAL_OPERATOR):
-            if children and children[0].kind.is_expression():
+            if children and children[0].kind.is_expression() and not self._is_constant_if(cursor):
                 self._negate(children[0])
         elif kind == CursorKind.RETURN_STMT and children:
             if children[0].type.spelling == 'bool':
