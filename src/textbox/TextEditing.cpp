@@ -3,6 +3,7 @@
 
 #include "textbox/TextComposition.h"
 
+#include <QKeyEvent>
 #include <QMenu>
 #include <QMouseEvent>
 #include <QTextCursor>
@@ -26,6 +27,16 @@ void placeCaret(QTextEdit &editor, const QMouseEvent &press)
     commitCompositionIn(editor);
     if (!press.modifiers().testFlag(Qt::ShiftModifier))
         editor.setTextCursor(editor.cursorForPosition(press.position().toPoint()));
+}
+
+bool redoIfAsked(QTextEdit &editor, QKeyEvent &press)
+{
+    // Where the desktop has other keys for it, the editor would leave these to the canvas.
+    if (editor.isReadOnly() || press.keyCombination() != (Qt::ControlModifier | Qt::Key_Y))
+        return false;
+    press.accept();
+    editor.redo();
+    return true;
 }
 
 void closeMenuOf(const QTextEdit &editor)

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
-// What an editor does when it is pressed and when an edit ends, beyond the toolkit's own.
+// What an editor does with presses and when an edit ends, beyond the toolkit's own.
 #pragma once
 
+class QKeyEvent;
 class QMouseEvent;
 class QTextEdit;
 
@@ -16,6 +17,10 @@ void endEditIn(QTextEdit &editor);
 /// is selected in a loop of events of its own, in which the host may end the session. What is half
 /// composed becomes text first, because the editor would count it as text that it is not yet.
 void placeCaret(QTextEdit &editor, const QMouseEvent &press);
+
+/// Redoes if `press` is Ctrl+Y and `editor` can be written in; whether it was. The press is
+/// accepted then.
+bool redoIfAsked(QTextEdit &editor, QKeyEvent &press);
 
 /// Closes the menu of `editor`, if it is open. A menu is a window of its own: left alone, it would
 /// stay on the screen when its editor goes.

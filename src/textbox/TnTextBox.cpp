@@ -277,7 +277,8 @@ void TnTextBox::keyPressEvent(QKeyEvent *event)
         return;
     }
     m_caret.restart();
-    ViewOf::keyPressEvent(event);
+    if (!redoIfAsked(*this, *event))
+        ViewOf::keyPressEvent(event);
 }
 
 void TnTextBox::keyUp(const platform::KeyEvent &event)

@@ -63,6 +63,19 @@ TEST_F(ToolBarWhileTyping, colourIsChosenAndTheBoxKeepsTheKeys)
     type("mm");
 }
 
+TEST_F(ToolBarWhileTyping, keysOfUndoAndRedoAreTheEditorsOwn)
+{
+    constexpr int caret = 4;
+    const int width = m_width;
+
+    desktop().keyboard().pressWith("Control_L", "z");
+    EXPECT_TRUE(waitUntil([&] { return inked().width() <= caret; }));
+    desktop().keyboard().pressWith("Control_L", "y");
+    EXPECT_TRUE(waitUntil([&] { return inked().width() >= width - caret; }));
+    desktop().keyboard().pressWith("Control_L", "z");
+    EXPECT_TRUE(waitUntil([&] { return inked().width() <= caret; }));
+}
+
 TEST_F(ToolBarWhileTyping, textToolTakesTheKeys)
 {
     press("text");
