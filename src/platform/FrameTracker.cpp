@@ -32,7 +32,8 @@ constexpr int newness = 2000; // ms
 FrameTracker::FrameTracker(QWidget &window)
     : QObject(&window)
     , m_window(window)
-    , m_frame(fromDesktop(window.geometry()))
+    , m_frame(window.geometry())
+    , m_origin(originInDesktop())
 {
     m_check.setSingleShot(true);
     m_check.setInterval(0);
@@ -43,6 +44,9 @@ FrameTracker::FrameTracker(QWidget &window)
     m_userMove.setInterval(longestRest);
     connect(&m_userMove, &QTimer::timeout, this, &FrameTracker::check);
     m_window.installEventFilter(this);
+    connect(
+        qGuiApp, &QGuiApplication::primaryScreenChanged, this, &FrameTracker::followPrimaryScreen);
+    followPrimaryScreen();
 }
 
 FrameTracker::~FrameTracker()
@@ -52,15 +56,16 @@ FrameTracker::~FrameTracker()
 
 Rect FrameTracker::frame() const
 {
-    return m_frame;
+    return fromDesktop(m_frame);
 }
 
 void FrameTracker::request(const Rect &frame)
 {
-    m_frame = frame;
+    m_frame = toDesktopExactly(frame);
+    m_askedBeforeFrame.reset();
     if (!m_window.isVisible()) {
         // Nobody has decorated it yet, so its content may be laid out as if nobody will.
-        m_window.resize(toDesktop(frame).size());
+        m_window.resize(rounded(m_frame).size());
         return;
     }
     applyRequest();
@@ -71,7 +76,7 @@ void FrameTracker::request(const Rect &frame)
 void FrameTracker::prepareToShow()
 {
     // Or it would measure in another screen's points until it is there.
-    if (QScreen *const screen = QGuiApplication::screenAt(toDesktop(m_frame).center()))
+    if (QScreen *const screen = QGuiApplication::screenAt(rounded(m_frame).center()))
         m_window.setScreen(screen);
     m_window.winId(); // the desktop can only be asked about a window that exists
     QWindow &native = *m_window.windowHandle();
@@ -86,16 +91,30 @@ void FrameTracker::prepareToShow()
     m_scale = native.devicePixelRatio();
     m_sinceFramed.start();
     applyRequest();
-    m_announced = toDesktop(m_frame);
+    m_announced = rounded(m_frame);
     awaitAnswer();
+}
+
+// What a frame is measured from moves with it.
+void FrameTracker::followPrimaryScreen()
+{
+    if (const QScreen *const primary = QGuiApplication::primaryScreen()) {
+        connect(primary, &QScreen::geometryChanged, &m_check, qOverload<>(&QTimer::start),
+            Qt::UniqueConnection);
+    }
+    if (m_window.isVisible())
+        m_check.start();
 }
 
 void FrameTracker::followFrame()
 {
     QWindow &native = *m_window.windowHandle();
-    m_followed = native.winId();
+    const WId former = std::exchange(m_followed, native.winId());
+    if (former != m_followed)
+        NativeDesktop::instance().forgetFrame(former);
     m_corner.reset();
     m_isFrameLost = false;
+    m_askedBeforeFrame.reset();
     connect(&native, &QWindow::screenChanged, &m_check, qOverload<>(&QTimer::start),
         Qt::UniqueConnection);
     NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
@@ -114,13 +133,18 @@ void FrameTracker::onFrameExchanged(bool hasFrame)
     if (!m_window.isVisible())
         return;
     m_isFrameLost = !hasFrame;
+    // The window manager was slow, and the toolkit believes in a place inside a frame in the
+    // making.
+    if (hasFrame && m_askedBeforeFrame)
+        m_frame = *m_askedBeforeFrame;
+    m_askedBeforeFrame.reset();
     m_sinceFramed.start();
     awaitAnswer();
 }
 
 void FrameTracker::applyRequest()
 {
-    m_window.setGeometry(toDesktop(m_frame).marginsRemoved(m_margins));
+    m_window.setGeometry(rounded(m_frame).marginsRemoved(m_margins));
 }
 
 bool FrameTracker::eventFilter(QObject *watched, QEvent *event)
@@ -178,8 +202,10 @@ void FrameTracker::check()
     if (!isWhereItBelongs(outer)) {
         if (m_isPending)
             return; // until the desktop answers or patience ends
-        m_frame = fromDesktop(outer);
-        m_isByUser = !m_isRescaled;
+        if (!m_corner && !m_askedBeforeFrame && isNew())
+            m_askedBeforeFrame = m_frame;
+        m_frame = outer;
+        m_isByUser = true;
     }
     const bool wasPending = std::exchange(m_isPending, false);
     m_patience.stop();
@@ -198,22 +224,27 @@ void FrameTracker::adoptScale()
     const double before = std::exchange(m_scale, scale);
     if (before == scale)
         return;
-    m_isRescaled = true;
     if (m_isFrameLost || isArranged())
         m_margins = m_margins * (before / scale);
     else if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
         m_margins = native.frameMargins();
-    if (m_isPending) {
+    // Without more patience: what is asked for may itself bring the window to the screen and back.
+    if (m_isPending)
         applyRequest();
-        awaitAnswer();
-    }
+    else
+        m_isRescaled = true;
     Q_EMIT rescaled();
+}
+
+bool FrameTracker::isNew() const
+{
+    return m_sinceFramed.isValid() && m_sinceFramed.elapsed() < newness;
 }
 
 // Borders of a pixel cannot be told in points where a point is more than that.
 bool FrameTracker::isWhereItBelongs(const QRect &outer) const
 {
-    const QRect frame = toDesktop(m_frame);
+    const QRect frame = rounded(m_frame);
     if (m_scale == 1.0)
         return outer == frame;
     const QMargins point(1, 1, 1, 1);
@@ -226,13 +257,12 @@ bool FrameTracker::isWhereItBelongs(const QRect &outer) const
 // user drags the window, the toolkit may well lag behind.
 void FrameTracker::mendToolkit()
 {
-    const bool isNew = m_sinceFramed.isValid() && m_sinceFramed.elapsed() < newness;
-    QRect believed = toDesktop(m_frame);
+    QRect believed = rounded(m_frame);
     believed.moveTopLeft(m_window.windowHandle()->frameGeometry().topLeft());
-    const bool isStale = m_corner && isNew && !m_isByUser && !m_userMove.isActive() && !isArranged()
-        && !isWhereItBelongs(believed);
+    const bool isStale = m_corner && isNew() && !m_isByUser && !m_userMove.isActive()
+        && !isArranged() && !isWhereItBelongs(believed);
     if (isStale && !std::exchange(m_isMended, true)) {
-        m_window.setGeometry(toDesktop(m_frame).marginsRemoved(m_margins).translated(1, 0));
+        m_window.setGeometry(rounded(m_frame).marginsRemoved(m_margins).translated(1, 0));
         applyRequest();
         awaitAnswer();
     } else if (!isStale) {
@@ -285,6 +315,7 @@ void FrameTracker::lookAgain()
 void FrameTracker::announceRescaled(QPoint delta, bool hasResized)
 {
     if (!delta.isNull()) {
+        announceUserMove();
         Q_EMIT shifted(delta);
         Q_EMIT moved();
     }
@@ -294,11 +325,13 @@ void FrameTracker::announceRescaled(QPoint delta, bool hasResized)
 
 void FrameTracker::announce()
 {
-    const QRect outer = toDesktop(m_frame);
+    const QRect outer = rounded(m_frame);
     const bool hasResized = outer.size() != m_announced.size();
     const QPoint delta = outer.topLeft() - m_announced.topLeft();
     m_announced = outer;
     const bool isByUser = std::exchange(m_isByUser, false);
+    const QPoint origin = originInDesktop();
+    const bool isMeasuredAnew = std::exchange(m_origin, origin) != origin;
     if (std::exchange(m_isRescaled, false))
         return announceRescaled(delta, hasResized);
     if (hasResized)
@@ -309,7 +342,7 @@ void FrameTracker::announce()
         announceUserMove();
     if (!hasResized && !delta.isNull())
         Q_EMIT shifted(delta);
-    if (!delta.isNull())
+    if (!delta.isNull() || isMeasuredAnew)
         Q_EMIT moved();
 }
 

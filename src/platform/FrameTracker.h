@@ -50,25 +50,28 @@ Q_SIGNALS:
     /// The user has begun to move the window. Sent before shifted(), once for each move however
     /// many steps it has.
     void moveBegan();
-    /// The window was moved by `delta` of Qt's desktop and kept its size. Sent before moved().
+    /// The window was moved by `delta` of Qt's desktop and kept its size, or has come to a screen
+    /// of another scale. Sent before moved().
     void shifted(QPoint delta);
     /// The same, because the user pulled at its edges. Sent after resized().
     void resizedByUser();
     /// The desktop has granted the frame that was asked for, or put a frame of its own around the
     /// window in the same place.
     void confirmed();
-    /// The window's top left corner is somewhere else.
+    /// The window's top left corner is somewhere else, on the desktop or from the primary screen.
     void moved();
     /// The window has come to a screen with another number of device pixels a point. Sent before
     /// all others, of which shifted() and moved() come before resized() then.
     void rescaled();
 
 private:
+    void followPrimaryScreen();
     void followFrame();
     void onFrameExchanged(bool hasFrame);
     void applyRequest();
     void adoptScale();
     [[nodiscard]] bool isArranged() const;
+    [[nodiscard]] bool isNew() const;
     void mendToolkit();
     void check();
     [[nodiscard]] bool isDecoratedAnew() const;
@@ -81,7 +84,8 @@ private:
     [[nodiscard]] bool isWhereItBelongs(const QRect &outer) const;
 
     QWidget &m_window;
-    Rect m_frame;
+    QRectF m_frame; // Qt's desktop, which another primary screen leaves as it is
+    QPoint m_origin; // of frame() in Qt's desktop, when moved() was last thought of
     QRect m_announced; // Qt's desktop; what the last signals told of
     QMargins m_margins; // of the desktop, as last used to place the window
     double m_scale = 0.0; // device pixels a point, for which m_margins hold
@@ -89,12 +93,14 @@ private:
     bool m_isPending = false; // asked, not yet granted
     WId m_followed = 0;
     std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it
+    // Children, so that they can be found below what they serve.
     QTimer m_check { this };
     QTimer m_patience { this };
     int m_looksLeft = 0;
     QTimer m_userMove { this }; // runs while a move by the user may go on
     bool m_isByUser = false;
     bool m_isMended = false; // asked once more already
+    std::optional<QRectF> m_askedBeforeFrame; // given up before the window manager had framed it
     bool m_isFrameLost = false; // the window manager has ended; m_margins are its frame's
     QElapsedTimer m_sinceFramed;
 };

@@ -12,9 +12,7 @@
 
 namespace penwick::platform {
 
-namespace {
-
-QPoint primaryBottomLeft()
+QPoint originInDesktop()
 {
     const QScreen *const primary
         = require(QGuiApplication::primaryScreen(), "there is no primary screen");
@@ -22,22 +20,28 @@ QPoint primaryBottomLeft()
     return { area.x(), area.y() + area.height() };
 }
 
-} // namespace
-
-Rect fromDesktop(const QRect &rect)
+Rect fromDesktop(const QRectF &rect)
 {
-    const QPoint origin = primaryBottomLeft();
-    return { static_cast<double>(rect.x() - origin.x()),
-        static_cast<double>(origin.y() - rect.y() - rect.height()),
-        static_cast<double>(rect.width()), static_cast<double>(rect.height()) };
+    const QPoint origin = originInDesktop();
+    return { rect.x() - origin.x(), origin.y() - rect.y() - rect.height(), rect.width(),
+        rect.height() };
+}
+
+QRectF toDesktopExactly(const Rect &rect)
+{
+    const QPoint origin = originInDesktop();
+    return { origin.x() + rect.x, origin.y() - rect.maxY(), rect.width, rect.height };
+}
+
+QRect rounded(const QRectF &rect)
+{
+    const auto whole = [](double value) { return static_cast<int>(std::lround(value)); };
+    return { whole(rect.x()), whole(rect.y()), whole(rect.width()), whole(rect.height()) };
 }
 
 QRect toDesktop(const Rect &rect)
 {
-    const QPoint origin = primaryBottomLeft();
-    const auto rounded = [](double value) { return static_cast<int>(std::lround(value)); };
-    return { rounded(origin.x() + rect.x), rounded(origin.y() - rect.maxY()), rounded(rect.width),
-        rounded(rect.height) };
+    return rounded(toDesktopExactly(rect));
 }
 
 Rect frameOfScreen(const QScreen &screen)

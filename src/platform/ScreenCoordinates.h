@@ -8,10 +8,18 @@
 
 namespace penwick::platform {
 
+/// The primary screen's bottom left corner in Qt's desktop. Another one when
+/// screens come and go.
+[[nodiscard]] QPoint originInDesktop();
+
 /// `rect` of Qt's desktop as a rectangle with y up.
-[[nodiscard]] Rect fromDesktop(const QRect &rect);
-/// The whole pixels of Qt's desktop nearest to `rect`. Place and size are rounded apart, so that
-/// a window that only moves keeps its size.
+[[nodiscard]] Rect fromDesktop(const QRectF &rect);
+/// The other way.
+[[nodiscard]] QRectF toDesktopExactly(const Rect &rect);
+/// The whole pixels nearest to `rect` of Qt's desktop. Place and size are rounded apart, so that a
+/// window that only moves keeps its size.
+[[nodiscard]] QRect rounded(const QRectF &rect);
+/// Both at once.
 [[nodiscard]] QRect toDesktop(const Rect &rect);
 
 } // namespace penwick::platform

@@ -43,7 +43,7 @@ public:
 
     std::optional<QMargins> frameMarginsBeforeShow(QWindow &window) override
     {
-        if (!isManaged())
+        if (hasManagerEnded())
             return QMargins();
         if (!windowManagerSupports(m_requestFrameExtents))
             return std::nullopt;
@@ -111,12 +111,13 @@ private:
         return values;
     }
 
-    // What a window manager has written on the root may outlive it; its own window does not.
-    [[nodiscard]] bool isManaged() const
+    // What a window manager has written on the root outlives it; its own window does not. Whoever
+    // has written nothing is not known.
+    [[nodiscard]] bool hasManagerEnded() const
     {
         const auto announced = numbers(m_root, m_managerCheck, XCB_ATOM_WINDOW, 1);
         return !announced.empty()
-            && numbers(announced.front(), m_managerCheck, XCB_ATOM_WINDOW, 1) == announced;
+            && numbers(announced.front(), m_managerCheck, XCB_ATOM_WINDOW, 1) != announced;
     }
 
     [[nodiscard]] bool windowManagerSupports(xcb_atom_t feature) const
