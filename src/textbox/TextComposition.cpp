@@ -11,6 +11,8 @@
 #include <QTextEdit>
 #include <QTextLayout>
 
+#include <algorithm>
+
 namespace penwick {
 
 namespace {
@@ -19,7 +21,9 @@ void insertComposition(const QTextBlock &block)
 {
     QTextLayout &layout = *block.layout();
     QTextCursor there(block);
-    there.setPosition(block.position() + layout.preeditAreaPosition());
+    // The line may have become shorter before it.
+    there.setPosition(
+        block.position() + std::min(layout.preeditAreaPosition(), block.length() - 1));
     const QString left = layout.preeditAreaText();
     layout.setPreeditArea(-1, {});
     layout.clearFormats();
@@ -39,6 +43,12 @@ QString compositionIn(const QTextEdit &editor)
 
 void commitCompositionIn(QTextEdit &editor)
 {
+    if (!compositionIn(editor).isEmpty()) {
+        // The toolkit would put the composition in the place of what is selected.
+        QTextCursor cursor = editor.textCursor();
+        cursor.clearSelection();
+        editor.setTextCursor(cursor);
+    }
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();
     // By an input method that does not commit when it is told to.

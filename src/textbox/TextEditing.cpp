@@ -22,10 +22,13 @@ void endEditIn(QTextEdit &editor)
     closeMenuOf(editor);
 }
 
-void placeCaret(QTextEdit &editor, const QMouseEvent &press)
+void prepareForPress(QTextEdit &editor, const QMouseEvent &press)
 {
+    if (press.button() == Qt::RightButton)
+        return;
     commitCompositionIn(editor);
-    if (!press.modifiers().testFlag(Qt::ShiftModifier))
+    // Shift alone makes the selection longer.
+    if (press.button() == Qt::LeftButton && press.modifiers() != Qt::ShiftModifier)
         editor.setTextCursor(editor.cursorForPosition(press.position().toPoint()));
 }
 

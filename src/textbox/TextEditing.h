@@ -13,10 +13,11 @@ namespace penwick {
 /// any more.
 void endEditIn(QTextEdit &editor);
 
-/// Puts the caret where the pointer is pressed, before the editor hears of it: it would drag what
-/// is selected in a loop of events of its own, in which the host may end the session. What is half
-/// composed becomes text first, because the editor would count it as text that it is not yet.
-void placeCaret(QTextEdit &editor, const QMouseEvent &press);
+/// Before the editor hears of a press that is no call for the menu: what is half composed becomes
+/// text, because the editor would count it as text that it is not yet; and the left button puts the
+/// caret where it is pressed, because the editor would drag what is selected in a loop of events of
+/// its own, in which the host may end the session.
+void prepareForPress(QTextEdit &editor, const QMouseEvent &press);
 
 /// Redoes if `press` is Ctrl+Y and `editor` can be written in; whether it was. The press is
 /// accepted then.

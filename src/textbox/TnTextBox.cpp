@@ -235,17 +235,17 @@ void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)
 // on, and on X11 the wheel's button pastes.
 void TnTextBox::mousePressEvent(QMouseEvent *event)
 {
+    prepareForPress(*this, *event);
     if (event->button() == Qt::MiddleButton && isEditable())
         QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
-    if (event->button() == Qt::LeftButton)
-        placeCaret(*this, *event);
     ViewOf::mousePressEvent(event);
 }
 
 void TnTextBox::mouseMoveEvent(QMouseEvent *event)
 {
     if (event->buttons().testFlag(Qt::LeftButton) && isEditable()) {
-        commitCompositionIn(*this);
+        if (!compositionIn(*this).isEmpty())
+            commitCompositionIn(*this);
         QTextEdit::mouseMoveEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
     }
     ViewOf::mouseMoveEvent(event);
