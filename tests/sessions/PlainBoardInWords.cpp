@@ -59,7 +59,7 @@ std::string PlainBoard::inWords()
     for (const std::string &name : toolNames())
         buttons
             += " " + name + (m_isSelected.at(name) ? "*" : "") + (m_isEnabled.at(name) ? "" : "-");
-    const std::string text = "strokes" + strokes + "\nboxes" + joined(m_drawing.boxes())
+    std::string text = "strokes" + strokes + "\nboxes" + joined(m_drawing.boxes())
         + "\nshown strokes" + joined(m_canvas.strokes) + "\nshown boxes" + joined(m_canvas.boxes)
         + "\nundo" + joined(m_drawing.undoStack()) + "\nredo" + joined(m_drawing.redoStack())
         + "\ncount " + std::to_string(m_drawing.undoCount()) + "\nviews" + views + "\nresponder "

@@ -39,7 +39,7 @@ std::optional<std::string> Session::run(const Steps &steps)
     for (const Step &step : steps) {
         take(step);
         adopt();
-        if (const auto found = difference())
+        if (auto found = difference())
             return found;
         if (m_plain->isClosed())
             open(step.b); // the host has been told, drops the window and makes another

@@ -20,7 +20,7 @@ void Session::key(const Step &step)
 {
     static const std::vector<std::string> names { "b", "t", "e", "c", "BackSpace", "BackSpace",
         "Return", "Tab", "Escape", "1", "2", "4", "9", "C-z", "C-z", "C-y", "C-Delete", "C-w" };
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     const bool isEditing = !m_plain->canvas().editedBox().empty();
     const bool isTyped = isEditing && (name.size() == 1 || name == "BackSpace");
     if (isTyped && isComposing())
@@ -63,7 +63,7 @@ void Session::edit(const Step &step)
         "C-S-Left", "BackSpace", "Delete", "C-BackSpace", "C-Delete", "S-Return", "u", "v", "w" };
     if (step.b % 16 == 0)
         return copyElsewhere(step);
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     if (!canType() || (isComposing() && step.b % 4)) // an input method lets few keys through
         return;
     const PlainText &text = m_plain->canvas().allBoxes.at(m_plain->canvas().editedBox()).text;
@@ -77,7 +77,7 @@ void Session::edit(const Step &step)
 void Session::copyElsewhere(const Step &step)
 {
     static const std::vector<std::string> texts { "", "p", "two\nlines", "of words" };
-    const std::string text = texts[static_cast<std::size_t>(step.a) % texts.size()];
+    const std::string &text = texts[static_cast<std::size_t>(step.a) % texts.size()];
     say("copy elsewhere");
     RealBoard::copyElsewhere(text);
     m_plain->copyElsewhere(text);
@@ -90,7 +90,7 @@ void Session::compose(const Step &step)
     if (!canType())
         return;
     if (!isComposing() || step.a % 3) {
-        const std::string half = halves[static_cast<std::size_t>(step.b) % halves.size()];
+        const std::string &half = halves[static_cast<std::size_t>(step.b) % halves.size()];
         say("compose " + half);
         m_real.compose(half);
         return m_plain->compose(half);
@@ -107,7 +107,7 @@ void Session::dragText(const Step &step)
     static const std::vector<std::string> texts { "d", "drop", "on\ntwo", "" };
     if (!canPoint() || isMenuOpen() || m_real.held())
         return;
-    const std::string text = texts[static_cast<std::size_t>(step.a) % texts.size()];
+    const std::string &text = texts[static_cast<std::size_t>(step.a) % texts.size()];
     const std::string box = m_plain->canvas().editedBox();
     const Spot spot = box.empty() || step.a % 5 == 0 ? spotFor(step) : m_real.middleOf(box);
     if (step.b % 3 == 0) {
@@ -145,7 +145,7 @@ void Session::workMenu(const Step &step)
         const std::vector<std::string> items = RealBoard::menuItems();
         if (items.empty())
             return;
-        const std::string item = items[static_cast<std::size_t>(step.a) % items.size()];
+        const std::string &item = items[static_cast<std::size_t>(step.a) % items.size()];
         say("choose " + item);
         m_real.chooseFromMenu(item, step.b % 2);
         return m_plain->chooseFromMenu(item);

@@ -23,8 +23,9 @@ Spot Session::spotFor(const Step &step, int margin) const
 {
     const Spot size = m_real.size();
     const auto at = [margin](int part, int parts, double length) {
-        return static_cast<double>(
-            margin + (part % parts) * static_cast<int>(length - 2 * margin) / (parts - 1));
+        const int free = static_cast<int>(length - 2 * margin);
+        const int place = margin + (part % parts) * free / (parts - 1);
+        return static_cast<double>(place);
     };
     return { at(step.a, columns, size.x), at(step.b, rows, size.y) };
 }

@@ -21,7 +21,7 @@ void Session::clickTool(const Step &step)
 {
     // The end is rare, so that there is something to end.
     const auto &names = toolNames();
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     if (name == "state" && step.b > 20)
         return;
     const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
@@ -111,6 +111,8 @@ void Session::moveWindow(const Step &step)
 // By its edges; at the left ones the right edge stays where it is.
 void Session::resizeWindow(const Step &step)
 {
+    if (m_grab.starts_with('x'))
+        return; // the button might come to lie where no pointer can let go of it
     const QRect before = m_real.outerFrame();
     const QSize size(320 + 16 * (step.a % 20), 180 + 4 * (step.b % 60));
     if (!m_hasTitleBar || size == before.size())
