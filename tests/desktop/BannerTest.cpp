@@ -61,7 +61,7 @@ TEST_P(Banner, isUpWithinAFifthOfASecondInTheMiddleAndGoneOneAndAHalfLater)
         ASSERT_TRUE(waitUntil([this] { return banner() != 0; }));
         const auto up = Clock::now();
         quickestUp = std::min(quickestUp, since(asked));
-        EXPECT_EQ(bannerOnScreen(), bannerFrame);
+        EXPECT_TRUE(waitUntil([&] { return bannerOnScreen() == bannerFrame; }, shownFor));
         ASSERT_TRUE(waitUntil([this] { return banner() == 0; }));
         shortest = std::min(shortest, since(up));
         longest = std::max(longest, since(asked));

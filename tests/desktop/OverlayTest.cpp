@@ -130,7 +130,7 @@ TEST_P(Overlay, withACompositingManagerWhatIsBelowShinesThroughAndAStrokeLiesOve
     desktop().startCompositor();
     OtherProgram other(desktop(), otherArea, orange);
     startOverlay();
-    ASSERT_EQ(otherThan(orange, otherArea), QRect());
+    ASSERT_TRUE(waitUntil([this] { return otherThan(orange, otherArea).isNull(); }));
 
     expectStrokeOver(orange);
 

@@ -25,7 +25,8 @@ protected:
     void expectToolBarBeside()
     {
         expectPlacesKnown();
-        EXPECT_TRUE(waitUntil([this] { return offsetOfToolBar() == m_offset; }));
+        EXPECT_TRUE(waitUntil([this] { return offsetOfToolBar() == m_offset; }))
+            << testing::PrintToString(places());
         expectPlacesKnown();
     }
     void learnPlaces()
