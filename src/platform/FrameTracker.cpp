@@ -200,15 +200,16 @@ void FrameTracker::check()
     }
     const QRect outer = outerGeometry();
     if (!isWhereItBelongs(outer)) {
-        if (m_isPending)
-            return; // until the desktop answers or patience ends
+        // Until the desktop answers or patience ends; and after an answer too, because where requests
+        // go back and forth it may be the answer to an older one, and those in between come later.
+        if (m_isPending || m_patience.isActive())
+            return;
         if (!m_corner && !m_askedBeforeFrame && isNew())
             m_askedBeforeFrame = m_frame;
         m_frame = outer;
         m_isByUser = true;
     }
     const bool wasPending = std::exchange(m_isPending, false);
-    m_patience.stop();
     mendToolkit();
     if (wasPending)
         Q_EMIT confirmed();
