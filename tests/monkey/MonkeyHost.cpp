@@ -51,7 +51,7 @@ void MonkeyHost::open()
 void MonkeyHost::awaitAnswer()
 {
     try {
-        m_process->writeLine("tool color"); // which changes nothing
+        m_process->writeLine("answer");
     } catch (const std::runtime_error &) {
         // It has just ended; see below.
     }

@@ -2,6 +2,7 @@
 // penwick-host that takes orders while it runs: lines on standard input, each answered by a line
 // once it has been carried out.
 //   tool NAME, option NAME#VALUE   chooses, as the tool bar would
+//   answer                         does nothing but be answered
 //   announce                       shows that the window is being shared
 //   close                          closes the window
 //   let-go-at-end                  from now on lets go of the component inside the news of the end
@@ -69,6 +70,8 @@ private:
             m_session.call({ Operation::ToolSelection, rest });
         else if (order == QLatin1String("option"))
             m_session.call({ Operation::ToolOptionSelection, rest });
+        else if (order == QLatin1String("answer"))
+            return;
         else if (order == QLatin1String("announce"))
             m_session.announce();
         else if (order == QLatin1String("close"))
