@@ -200,8 +200,9 @@ void FrameTracker::check()
     }
     const QRect outer = outerGeometry();
     if (!isWhereItBelongs(outer)) {
-        // Until the desktop answers or patience ends; and after an answer too, because where requests
-        // go back and forth it may be the answer to an older one, and those in between come later.
+        // Until the desktop answers or patience ends; and after an answer too, because where
+        // requests go back and forth it may be the answer to an older one, and those in between
+        // come later.
         if (m_isPending || m_patience.isActive())
             return;
         if (!m_corner && !m_askedBeforeFrame && isNew())

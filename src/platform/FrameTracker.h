@@ -93,7 +93,7 @@ private:
     bool m_isPending = false; // asked, not yet granted
     WId m_followed = 0;
     std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it
-    // Children, so that they can be found below what they serve.
+    // Children of this object: a test without a clock finds them there and fires them by hand.
     QTimer m_check { this };
     QTimer m_patience { this };
     int m_looksLeft = 0;

@@ -8,8 +8,8 @@
 
 namespace penwick::platform {
 
-/// The primary screen's bottom left corner in Qt's desktop. Another one when
-/// screens come and go.
+/// The primary screen's bottom left corner in Qt's desktop. Another one when screens
+/// come and go.
 [[nodiscard]] QPoint originInDesktop();
 
 /// `rect` of Qt's desktop as a rectangle with y up.

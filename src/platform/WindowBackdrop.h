@@ -15,8 +15,8 @@ class Window;
 class WindowBackdrop
 {
 public:
-    /// Makes ready for `window`, which has its frame and is about to be shown. Says each
-    /// time that it takes a picture that the desktop is one that cannot.
+    /// Makes ready for `window`, which has its frame and is about to be shown. Says each time that
+    /// it takes a picture that the desktop is one that cannot.
     void prepare(Window &window);
     /// Cuts off the corners of `window` again, which has come to a screen of another scale.
     static void rescale(Window &window);
