@@ -1,21 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include <penwick/platform/Window.h>
 
-#include <penwick/platform/WindowController.h>
-
-#include "platform/BackgroundDrag.h"
-#include "platform/FrameTracker.h"
-#include "platform/Glide.h"
 #include "platform/View.h"
-#include "platform/ViewController.h"
-#include "platform/WindowBackdrop.h"
-#include "platform/WindowFamily.h"
 #include "platform/WindowFlags.h"
-#include "platform/WindowShape.h"
+#include "platform/WindowPrivate.h"
 #include "platform/native/NativeDesktop.h"
 
-#include <QCloseEvent>
-#include <QPainter>
 #include <QWindow>
 
 #include <utility>
@@ -23,29 +13,6 @@
 namespace penwick::platform {
 
 WindowDelegate::~WindowDelegate() = default;
-
-class Window::Private
-{
-public:
-    explicit Private(Window &window)
-        : tracker(new FrameTracker(window))
-        , glide(new Glide(*tracker))
-        , shape(new WindowShape(window, *tracker))
-    { }
-
-    FrameTracker *const tracker; // a child of the window
-    Glide *const glide; // a child of the tracker
-    WindowShape *const shape; // a child of the tracker
-    WindowFamily family;
-    std::unique_ptr<ViewController> contentViewController;
-    QPointer<WindowController> windowController;
-    WindowBackdrop backdrop;
-    BackgroundDrag drag;
-    bool isClosed = false;
-    bool isMain = false;
-    bool isMinimised = false;
-    bool isContentBorrowed = false;
-};
 
 Window::Window(QWidget *parent)
     : QWidget(parent, Qt::Window)
@@ -319,81 +286,6 @@ void Window::setVisible(bool visible)
         return hideFamily();
     NativeDesktop::instance().applyAttributes(*windowHandle(), nativeWindowValues(m_attributes));
     showFamily();
-}
-
-void Window::changeEvent(QEvent *event)
-{
-    QWidget::changeEvent(event);
-    if (event->type() == QEvent::ActivationChange && std::exchange(d->isMain, isActiveWindow())
-        && !isActiveWindow())
-        tellDelegate(&WindowDelegate::windowDidResignMain);
-    // Not every desktop takes along what is on all its virtual desktops.
-    if (std::exchange(d->isMinimised, isMinimized()) != isMinimized() && isVisible())
-        isMinimized() ? hideFamily() : showFamily();
-}
-
-void Window::closeEvent(QCloseEvent *event)
-{
-    event->accept();
-    if (!std::exchange(d->isClosed, true))
-        tellDelegate(&WindowDelegate::windowWillClose);
-}
-
-// Whatever no view has taken
-
-void Window::keyPressEvent(QKeyEvent *event)
-{
-    if (d->windowController && d->windowController->keyDown(*event))
-        event->accept();
-    else
-        QWidget::keyPressEvent(event);
-}
-
-void Window::mousePressEvent(QMouseEvent *event)
-{
-    event->accept();
-    if (event->button() != Qt::LeftButton)
-        return;
-    d->drag.begin(*this, event->globalPosition().toPoint());
-    if (d->windowController)
-        d->windowController->mouseDown();
-}
-
-void Window::mouseMoveEvent(QMouseEvent *event)
-{
-    event->accept();
-    if (event->buttons().testFlag(Qt::LeftButton))
-        d->drag.goOn(*this, event->globalPosition().toPoint());
-}
-
-void Window::mouseReleaseEvent(QMouseEvent *event)
-{
-    event->accept();
-    if (event->button() != Qt::LeftButton)
-        return;
-    d->drag.end();
-    if (d->windowController)
-        d->windowController->mouseUp();
-}
-
-void Window::resizeEvent(QResizeEvent *event)
-{
-    QWidget::resizeEvent(event);
-    for (View *const view : topViews()) {
-        if (view == m_contentView)
-            setContentView(view);
-        else
-            view->place();
-    }
-}
-
-void Window::paintEvent(QPaintEvent *event)
-{
-    QPainter painter(this);
-    if (d->backdrop.paint(painter))
-        return;
-    painter.setCompositionMode(QPainter::CompositionMode_Source);
-    painter.fillRect(event->rect(), m_attributes.backgroundColor);
 }
 
 } // namespace penwick::platform
