@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: MIT
+// The desktop's own rule for a window that is shown: it stands inside its screen's work area.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+namespace penwick::platform {
+
+/// Which edge of a window stays in reach when the window is higher than the work area.
+enum class KeptEdge
+{
+    Top, ///< as for a window with a title bar
+    Bottom
+};
+
+/// `frame` moved by as little as brings it inside `area`; never resized. One that is wider than
+/// `area` keeps its left edge in it, one that is higher the edge that `edge` names.
+[[nodiscard]] Rect broughtInside(
+    const Rect &frame, const Rect &area, KeptEdge edge = KeptEdge::Top);
+
+/// The same, beside `free`, which is to stay uncovered: where `frame` cannot be on its own side of
+/// it, it stands on the other one at the same distance, or nearer where there is no room for that,
+/// or else above or below. Only where there is room on no side at all does it cover `free`.
+[[nodiscard]] Rect broughtInsideBeside(const Rect &frame, const Rect &area, const Rect &free);
+
+/// What the desktop leaves to windows of the screen that has most of `frame`, in points, y up, from
+/// the primary screen's bottom left corner. The primary screen's where none has any of it; the
+/// whole screen where the toolkit does not know. Another one when screens or the desktop's own
+/// bars come and go.
+[[nodiscard]] Rect workAreaFor(const Rect &frame);
+
+} // namespace penwick::platform
