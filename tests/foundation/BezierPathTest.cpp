@@ -166,6 +166,96 @@ TEST(BezierPath, closingLeadsTheGeneralPathBackToTheStartOfItsSubpath)
     expectElement(general, 3, QPainterPath::LineToElement, 1, 1);
 }
 
+TEST(BezierPath, generalPathOfAStrokeKeepsItsDotAndItsSixElements)
+{
+    BezierPath path;
+    path.moveToPoint({ 5, 5 });
+    path.lineToPoint({ 9, 5 });
+    path.moveToPoint({ 9, 5 });
+    path.lineToPoint({ 9, 5 }); // the pointer moved by less than a point
+    path.moveToPoint({ 9, 5 });
+    path.lineToPoint({ 9, 9 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), path.elementCount());
+    for (int index = 0; index < path.elementCount(); ++index) {
+        const BezierPath::Element element = path.elementAtIndex(index);
+        const bool isMove = element.kind == BezierPath::ElementKind::MoveTo;
+        expectElement(general, index,
+            isMove ? QPainterPath::MoveToElement : QPainterPath::LineToElement, element.points[0].x,
+            element.points[0].y);
+    }
+}
+
+TEST(BezierPath, generalPathKeepsLinesAndCurvesThatLeadNowhereOrHardlyAnywhere)
+{
+    const double hardly = 1000.0000000001; // which a comparison with a tolerance takes for the same
+    BezierPath path;
+    path.moveToPoint({ 0, 0 });
+    path.lineToPoint({ 0, 0 });
+    path.curveToPoint({ 0, 0 }, { 0, 0 }, { 0, 0 });
+    path.moveToPoint({ 1000, 1000 });
+    path.lineToPoint({ hardly, 1000 });
+    path.curveToPoint({ 1000, 1000 }, { 1000, hardly }, { hardly, 1000 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 10);
+    expectElement(general, 1, QPainterPath::LineToElement, 0, 0);
+    expectElement(general, 2, QPainterPath::CurveToElement, 0, 0);
+    expectElement(general, 4, QPainterPath::CurveToDataElement, 0, 0);
+    expectElement(general, 6, QPainterPath::LineToElement, hardly, 1000);
+    expectElement(general, 7, QPainterPath::CurveToElement, 1000, hardly);
+    expectElement(general, 8, QPainterPath::CurveToDataElement, hardly, 1000);
+    expectElement(general, 9, QPainterPath::CurveToDataElement, 1000, 1000);
+}
+
+TEST(BezierPath, ofMovesInARowTheGeneralPathHoldsTheLast)
+{
+    BezierPath path;
+    path.moveToPoint({ 1, 1 });
+    path.moveToPoint({ 2, 2 });
+    path.lineToPoint({ 3, 3 });
+    path.moveToPoint({ 4, 4 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 3);
+    expectElement(general, 0, QPainterPath::MoveToElement, 2, 2);
+    expectElement(general, 1, QPainterPath::LineToElement, 3, 3);
+    expectElement(general, 2, QPainterPath::MoveToElement, 4, 4);
+}
+
+TEST(BezierPath, closingIsNothingWhereTheSubpathIsBackAtItsStartAndALineAfterItBeginsThere)
+{
+    BezierPath path;
+    path.moveToPoint({ 1, 1 });
+    path.lineToPoint({ 5, 1 });
+    path.lineToPoint({ 1, 1 });
+    path.closePath();
+    path.lineToPoint({ 1, 1 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 5);
+    expectElement(general, 2, QPainterPath::LineToElement, 1, 1);
+    expectElement(general, 3, QPainterPath::MoveToElement, 1, 1);
+    expectElement(general, 4, QPainterPath::LineToElement, 1, 1);
+}
+
+TEST(BezierPath, lineOfAPathThatBeginsWithNoMoveBeginsAtTheOriginInTheGeneralPath)
+{
+    BezierPath path;
+    path.lineToPoint({ 0, 0 });
+
+    const QPainterPath general = path.CGPath();
+
+    ASSERT_EQ(general.elementCount(), 2);
+    expectElement(general, 0, QPainterPath::MoveToElement, 0, 0);
+    expectElement(general, 1, QPainterPath::LineToElement, 0, 0);
+}
+
 TEST(BezierPath, generalPathIsMadeAnewAndDoesNotFollowThePath)
 {
     BezierPath path;

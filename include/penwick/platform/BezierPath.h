@@ -86,8 +86,13 @@ public:
     /// Known without a walk over the path.
     [[nodiscard]] Rect controlPointBounds() const;
 
-    /// A new general path with the same elements in the same order and coordinates; empty for a
-    /// path without elements. Built at every call.
+    /// A new general path with the same moves, lines and curves in the same order and coordinates,
+    /// those that lead nowhere included; empty for a path without elements. Built at every call.
+    ///
+    /// What a QPainterPath has no element for: closing becomes a line back to where the sub-path
+    /// began, or nothing where it ends there already, and a line or curve right after it begins
+    /// with a move there. Of moves in a row only the last is kept. A path that begins with a line
+    /// or a curve begins with a move to the origin.
     [[nodiscard]] QPainterPath CGPath() const; // NOLINT(readability-identifier-naming): fixed name
 
 private:

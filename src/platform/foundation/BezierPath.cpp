@@ -24,6 +24,35 @@ std::size_t pointCount(BezierPath::ElementKind kind)
     return 0;
 }
 
+QPointF toQt(Point point)
+{
+    return { point.x, point.y };
+}
+
+// A QPainterPath leaves out a line or curve that leads nowhere, or hardly anywhere. One that leads
+// far away may be moved back afterwards, and stays.
+QPointF farFrom(QPointF point)
+{
+    return { point.x() > 0.0 ? -1.0 : 1.0, point.y() };
+}
+
+void moveEnd(QPainterPath &path, Point end)
+{
+    path.setElementPositionAt(path.elementCount() - 1, end.x, end.y);
+}
+
+void addLine(QPainterPath &path, Point end)
+{
+    path.lineTo(farFrom(path.currentPosition()));
+    moveEnd(path, end);
+}
+
+void addCurve(QPainterPath &path, const std::array<Point, 3> &points)
+{
+    path.cubicTo(toQt(points[0]), toQt(points[1]), farFrom(path.currentPosition()));
+    moveEnd(path, points[2]);
+}
+
 } // namespace
 
 BezierPath::BezierPath()
@@ -121,8 +150,6 @@ Rect BezierPath::controlPointBounds() const
 
 QPainterPath BezierPath::CGPath() const
 {
-    const auto toQt = [](Point point) { return QPointF(point.x, point.y); };
-
     QPainterPath path;
     for (int index = 0; index < elementCount(); ++index) {
         const Element element = elementAtIndex(index);
@@ -131,10 +158,10 @@ QPainterPath BezierPath::CGPath() const
             path.moveTo(toQt(element.points[0]));
             break;
         case ElementKind::LineTo:
-            path.lineTo(toQt(element.points[0]));
+            addLine(path, element.points[0]);
             break;
         case ElementKind::CurveTo:
-            path.cubicTo(toQt(element.points[0]), toQt(element.points[1]), toQt(element.points[2]));
+            addCurve(path, element.points);
             break;
         case ElementKind::ClosePath:
             path.closeSubpath();
