@@ -82,6 +82,16 @@ UndoRedoManager &DrawViewController::history() const
     return *require(model().undoRedoManager().get(), "the canvas model has no history");
 }
 
+platform::Window *DrawViewController::drawingWindow() const
+{
+    return m_drawingWindow;
+}
+
+void DrawViewController::setDrawingWindow(platform::Window *window)
+{
+    m_drawingWindow = window;
+}
+
 void DrawViewController::configureAnnotatingImageView(const QImage &image)
 {
     platform::ImageView &view
@@ -99,8 +109,9 @@ void DrawViewController::viewDidLoad()
     center.addObserver(this, drawingCanvasSubviewUpdateNotification(),
         [this](const auto &notification) { handlDrawingCanvasSubviewOperation(notification); });
 
+    const platform::Cursor cursor = getCursorOfType(QStringLiteral("Brush_Cursor"));
     canvas().setDrawingCanvasDelegate(this);
-    selectCursor(QStringLiteral("Brush_Cursor"));
+    setCursor(cursor);
 
     const auto model = std::make_shared<DrawingCanvasModel>();
     const auto history = std::make_shared<UndoRedoManager>();
@@ -237,12 +248,12 @@ void DrawViewController::handleToolSelection(const QString &selectedTool)
 void DrawViewController::selectDrawingTool(const QString &tool, const QString &cursor)
 {
     canvas().setLastSelecedTool(tool);
-    selectCursor(cursor);
+    setCursor(getCursorOfType(cursor));
 }
 
-void DrawViewController::selectCursor(const QString &name)
+void DrawViewController::setCursor(const platform::Cursor &cursor)
 {
-    canvas().setCursorType(getCursorOfType(name));
+    canvas().setCursorType(cursor);
     if (platform::Window *const window = canvas().window())
         window->invalidateCursorRects(canvas());
 }

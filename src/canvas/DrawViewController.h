@@ -17,6 +17,11 @@
 
 namespace penwick {
 
+namespace platform {
+class Cursor;
+class Window;
+} // namespace platform
+
 class UndoRedoManager;
 
 /// Joins canvas, model, history and tool bar of one drawing window.
@@ -39,6 +44,9 @@ public:
     [[nodiscard]] platform::ImageView *annotatedImageView() const { return m_annotatedImageView; }
     void setAnnotatedImageView(platform::ImageView *view) { m_annotatedImageView = view; }
     void setDrawingCanvasModel(std::shared_ptr<DrawingCanvasModel> model);
+    /// The drawing window, for whoever sets it: nothing here does, or asks. Weak.
+    [[nodiscard]] platform::Window *drawingWindow() const;
+    void setDrawingWindow(platform::Window *window);
 
     /// Shows `image` under the canvas.
     void configureAnnotatingImageView(const QImage &image);
@@ -71,13 +79,14 @@ private:
     [[nodiscard]] DrawingCanvasModel &model() const;
     [[nodiscard]] UndoRedoManager &history() const;
     void selectDrawingTool(const QString &tool, const QString &cursor);
-    void selectCursor(const QString &name);
+    void setCursor(const platform::Cursor &cursor);
     void clearIfThereIsAnything();
     void removeSubviews(const SubviewOperation &operation);
 
     QPointer<DrawingCanvasView> m_drawingView;
     QPointer<platform::ImageView> m_annotatedImageView;
     std::shared_ptr<DrawingCanvasModel> m_drawingCanvasModel;
+    QPointer<platform::Window> m_drawingWindow;
 };
 
 } // namespace penwick

@@ -102,12 +102,21 @@ void DrawingCanvasView::beginStroke()
     model().createPathWithParam(color, m_brushThickness, m_startPoint);
 }
 
+// The pointer in the top row of pixels is said to be at the top edge, which is no part of a
+// rectangle.
+bool DrawingCanvasView::isOver(Point point) const
+{
+    const platform::Rect area = bounds();
+    return area.contains(point)
+        || (point.y == area.maxY() && point.x >= area.x && point.x < area.maxX());
+}
+
 void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
 {
     if (window())
         window()->makeFirstResponder(this);
     const Point point = convertFrom(event.locationInWindow, this);
-    if (bounds().contains(point) && !(platform::Cursor::currentCursor() == m_cursorType))
+    if (isOver(point) && !(platform::Cursor::currentCursor() == m_cursorType))
         m_cursorType.set(*this);
     if (m_currentSelectedTool == Tools::brush) {
         m_lastPoint = point;
@@ -131,7 +140,7 @@ void DrawingCanvasView::eraseAt(Point point)
 void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
 {
     const Point point = convertTo(event.locationInWindow, nullptr);
-    if (!bounds().contains(point) && platform::Cursor::currentCursor() == m_cursorType)
+    if (!isOver(point) && platform::Cursor::currentCursor() == m_cursorType)
         platform::Cursor::arrow().set(*this);
     if (m_currentSelectedTool == Tools::brush) {
         endStroke(point);

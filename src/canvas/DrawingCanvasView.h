@@ -28,9 +28,15 @@ public:
     explicit DrawingCanvasView(const platform::Rect &frame);
     ~DrawingCanvasView() override;
 
+    /// Where the pointer of the brush was last.
     [[nodiscard]] platform::Point lastPoint() const { return m_lastPoint; }
+    void setLastPoint(platform::Point point) { m_lastPoint = point; }
+    /// Where the brush was pressed, then where it was dragged to last.
     [[nodiscard]] platform::Point startPoint() const { return m_startPoint; }
+    void setStartPoint(platform::Point point) { m_startPoint = point; }
+    /// Whether the brush was dragged since it was let go last.
     [[nodiscard]] bool isDragged() const { return m_isDragged; }
+    void setIsDragged(bool isDragged) { m_isDragged = isDragged; }
 
     [[nodiscard]] double brushThickness() const { return m_brushThickness; } ///< points
     void setBrushThickness(double thickness) { m_brushThickness = thickness; }
@@ -56,6 +62,13 @@ public:
     [[nodiscard]] const platform::Cursor &cursorType() const { return m_cursorType; }
     void setCursorType(const platform::Cursor &cursor) { m_cursorType = cursor; }
 
+    /// A view that is kept for whoever sets it; the canvas neither shows nor asks it.
+    [[nodiscard]] const std::shared_ptr<platform::View> &textBoxView() const
+    {
+        return m_textBoxView;
+    }
+    void setTextBoxView(std::shared_ptr<platform::View> view) { m_textBoxView = std::move(view); }
+
     /// Tells that nothing lies between the canvas and its window, so that it may paint the window's
     /// background itself, together with the strokes.
     void setCoversWindow(bool covers);
@@ -75,6 +88,7 @@ public:
 private:
     void beginStroke();
     void endStroke(platform::Point point);
+    [[nodiscard]] bool isOver(platform::Point point) const;
     void eraseAt(platform::Point point);
     void placeTextBox(platform::Point point);
     [[nodiscard]] DrawingCanvasDelegate &controller() const;
@@ -96,6 +110,7 @@ private:
     QString m_currentSelectedTool;
     QString m_lastSelecedTool;
     platform::Cursor m_cursorType = platform::Cursor::arrow();
+    std::shared_ptr<platform::View> m_textBoxView;
     QPointer<platform::Window> m_popoverWindow;
     platform::WeakReference<DrawingCanvasDelegate> m_drawingCanvasDelegate;
     bool m_coversWindow = false;

@@ -61,7 +61,12 @@ INSTANTIATE_TEST_SUITE_P(DrawViewController, NeedsACanvas,
             [](DrawViewController &controller) {
                 controller.handleToolOptionSelection(QStringLiteral("brush#7"));
             } },
-        Operation { "load", [](DrawViewController &controller) { controller.viewDidLoad(); } },
+        Operation { "load",
+            [](DrawViewController &controller) {
+                setPenwickBundle(
+                    std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
+                controller.viewDidLoad();
+            } },
         Operation { "updateElements",
             [](DrawViewController &controller) { controller.updateDrawingCanvasElements(); } },
         Operation { "updateForDisplay",
@@ -139,6 +144,18 @@ TEST_F(DrawViewControllerDeathTest, drawingWithoutAStrokeIsFatal)
         "penwick: fatal error: the canvas has no stroke to show\n");
 }
 
+TEST_F(DrawViewControllerDeathTest, drawingOnAStrokeWithoutAStartPointIsFatal)
+{
+    stroke({ { 10, 10 }, { 20, 20 } });
+    StrokeEntry entry = model().pathArray().last();
+    entry.bPathParams.startPoint.reset();
+    history().pushUndo({ entry, ActionType::erase, entry.pathId });
+    history().undoAction(); // now it is the newest
+
+    EXPECT_DEATH(controller->didBeginDrawing({ 1, 1 }),
+        "penwick: fatal error: there is no stroke to extend\n");
+}
+
 TEST_F(DrawViewControllerDeathTest, showingATextBoxThatIsNotThereIsFatal)
 {
     EXPECT_DEATH(controller->createTextBoxOnCanvas({ 1, 1 }),
@@ -153,6 +170,15 @@ TEST_F(DrawViewControllerDeathTest, loadWithoutTheBundleIsFatal)
     setPenwickBundle(nullptr);
 
     EXPECT_DEATH(other.viewDidLoad(), "penwick: fatal error: the resource bundle is not set\n");
+}
+
+TEST_F(DrawViewControllerDeathTest, loadTakesTheCursorBeforeItAsksForTheCanvas)
+{
+    DrawViewController withoutACanvas;
+    setPenwickBundle(nullptr);
+
+    EXPECT_DEATH(
+        withoutACanvas.viewDidLoad(), "penwick: fatal error: the resource bundle is not set\n");
 }
 
 TEST_F(DrawViewControllerDeathTest, toolWhoseCursorIsMissingIsFatal)

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Tools, as they reach a canvas, and what is copied and painted for them.
+#include "canvas/AddedObservers.h"
 #include "canvas/CanvasFixture.h"
 
 #include "history/NotificationNames.h"
@@ -40,6 +41,20 @@ TEST_F(DrawViewControllerTest, loadedControllerHasAnEmptyModelWithItsHistoryAndT
     EXPECT_EQ(recorder.take(), Posts());
 }
 
+TEST_F(DrawViewControllerTest, redrawingIsObservedBeforeSubviewOperationsAre)
+{
+    DrawingCanvasView alone(Rect { 0, 0, 100, 100 });
+    const auto other = std::make_unique<DrawViewController>();
+    other->setDrawingView(&alone);
+    const qsizetype before = namesObservedBy(other.get()).size(); // by one that had its place
+
+    other->setView(alone);
+
+    EXPECT_EQ(namesObservedBy(other.get()).mid(before),
+        (QStringList {
+            drawingViewUpdatedNotification(), drawingCanvasSubviewUpdateNotification() }));
+}
+
 TEST_F(DrawViewControllerTest, outletsAreWeak)
 {
     auto other = std::make_unique<DrawingCanvasView>();
@@ -50,6 +65,18 @@ TEST_F(DrawViewControllerTest, outletsAreWeak)
     other.reset();
 
     EXPECT_EQ(alone.drawingView(), nullptr);
+}
+
+TEST_F(DrawViewControllerTest, drawingWindowIsKeptForWhoeverSetsItAndNoLongerThanItLives)
+{
+    auto other = std::make_unique<platform::Window>();
+    EXPECT_EQ(controller->drawingWindow(), nullptr);
+
+    controller->setDrawingWindow(other.get());
+    EXPECT_EQ(controller->drawingWindow(), other.get());
+
+    other.reset();
+    EXPECT_EQ(controller->drawingWindow(), nullptr);
 }
 
 TEST_F(DrawViewControllerTest, canvasOutsideAWindowIsLoadedToo)

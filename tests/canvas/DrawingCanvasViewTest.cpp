@@ -1,13 +1,9 @@
 // SPDX-License-Identifier: MIT
-// What a canvas starts with, and the brush, popover and cursor under the pointer.
+// What a canvas starts with, and the brush and the popover under the pointer.
 #include "canvas/CanvasFixture.h"
-
-#include "appearance/ToolCursors.h"
 
 namespace penwick::test {
 namespace {
-
-using platform::Cursor;
 
 const QString eraser = QStringLiteral("eraser");
 
@@ -31,11 +27,28 @@ TEST_F(DrawingCanvasViewTest, newCanvasHasABlackBrushOfFiveAndNothingOnIt)
         EXPECT_TRUE(view->textBoxArray().isEmpty());
         EXPECT_EQ(view->currentSelectedTool(), QStringLiteral("brush"));
         EXPECT_EQ(view->lastSelecedTool(), QStringLiteral("brush"));
-        EXPECT_EQ(view->cursorType(), Cursor::arrow());
+        EXPECT_EQ(view->cursorType(), platform::Cursor::arrow());
+        EXPECT_EQ(view->textBoxView(), nullptr);
         EXPECT_EQ(view->popoverWindow(), nullptr);
         EXPECT_EQ(view->drawingCanvasDelegate(), nullptr);
     }
     EXPECT_EQ(DrawingCanvasView(Rect { 1, 2, 30, 40 }).frame(), (Rect { 1, 2, 30, 40 }));
+}
+
+TEST_F(DrawingCanvasViewTest, whatIsStoredCanBeSet)
+{
+    const auto view = platform::makeView<PlainView>();
+
+    canvas->setLastPoint({ 1, 2 });
+    canvas->setStartPoint({ 3, 4 });
+    canvas->setIsDragged(true);
+    canvas->setTextBoxView(view);
+
+    EXPECT_EQ(canvas->lastPoint(), (Point { 1, 2 }));
+    EXPECT_EQ(canvas->startPoint(), (Point { 3, 4 }));
+    EXPECT_TRUE(canvas->isDragged());
+    EXPECT_EQ(canvas->textBoxView(), view);
+    EXPECT_TRUE(canvas->subviews().empty()); // it is only kept
 }
 
 // Brush
@@ -348,52 +361,6 @@ TEST_F(DrawingCanvasViewTest, popoverThatIsGoneChangesNothing)
 
     EXPECT_EQ(canvas->popoverWindow(), nullptr);
     EXPECT_EQ(canvas->currentSelectedTool(), QStringLiteral("color"));
-}
-
-// Cursor
-
-TEST_F(DrawingCanvasViewTest, toolsCursorIsOverTheWholeCanvas)
-{
-    const Cursor cursor = getCursorOfType(QStringLiteral("Eraser_Cursor"));
-    canvas->setCursorType(cursor);
-
-    window.invalidateCursorRects(*canvas);
-
-    EXPECT_EQ(canvas->cursor().pixmap().toImage(), cursor.forScale(1.0).pixmap().toImage());
-    EXPECT_EQ(canvas->cursor().hotSpot(), QPoint(0, 20));
-}
-
-TEST_F(DrawingCanvasViewTest, dragInsideSetsTheToolsCursorAgain)
-{
-    Cursor::arrow().set(*canvas);
-    press({ 50, 60 });
-
-    drag({ -1, 60 });
-    drag({ 50, -1 });
-    drag({ 300, 60 });
-    drag({ 50, 200 });
-    EXPECT_EQ(Cursor::currentCursor(), Cursor::arrow());
-
-    drag({ 0, 0 });
-    EXPECT_EQ(Cursor::currentCursor(), canvas->cursorType());
-}
-
-TEST_F(DrawingCanvasViewTest, releaseOutsideSetsTheArrowOnlyInPlaceOfTheToolsCursor)
-{
-    canvas->cursorType().set(*canvas);
-    press({ 50, 60 });
-    release({ 299, 199 });
-    EXPECT_EQ(Cursor::currentCursor(), canvas->cursorType());
-
-    press({ 50, 60 });
-    release({ 300, 60 });
-    EXPECT_EQ(Cursor::currentCursor(), Cursor::arrow());
-
-    const Cursor other = getCursorOfType(QStringLiteral("Move_Cursor"));
-    other.set(*canvas);
-    press({ 50, 60 });
-    release({ 300, 60 });
-    EXPECT_EQ(Cursor::currentCursor(), other);
 }
 
 } // namespace
