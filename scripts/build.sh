@@ -5,6 +5,9 @@
 # shellcheck disable=SC2034
 build=build/release
 
+# ON where the sources are changed, and in continuous integration; see build_release.
+warnings_as_errors=${PENWICK_WARNINGS_AS_ERRORS:-OFF}
+
 say() {
     printf '==> %s\n' "$*"
 }
@@ -91,12 +94,18 @@ install_what_is_missing() {
         apt-get install -y --no-install-recommends $missing
 }
 
+# Whether what was configured is what is asked for now: a change of the presets, or of the switch
+# above, is nothing that the build itself would notice.
+is_configured() {
+    [[ -e $build/build.ninja && ! CMakePresets.json -nt $build/build.ninja ]] &&
+        grep -qx "PENWICK_WARNINGS_AS_ERRORS:[A-Z]*=$warnings_as_errors" "$build/CMakeCache.txt"
+}
+
 # Builds the targets given, all of them if none is.
 build_release() {
-    # A change of the presets is nothing that the build itself would notice.
-    if [[ ! -e $build/build.ninja || CMakePresets.json -nt $build/build.ninja ]]; then
+    if ! is_configured; then
         say "Configuring $build"
-        quietly cmake --preset release
+        quietly cmake --preset release "-DPENWICK_WARNINGS_AS_ERRORS=$warnings_as_errors"
         touch "$build/build.ninja"
     fi
     local first=''
