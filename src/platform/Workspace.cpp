@@ -4,6 +4,7 @@
 #include <QDBusConnection>
 #include <QDBusMessage>
 #include <QDBusPendingCallWatcher>
+#include <QDBusPendingReply>
 #include <QDBusServiceWatcher>
 #include <QDBusVariant>
 #include <QDeadlineTimer>
@@ -130,8 +131,13 @@ void Workspace::listenTo(const QDBusConnection &bus)
 
     // A portal that starts or restarts may have another opinion.
     auto *watcher = new QDBusServiceWatcher(
-        portalService, *m_bus, QDBusServiceWatcher::WatchForRegistration, this);
-    connect(watcher, &QDBusServiceWatcher::serviceRegistered, this, &Workspace::readContrast);
+        portalService, *m_bus, QDBusServiceWatcher::WatchForOwnerChange, this);
+    connect(watcher, &QDBusServiceWatcher::serviceOwnerChanged, this,
+        [this](const QString &, const QString &, const QString &portal) {
+            m_portal = portal;
+            if (!portal.isEmpty())
+                readContrast();
+        });
 
     // No service is named: Qt would ask the bus who owns that name and wait for the answer.
     // onSettingChanged() looks at the sender instead.
@@ -139,7 +145,24 @@ void Workspace::listenTo(const QDBusConnection &bus)
         { appearanceNamespace, contrastKey }, QStringLiteral("ssv"), this,
         SLOT(onSettingChanged(QDBusMessage)));
 
+    askWhoThePortalIs();
     readContrast();
+}
+
+void Workspace::askWhoThePortalIs()
+{
+    // Asked outright: a reply tells its sender under Qt 6.4, and no longer under 6.8.
+    const auto bus = QStringLiteral("org.freedesktop.DBus");
+    auto call = QDBusMessage::createMethodCall(
+        bus, QStringLiteral("/org/freedesktop/DBus"), bus, QStringLiteral("GetNameOwner"));
+    call << portalService;
+    auto *watcher = new QDBusPendingCallWatcher(m_bus->asyncCall(call), this);
+    connect(watcher, &QDBusPendingCallWatcher::finished, this, [this, watcher] {
+        watcher->deleteLater();
+        const QDBusPendingReply<QString> reply = *watcher;
+        if (reply.isValid()) // otherwise none runs yet
+            m_portal = reply.value();
+    });
 }
 
 void Workspace::readContrast()
@@ -154,15 +177,13 @@ void Workspace::readContrast()
 void Workspace::onContrastRead(QDBusPendingCallWatcher *call)
 {
     call->deleteLater();
-    const QDBusMessage reply = call->reply();
-    m_portal = reply.service();
     // An error (no portal, no such key) carries its text as argument, never a number.
-    setContrastIncreased(asksForContrast(reply.arguments().value(0)));
+    setContrastIncreased(asksForContrast(call->reply().arguments().value(0)));
 }
 
 void Workspace::onSettingChanged(const QDBusMessage &message)
 {
-    // Changes sent before the portal answered are in its answer, so nothing is lost here.
+    // Changes sent before it is known who the portal is are in its answer, which comes later.
     if (message.service() == m_portal)
         setContrastIncreased(asksForContrast(message.arguments().value(2)));
 }

@@ -51,12 +51,13 @@ private:
     Workspace();
 
     void listenTo(const QDBusConnection &bus);
+    void askWhoThePortalIs();
     void readContrast();
     void onContrastRead(QDBusPendingCallWatcher *call);
     void setContrastIncreased(bool isIncreased);
 
     const std::unique_ptr<QDBusConnection> m_bus; // keeps the bus out of who includes this
-    QString m_portal; // unique bus name of who answered last; only its changes count
+    QString m_portal; // unique bus name of the portal that runs; only its changes count
     bool m_isContrastIncreased = false;
     NotificationCenter m_notificationCenter;
 };
