@@ -66,7 +66,7 @@ void RealBoard::open(WindowType type)
     m_controller->showWindow(nullptr);
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     hearDesktop(); // windows come to the screen
-    QApplication::setActiveWindow(&window());
+    activate(true);
     paint();
     m_names.clear();
     m_deleteButtons.clear();

@@ -56,7 +56,12 @@ void RealBoard::paint()
 
 void RealBoard::activate(bool isActive)
 {
+    // What replaces this call asks the desktop, whose answer comes with the event loop: the board
+    // would have painted, and done what it left for later, before it loses the keys.
+    QT_WARNING_PUSH
+    QT_WARNING_DISABLE_DEPRECATED
     QApplication::setActiveWindow(isActive ? &window() : nullptr);
+    QT_WARNING_POP
 }
 
 void RealBoard::minimise(bool isMinimised)
@@ -82,8 +87,8 @@ void RealBoard::show()
         m_controller->showWindow(nullptr);
         hearDesktop();
     }
-    QApplication::setActiveWindow(nullptr);
-    QApplication::setActiveWindow(&window());
+    activate(false);
+    activate(true);
     turn();
 }
 
@@ -140,7 +145,7 @@ void RealBoard::hearDesktop()
         const bool isActive = window().isActiveWindow();
         const Deaf deaf(window());
         QCoreApplication::processEvents(QEventLoop::X11ExcludeTimers);
-        QApplication::setActiveWindow(isActive ? &window() : nullptr);
+        activate(isActive);
     }
     for (platform::Window *const each : family) {
         for (QTimer *const timer : timersOf(*each)) {
