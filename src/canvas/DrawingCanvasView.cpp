@@ -210,21 +210,34 @@ void DrawingCanvasView::setCoversWindow(bool covers)
     setNeedsDisplay();
 }
 
+QColor DrawingCanvasView::paper() const
+{
+    return m_coversWindow && window() ? window()->attributes().backgroundColor : Qt::transparent;
+}
+
+QSize DrawingCanvasView::pixelSize() const
+{
+    return (QSizeF(QWidget::size()) * QWidget::devicePixelRatioF()).toSize();
+}
+
+const PixelLayer &DrawingCanvasView::finishedPixels()
+{
+    m_picture.follow(m_pathArray); // a click may have dropped an entry
+    m_picture.update(pixelSize(), QWidget::devicePixelRatioF(), paper());
+    return m_picture.pixels();
+}
+
 void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)
 {
     const double scale = QWidget::devicePixelRatioF();
-    const QSize size = (QSizeF(QWidget::size()) * scale).toSize();
-    const QColor paper
-        = m_coversWindow && window() ? window()->attributes().backgroundColor : Qt::transparent;
-    m_picture.follow(m_pathArray); // a click may have dropped an entry
-    m_picture.update(size, scale, paper);
+    const QSize size = pixelSize();
+    const PixelLayer &pixels = finishedPixels();
 
     QPainter painter(&surface());
     if (m_coversWindow)
         painter.setCompositionMode(QPainter::CompositionMode_Source);
-    const PixelLayer &pixels = m_picture.pixels();
     if (pixels.area().isEmpty()) {
-        painter.fillRect(surface().rect(), paper);
+        painter.fillRect(surface().rect(), paper());
         return;
     }
     // A pixel more than marked on every side: what is too much is clipped away.
@@ -242,10 +255,26 @@ void DrawingCanvasView::draw(const platform::Rect &dirtyRect)
 {
     takeArraysAnew();
     showStrokes(dirtyRect);
-    // So text boxes that undo brought back appear again.
+    bringBackTextBoxes();
+}
+
+// So text boxes that undo brought back appear again.
+void DrawingCanvasView::bringBackTextBoxes()
+{
     const EntryList<TextBoxEntry> boxes = m_textBoxArray; // whoever leaves may change the list
     for (const TextBoxEntry &entry : boxes)
         addSubview(entry.textBox);
+}
+
+void DrawingCanvasView::drawContent(QPainter &painter)
+{
+    takeArraysAnew();
+    const PixelLayer &pixels = finishedPixels();
+    const double scale = QWidget::devicePixelRatioF();
+    painter.scale(1 / scale, 1 / scale); // pixel for pixel, as on the screen
+    if (!pixels.area().isEmpty())
+        painter.drawImage(QPoint(), pixels.image(), pixels.inImage(QRect(QPoint(), pixelSize())));
+    bringBackTextBoxes(); // nothing may have been painted since undo brought them back
 }
 
 } // namespace penwick

@@ -84,6 +84,8 @@ public:
     void mouseUp(const platform::MouseEvent &event) override;
     void resetCursorRects() override;
     void draw(const platform::Rect &dirtyRect) override;
+    /// The strokes, and under them the window's paper where this covers it.
+    void drawContent(QPainter &painter) override;
 
 private:
     void beginStroke();
@@ -96,6 +98,10 @@ private:
     void dropEntryOfClick();
     void takeArraysAnew();
     void markHairline(const QRect &pixels);
+    void bringBackTextBoxes();
+    [[nodiscard]] QColor paper() const;
+    [[nodiscard]] QSize pixelSize() const; // of the canvas
+    const PixelLayer &finishedPixels();
     void showStrokes(const platform::Rect &dirtyRect);
 
     platform::Point m_lastPoint;

@@ -25,18 +25,28 @@ void ImageView::setImageFrameStyle(ImageFrameStyle style)
     setNeedsDisplay();
 }
 
+QRectF ImageView::imagePlace() const
+{
+    const QSizeF size = m_image.deviceIndependentSize();
+    return { QPointF(0.0, height() - size.height()), size };
+}
+
 void ImageView::draw(const Rect &)
 {
     if (m_image.isNull())
         return;
     QPainter painter(&surface());
-    const QSizeF size = m_image.deviceIndependentSize();
-    const QRectF place(QPointF(0.0, height() - size.height()), size);
-    painter.drawImage(place, m_image);
+    drawContent(painter);
     if (m_imageFrameStyle == ImageFrameStyle::Photo) {
         painter.setPen(QPen(photoFrame, 1.0, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
-        painter.drawRect(place.adjusted(0.5, 0.5, -0.5, -0.5));
+        painter.drawRect(imagePlace().adjusted(0.5, 0.5, -0.5, -0.5));
     }
+}
+
+void ImageView::drawContent(QPainter &painter)
+{
+    if (!m_image.isNull())
+        painter.drawImage(imagePlace(), m_image);
 }
 
 } // namespace penwick::platform

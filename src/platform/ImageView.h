@@ -29,8 +29,12 @@ public:
     void setImageFrameStyle(ImageFrameStyle style);
 
     void draw(const Rect &dirtyRect) override;
+    /// The image without its frame.
+    void drawContent(QPainter &painter) override;
 
 private:
+    [[nodiscard]] QRectF imagePlace() const; // as Qt counts
+
     QImage m_image;
     ImageFrameStyle m_imageFrameStyle = ImageFrameStyle::None;
 };

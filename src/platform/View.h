@@ -14,6 +14,7 @@
 #include <optional>
 #include <vector>
 
+class QPainter;
 class QWidget;
 
 namespace penwick::platform {
@@ -111,6 +112,11 @@ public:
 
     /// Paints the content; `dirtyRect` is in the view's own coordinates.
     virtual void draw(const Rect &dirtyRect) = 0;
+    /// Paints what belongs to the picture of the drawing and nothing else: no layer, no border, no
+    /// mark of being edited. Nothing unless a class says otherwise. `painter` counts in points from
+    /// the view's top left corner, y down, and is clipped to the view. Also called while the view
+    /// is not on the screen.
+    virtual void drawContent(QPainter &painter);
     virtual void mouseDown(const MouseEvent &event) = 0;
     virtual void mouseDragged(const MouseEvent &event) = 0; ///< only after a mouseDown()
     virtual void mouseUp(const MouseEvent &event) = 0; ///< only after a mouseDown()
@@ -127,6 +133,10 @@ public:
     /// Answers whether the view gives the first responder up.
     virtual bool resignFirstResponder() { return true; }
 
+    /// Paints the view as content, and above it its subviews, the lowest first, each in its place;
+    /// `painter` counts in points from the top left corner of what is around the view. A view that
+    /// was hidden paints nothing.
+    void paintContent(QPainter &painter);
     /// Makes views of the widgets that a scene built below this one: takes the frames from the
     /// widgets' places and enters them as subviews, the lowest first.
     void adoptScene();

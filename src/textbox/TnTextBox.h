@@ -65,6 +65,8 @@ public:
     [[nodiscard]] platform::Point textContainerOrigin() const;
 
     void draw(const platform::Rect &dirtyRect) override;
+    /// The text alone.
+    void drawContent(QPainter &painter) override;
     /// Draws the dashed border into `rect`, unless that is less than the whole height.
     void drawBorder(const platform::Rect &rect);
     void mouseDown(const platform::MouseEvent &event) override;

@@ -54,6 +54,10 @@ void expectFullRepaintAfterEveryStep(std::uint32_t ofSeed, int count)
         ASSERT_EQ(difference(session.withoutTextBoxes(shown), session.paintedAnew()), "")
             << "strokes" << place();
         ASSERT_EQ(difference(shown, session.paintedByWindow()), "") << "window" << place();
+        if (step % 50 == 0) { // not always: it brings up to date what the next paint would have to
+            ASSERT_EQ(difference(session.content(), session.paintedAnew()), "")
+                << "content" << place();
+        }
     }
 }
 

@@ -220,6 +220,11 @@ QImage PaintSession::withoutTextBoxes(QImage picture) const
     return picture;
 }
 
+QImage PaintSession::content() const
+{
+    return withoutTextBoxes(m_window.contentImage().convertToFormat(QImage::Format_RGB32));
+}
+
 QImage PaintSession::paintedByWindow()
 {
     return m_window.grab().toImage().convertToFormat(QImage::Format_RGB32);

@@ -38,6 +38,8 @@ public:
     /// are blanked out, as they are in withoutTextBoxes().
     [[nodiscard]] QImage paintedAnew() const;
     [[nodiscard]] QImage withoutTextBoxes(QImage picture) const;
+    /// The window's picture of its content, text boxes blanked out.
+    [[nodiscard]] QImage content() const;
     /// The window painted anew by itself, text boxes included.
     [[nodiscard]] QImage paintedByWindow();
 

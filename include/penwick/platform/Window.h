@@ -6,6 +6,7 @@
 #include <penwick/platform/Geometry.h>
 
 #include <QColor>
+#include <QImage>
 #include <QPointer>
 #include <QWidget>
 
@@ -122,6 +123,16 @@ public:
     [[nodiscard]] ViewController *contentViewController() const;
     /// Takes `controller`, whose view must be one of this window's own.
     void setContentViewController(std::unique_ptr<ViewController> controller);
+    /// The picture of what has been drawn, as large as the window's content, in its device pixels
+    /// and with their number a point as its devicePixelRatio(): the paper (transparent in a layer
+    /// over a screen) or the picture that is drawn on, the strokes, the texts. No border, caret,
+    /// selection, placeholder, button or tool bar. A text that is being edited is in it.
+    ///
+    /// A copy of its own, alpha premultiplied, made anew by each call. The window need not be on
+    /// the screen; the last chance is the end of the session, inside its notification or later for
+    /// as long as the window is there. Null where the content has no size or there is no memory
+    /// for it.
+    [[nodiscard]] QImage contentImage() const;
     [[nodiscard]] WindowController *windowController() const;
     void setWindowController(WindowController *controller);
     void setDelegate(WindowDelegate *delegate); ///< weak

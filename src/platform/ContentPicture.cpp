@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: MIT
+// The picture of what a window holds: each view paints itself as content, without what belongs to
+// its being edited or shown.
+#include <penwick/platform/Window.h>
+
+#include "platform/View.h"
+
+#include <QImage>
+#include <QPainter>
+
+namespace penwick::platform {
+
+void View::drawContent(QPainter &) { }
+
+void View::paintContent(QPainter &painter)
+{
+    if (m_isHidden)
+        return;
+    painter.save();
+    painter.setClipRect(m_widget.geometry(), Qt::IntersectClip);
+    painter.translate(m_widget.pos());
+    painter.save();
+    drawContent(painter); // may bring subviews back
+    painter.restore();
+    for (View *const view : subviews())
+        view->paintContent(painter);
+    painter.restore();
+}
+
+QImage Window::contentImage() const
+{
+    const double scale = devicePixelRatioF();
+    QImage image((QSizeF(size()) * scale).toSize(), QImage::Format_ARGB32_Premultiplied);
+    if (image.isNull())
+        return image;
+    image.setDevicePixelRatio(scale);
+    image.fill(m_attributes.backgroundColor);
+    QPainter painter(&image);
+    for (View *const view : topViews())
+        view->paintContent(painter);
+    return image;
+}
+
+} // namespace penwick::platform
