@@ -250,6 +250,7 @@ void DrawingWindowController::placeToolBar()
     platform::WindowAttributes attributes = panel->attributes();
     attributes.hasShadow = true;
     panel->setAttributes(attributes);
+    m_tPanelWindowController->keepEndInReach();
     m_tPanelWindowController->showWindow(this);
 }
 
@@ -301,6 +302,8 @@ void DrawingWindowController::windowDidMove()
 {
     if (m_drawingWindow)
         m_drawingWindowOrigin = m_drawingWindow->frame().origin();
+    if (m_tPanelWindowController)
+        m_tPanelWindowController->keepEndInReach(); // it has followed
 }
 
 void DrawingWindowController::windowDidResize()

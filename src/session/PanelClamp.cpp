@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "session/PanelClamp.h"
 
+#include "platform/WorkArea.h"
+
 namespace penwick {
 
 namespace {
@@ -25,6 +27,14 @@ platform::Rect clampedPanel(const platform::Rect &panel, const platform::Rect &p
     if (parent.maxX() - margin < clamped.maxX())
         clamped.x = parent.maxX() - margin - clamped.width;
     return clamped;
+}
+
+platform::Rect reachablePanel(
+    const platform::Rect &panel, const platform::Rect &parent, const platform::Rect &workArea)
+{
+    if (panel.height <= parent.height - titleBar - 2 * margin)
+        return panel;
+    return platform::broughtInside(panel, workArea, platform::KeptEdge::Bottom);
 }
 
 } // namespace penwick

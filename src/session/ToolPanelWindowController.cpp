@@ -3,6 +3,7 @@
 
 #include "platform/OneShotTimer.h"
 #include "platform/WindowFlags.h"
+#include "platform/WorkArea.h"
 #include "platform/foundation/FatalError.h"
 #include "session/PanelClamp.h"
 #include "toolpanel/ToolPanelViewController.h"
@@ -16,6 +17,11 @@ using platform::require;
 constexpr int settleTime = 200; // ms, between letting go of the panel and pulling it back
 constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
 constexpr int hiddenTitle = 1;
+
+platform::Rect reachableBeside(const platform::Window &parent, const platform::Rect &panel)
+{
+    return reachablePanel(panel, parent.frame(), platform::workAreaFor(panel));
+}
 
 } // namespace
 
@@ -57,9 +63,20 @@ void ToolPanelWindowController::adjustPosition()
         return;
     const platform::Window *const parent = m_toolPanelWindow->parentWindow();
     if (parent) {
-        m_toolPanelWindow->setFrame(
-            clampedPanel(m_toolPanelWindow->frame(), parent->frame()), platform::Animate::Yes);
+        const platform::Rect clamped = clampedPanel(m_toolPanelWindow->frame(), parent->frame());
+        m_toolPanelWindow->setFrame(reachableBeside(*parent, clamped), platform::Animate::Yes);
     }
+}
+
+void ToolPanelWindowController::keepEndInReach()
+{
+    if (!m_toolPanelWindow)
+        return;
+    const platform::Window *const parent = m_toolPanelWindow->parentWindow();
+    const platform::Rect frame = m_toolPanelWindow->frame();
+    const platform::Rect reachable = parent ? reachableBeside(*parent, frame) : frame;
+    if (!(reachable == frame))
+        m_toolPanelWindow->setFrame(reachable);
 }
 
 void ToolPanelWindowController::mouseDown()

@@ -32,6 +32,9 @@ public:
     void windowDidLoad() override;
     /// Glides the panel inside its parent's frame; nothing without a parent.
     void adjustPosition();
+    /// Moves a panel that is higher than its parent has room for so that its lower end, which ends
+    /// the session, is on the screen; at once.
+    void keepEndInReach();
     void mouseDown() override;
     void mouseUp() override;
 

@@ -9,6 +9,7 @@
 #include "history/NotificationNames.h"
 #include "platform/PlainView.h"
 #include "platform/WindowFlags.h"
+#include "platform/WorkArea.h"
 #include "platform/Workspace.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/StandardOutput.h"
@@ -302,9 +303,13 @@ void ToolPanelViewController::showPopoverIfRequired(PopoverChoice choice)
 
 void ToolPanelViewController::placePopover(const ToolPanelButton &anchor)
 {
-    const platform::Point panel = panelWindow().frame().origin();
-    m_popoverW->setFrameOrigin({ panel.x + popoverGap + view()->frame().maxX() + anchor.frame().x,
-        panel.y + anchor.frame().y });
+    const platform::Rect panel = panelWindow().frame();
+    const platform::Size size = m_popoverW->frame().size();
+    const platform::Rect place { panel.x + popoverGap + view()->frame().maxX() + anchor.frame().x,
+        panel.y + anchor.frame().y, size.width, size.height };
+    // Where there is no room for it beside the panel, what it offers would be out of reach; over
+    // the panel it would cover its button, which closes it.
+    m_popoverW->setFrame(platform::broughtInsideBeside(place, platform::workAreaFor(panel), panel));
 }
 
 // Keys

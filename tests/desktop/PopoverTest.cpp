@@ -47,6 +47,37 @@ struct Ink
 class PopoverColour : public Popover, public testing::WithParamInterface<Ink>
 { };
 
+/// A corner of the layer, by where the bar's handle is dropped.
+struct Corner
+{
+    const char *name;
+    QPoint drop;
+};
+
+/// The layer over a screen of 1280 x 800, with the bar in one of its corners.
+class PopoverInACorner : public Popover, public testing::WithParamInterface<Corner>
+{
+protected:
+    void openInTheCorner()
+    {
+        start({ "--window", "annotation" });
+        const QRect bar = toolBar().frame;
+        dragBar(GetParam().drop - QPoint(bar.center().x(), bar.top()));
+        const QRect inside = QRect(0, 0, 1280, 800).adjusted(3, 25, -3, -3);
+        EXPECT_TRUE(waitUntil([&] { return inside.contains(toolBar().frame); }));
+        settled = toolBar().frame;
+        EXPECT_TRUE(
+            waitUntil([&] { return host().window(QStringLiteral("toolPanel")).frame == settled; }));
+    }
+
+    QRect settled; // the bar's frame
+};
+
+std::string cornerName(const testing::TestParamInfo<Corner> &corner)
+{
+    return corner.param.name;
+}
+
 std::string inkName(const testing::TestParamInfo<Ink> &ink)
 {
     return std::string(ink.param.option).substr(std::string("color#").size());
@@ -75,6 +106,35 @@ INSTANTIATE_TEST_SUITE_P(Inks, PopoverColour,
         Ink { "color#red", { 255, 58, 104 }, { 255, 117, 149 } },
         Ink { "color#light_blue", { 0, 167, 244 }, { 77, 193, 247 } }),
     inkName);
+
+TEST_P(PopoverInACorner, offersEveryOptionAndIsClosedByItsButton)
+{
+    openInTheCorner();
+    const QRect screen(0, 0, 1280, 800);
+    for (const char *const tool : { "brush", "color" }) {
+        press(tool);
+
+        const WindowState shown = popover();
+        EXPECT_TRUE(screen.contains(shown.frame)) << tool;
+        EXPECT_FALSE(shown.frame.intersects(settled)) << tool;
+        EXPECT_GE(shown.buttons.size(), 4) << tool;
+        for (const QPoint option : shown.buttons)
+            EXPECT_TRUE(screen.adjusted(10, 10, -10, -10).contains(option)) << tool;
+        press(tool);
+        EXPECT_TRUE(isPopoverHidden()) << tool;
+    }
+
+    press("color");
+    choose("color#white");
+    EXPECT_TRUE(isPopoverHidden());
+    EXPECT_TRUE(waitUntil(
+        [this] { return desktop().screen().pixel(centre("color")) == QColor(Qt::white); }));
+}
+
+INSTANTIATE_TEST_SUITE_P(Corners, PopoverInACorner,
+    testing::Values(Corner { "UpperLeft", { 0, 0 } }, Corner { "UpperRight", { 1279, 0 } },
+        Corner { "LowerLeft", { 0, 790 } }, Corner { "LowerRight", { 1279, 790 } }),
+    cornerName);
 
 TEST_F(Popover, chosenThicknessIsDrawnWith)
 {

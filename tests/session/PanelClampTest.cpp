@@ -62,4 +62,42 @@ INSTANTIATE_TEST_SUITE_P(Panels, PanelClamp,
             { -63, -425, 60, 400 } }),
     caseName);
 
+// Of a panel of 60 x 400 on a screen of 1280 x 800.
+
+class ReachablePanel : public testing::Test
+{
+protected:
+    static Rect shown(const Rect &panel, const Rect &parent)
+    {
+        return reachablePanel(panel, parent, { 0, 0, 1280, 800 });
+    }
+};
+
+TEST_F(ReachablePanel, thatFitsItsParentStaysEvenOutOfTheScreen)
+{
+    EXPECT_EQ(
+        shown({ 200, -300, 60, 400 }, { 100, -300, 640, 428 }), (Rect { 200, -300, 60, 400 }));
+}
+
+TEST_F(ReachablePanel, thatIsHigherThanItsParentHasRoomForComesUp)
+{
+    EXPECT_EQ(shown({ 200, -300, 60, 400 }, { 100, -300, 640, 427 }), (Rect { 200, 0, 60, 400 }));
+    EXPECT_EQ(shown({ 200, -1, 60, 400 }, { 100, 100, 480, 270 }), (Rect { 200, 0, 60, 400 }));
+}
+
+TEST_F(ReachablePanel, comesDownAndSidewaysToo)
+{
+    EXPECT_EQ(shown({ 1260, 500, 60, 400 }, { 900, 600, 480, 270 }), (Rect { 1220, 400, 60, 400 }));
+}
+
+TEST_F(ReachablePanel, insideTheScreenStaysWhereItIs)
+{
+    EXPECT_EQ(shown({ 200, 20, 60, 400 }, { 100, 100, 480, 270 }), (Rect { 200, 20, 60, 400 }));
+}
+
+TEST_F(ReachablePanel, higherThanTheScreenKeepsItsLowerEnd)
+{
+    EXPECT_EQ(shown({ 200, -30, 60, 900 }, { 0, 0, 1280, 800 }), (Rect { 200, 0, 60, 900 }));
+}
+
 } // namespace penwick

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "sessions/PlainBoard.h"
 
-#include <cmath>
 #include <utility>
 
 namespace penwick::sessions {
@@ -206,11 +205,7 @@ void PlainBoard::moveTo(const PlainFrame &frame)
 void PlainBoard::rest(const PlainFrame &frame)
 {
     m_isMoving = false;
-    m_frames.keepShape();
-    const PlainFrame &kept = m_frames.board;
-    // A desktop may be out by the width of the border that it draws.
-    if (std::abs(frame.x - kept.x) <= 2 && std::abs(frame.y - kept.y) <= 2)
-        m_frames.moveTo({ frame.x, frame.y, kept.width, kept.height });
+    m_frames.restAt(frame);
 }
 
 void PlainBoard::activate(bool isActive)

@@ -26,13 +26,15 @@ public:
 
     void moveTo(const PlainFrame &frame); ///< of the same size; the panel goes along
     void resizeTo(const PlainFrame &frame);
-    void keepShape(); ///< 16:9, from the top left corner on
+    /// The desktop has granted `frame` for what was asked: 16:9, from the top left corner on.
+    void restAt(const PlainFrame &frame);
     void pullPanelIn(); ///< into the drawing window
 
     [[nodiscard]] std::string inWords() const;
 
 private:
     void shiftPanel(double x, double y);
+    void bringPanelUp(); ///< of a board that has no room for it
 };
 
 } // namespace penwick::sessions

@@ -260,12 +260,12 @@ TEST_F(ToolPanelPress, popoverFollowsThePanelToItsNextOpening)
 {
     press("brush");
     press("brush");
-    panel.setFrameOrigin({ 600, 300 });
+    panel.setFrameOrigin({ 580, 300 });
     QCoreApplication::processEvents();
 
     press("brush");
 
-    EXPECT_EQ(popoverOrigin(), (platform::Point { 670, 592 }));
+    EXPECT_EQ(popoverOrigin(), (platform::Point { 650, 592 }));
 }
 
 TEST_F(ToolPanelPress, firstPopoverIsPutIntoTheWindowAsThePanelsChild)
