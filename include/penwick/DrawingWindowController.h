@@ -34,20 +34,32 @@ class PENWICK_EXPORT DrawingWindowController final : public platform::WindowCont
 public:
     /// Needs a primary screen: without one the process stops.
     DrawingWindowController();
+    /// The same, with a window that did not come from the component's own scene: it is not set up,
+    /// and not the drawing window until setDrawingWindow() says so.
+    explicit DrawingWindowController(std::unique_ptr<platform::Window> window);
     ~DrawingWindowController() override;
 
     /// Bottom left corner of the drawing window's frame as last recorded, in points, y up, from
     /// the primary screen's bottom left corner; nothing before the window was placed.
     [[nodiscard]] std::optional<platform::Point> drawingWindowOrigin() const;
-    /// The banner's window; null where it could not be loaded. Owned.
-    [[nodiscard]] platform::Window *sharingNotificationWindow() const;
-    /// The kind of window; nothing before the window was placed.
-    [[nodiscard]] std::optional<WindowType> mWindowType() const;
-    /// The drawing window; null once it is gone. Owned by this controller.
-    [[nodiscard]] platform::Window *drawingWindow() const;
-    void setDrawingWindow(platform::Window *window);
+    /// Records `origin`; moves nothing.
+    void setDrawingWindowOrigin(const std::optional<platform::Point> &origin);
     /// The controller of the tool bar; null before the window was loaded. Owned.
     [[nodiscard]] const std::shared_ptr<ToolPanelWindowController> &tPanelWindowController() const;
+    /// The former tool bar goes unless somebody else holds it. The new one is placed, and closed
+    /// with the drawing window; whoever sets it makes its panel a child window.
+    void setTPanelWindowController(std::shared_ptr<ToolPanelWindowController> controller);
+    /// The banner's window; null where it could not be loaded. Owned.
+    [[nodiscard]] const std::shared_ptr<platform::Window> &sharingNotificationWindow() const;
+    void setSharingNotificationWindow(std::shared_ptr<platform::Window> window);
+    /// The kind of window; nothing before the window was placed.
+    [[nodiscard]] std::optional<WindowType> mWindowType() const;
+    /// Records `type`, which the end of the session is told by; changes nothing of the window.
+    void setMWindowType(std::optional<WindowType> type);
+    /// The drawing window; null once it is gone. Owned by this controller.
+    [[nodiscard]] platform::Window *drawingWindow() const;
+    /// Borrows `window`.
+    void setDrawingWindow(platform::Window *window);
     /// Two thirds of the screen's width, in points: the width of a whiteboard window.
     [[nodiscard]] double minWindowWidth() const;
     /// Two thirds of the screen's height, in points.
@@ -65,8 +77,9 @@ public:
     /// Makes `window` a transparent banner that a capture of the screen leaves out where the
     /// desktop can do that.
     void setNotificationWindowProperties(platform::Window &window);
-    /// Shows the banner in the middle of the drawing window for 1.5 s. Without a banner nothing
-    /// happens; a drawing window that was not placed stops the process.
+    /// Shows the banner in the middle of the drawing window for 1.5 s. Where the drawing window is
+    /// not on the screen, the banner comes up together with it if that is within this time.
+    /// Without a banner nothing happens; a drawing window that was not placed stops the process.
     void showSharingNotificationWindow();
     /// Takes the banner off the screen.
     void closeSharingNotificationWindow();
@@ -74,6 +87,8 @@ public:
     void hideThePopover();
 
     void windowDidLoad() override;
+    /// Brings the tool bar back that went when the window was closed.
+    void windowWillAppear() override;
     /// Hides the popover, as does another window's taking over.
     void windowWillMove() override;
     void windowDidResignMain() override;
@@ -95,6 +110,7 @@ private:
     void loadBanner();
     void attachToolBar();
     void placeToolBar();
+    void reopenToolBar();
     void centreBanner();
 
     std::optional<platform::Point> m_drawingWindowOrigin;
@@ -103,7 +119,8 @@ private:
     double m_minWindowWidth;
     double m_minWindowHeight;
     std::shared_ptr<ToolPanelWindowController> m_tPanelWindowController;
-    std::unique_ptr<platform::WindowController> m_bannerController;
+    std::shared_ptr<platform::Window> m_sharingNotificationWindow;
+    bool m_isToolBarPlaced = false; // a window that has nothing to draw on shows none
 };
 
 } // namespace penwick

@@ -35,6 +35,8 @@ public:
 
     /// The controller of the drawing window opened last; null before the first.
     [[nodiscard]] std::shared_ptr<DrawingWindowController> penwickWindowController() const;
+    /// Holds `controller` in place of the one before, which goes unless somebody else holds it.
+    void setPenwickWindowController(std::shared_ptr<DrawingWindowController> controller);
 
     /// Builds and places a drawing window, which the host then shows with showWindow().
     ///

@@ -32,6 +32,15 @@ Window::Window(QWidget *parent)
     applyAttributes();
 }
 
+Window::Window(const Rect &contentRect, unsigned styleMask, BackingStore, bool)
+    : Window()
+{
+    WindowAttributes attributes;
+    attributes.styleMask = styleMask;
+    setAttributes(attributes);
+    setFrame(contentRect);
+}
+
 Window::~Window()
 {
     // A view that goes down with the window has nobody left to resign to.
@@ -140,8 +149,13 @@ void Window::setWindowController(WindowController *controller)
 
 void Window::tellDelegate(void (WindowDelegate::*what)())
 {
-    if (m_delegateObject)
-        (m_delegate->*what)();
+    if (WindowDelegate *const told = delegate())
+        (told->*what)();
+}
+
+WindowDelegate *Window::delegate() const
+{
+    return m_delegateObject ? m_delegate : nullptr;
 }
 
 void Window::setDelegate(WindowDelegate *delegate)
@@ -264,6 +278,7 @@ void Window::orderIn()
     d->isClosed = false;
     if (d->contentViewController)
         d->contentViewController->viewWillAppear();
+    tellDelegate(&WindowDelegate::windowWillAppear);
 }
 
 void Window::setVisible(bool visible)

@@ -3,10 +3,21 @@
 
 #include <penwick/platform/Window.h>
 
+#include "platform/WindowFlags.h"
+
+#include <utility>
+
 namespace penwick::platform {
 
 WindowController::WindowController() = default;
 WindowController::~WindowController() = default;
+
+WindowController::WindowController(std::unique_ptr<Window> window)
+    : m_window(std::move(window))
+{
+    if (m_window)
+        m_window->setWindowController(this);
+}
 
 Window *WindowController::window() const
 {
@@ -25,7 +36,8 @@ void WindowController::showWindow(QObject *)
     if (!m_window)
         return;
     m_window->orderFront();
-    m_window->activateWindow();
+    if (canBecomeKey(m_window->attributes()))
+        m_window->activateWindow();
 }
 
 bool WindowController::keyDown(const QKeyEvent &)

@@ -6,21 +6,17 @@
 #include "appearance/ViewBorder.h"
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
-#include "platform/OneShotTimer.h"
 #include "platform/Storyboard.h"
 #include "platform/View.h"
 #include "platform/WindowFlags.h"
 #include "platform/foundation/FatalError.h"
-#include "platform/foundation/StandardOutput.h"
 #include "session/ToolPanelWindowController.h"
-#include "toolpanel/ToolPanelViewController.h"
-
-#include <penwick/Penwick.h>
-#include <penwick/platform/NotificationCenter.h>
 
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QScreen>
+
+#include <utility>
 
 namespace penwick {
 
@@ -31,12 +27,9 @@ using platform::Rect;
 using platform::require;
 
 constexpr double boardBorder = 3.0; // points
-constexpr int bannerTime = 1500; // ms
 constexpr int alertPanelAnimation = 5;
 constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
 constexpr int hiddenTitle = 1;
-constexpr double toolBarInset = 20.0; // points, from the drawing window's left edge
-constexpr auto missingToolBar = "Warning: ToolPanelWindowController not created!";
 
 Rect mainScreenFrame()
 {
@@ -63,6 +56,12 @@ DrawingWindowController::DrawingWindowController()
     , m_minWindowHeight(mainScreenFrame().height * 2 / 3)
 { }
 
+DrawingWindowController::DrawingWindowController(std::unique_ptr<platform::Window> window)
+    : WindowController(std::move(window))
+    , m_minWindowWidth(mainScreenFrame().width * 2 / 3)
+    , m_minWindowHeight(mainScreenFrame().height * 2 / 3)
+{ }
+
 DrawingWindowController::~DrawingWindowController()
 {
     // The window goes after this object and must not tell it so.
@@ -75,9 +74,19 @@ std::optional<platform::Point> DrawingWindowController::drawingWindowOrigin() co
     return m_drawingWindowOrigin;
 }
 
+void DrawingWindowController::setDrawingWindowOrigin(const std::optional<platform::Point> &origin)
+{
+    m_drawingWindowOrigin = origin;
+}
+
 std::optional<WindowType> DrawingWindowController::mWindowType() const
 {
     return m_windowType;
+}
+
+void DrawingWindowController::setMWindowType(std::optional<WindowType> type)
+{
+    m_windowType = type;
 }
 
 platform::Window *DrawingWindowController::drawingWindow() const
@@ -94,6 +103,22 @@ const std::shared_ptr<ToolPanelWindowController> &
 DrawingWindowController::tPanelWindowController() const
 {
     return m_tPanelWindowController;
+}
+
+void DrawingWindowController::setTPanelWindowController(
+    std::shared_ptr<ToolPanelWindowController> controller)
+{
+    m_tPanelWindowController = std::move(controller);
+}
+
+const std::shared_ptr<platform::Window> &DrawingWindowController::sharingNotificationWindow() const
+{
+    return m_sharingNotificationWindow;
+}
+
+void DrawingWindowController::setSharingNotificationWindow(std::shared_ptr<platform::Window> window)
+{
+    m_sharingNotificationWindow = std::move(window);
 }
 
 double DrawingWindowController::minWindowWidth() const
@@ -125,21 +150,15 @@ void DrawingWindowController::windowDidLoad()
 
 void DrawingWindowController::loadBanner()
 {
-    m_bannerController = mainStoryboard().instantiate<platform::WindowController>(
-        QStringLiteral("SharingNotificationWindowController"));
-    require(m_bannerController, "the drawing window has no sharing banner");
-    if (platform::Window *const banner = sharingNotificationWindow())
-        setNotificationWindowProperties(*banner);
-}
-
-void DrawingWindowController::setNotificationWindowProperties(platform::Window &window)
-{
-    platform::WindowAttributes attributes = window.attributes();
-    attributes.isOpaque = false;
-    attributes.sharingType = 0;
-    attributes.titlebarAppearsTransparent = true;
-    attributes.backgroundColor = Qt::transparent;
-    window.setAttributes(attributes);
+    const std::shared_ptr<platform::WindowController> controller
+        = mainStoryboard().instantiate<platform::WindowController>(
+            QStringLiteral("SharingNotificationWindowController"));
+    require(controller.get(), "the drawing window has no sharing banner");
+    if (!controller->window())
+        return;
+    // The window goes with its controller, which has nothing else to do.
+    m_sharingNotificationWindow = { controller, controller->window() };
+    setNotificationWindowProperties(*m_sharingNotificationWindow);
 }
 
 void DrawingWindowController::attachToolBar()
@@ -182,11 +201,11 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     }
     m_drawingWindowOrigin = m_drawingWindow->frame().origin();
     placeToolBar();
-    if (win_type == WindowType::whiteboard && sharingNotificationWindow()) {
+    if (win_type == WindowType::whiteboard && m_sharingNotificationWindow) {
         centreBanner();
-        platform::WindowAttributes attributes = sharingNotificationWindow()->attributes();
+        platform::WindowAttributes attributes = m_sharingNotificationWindow->attributes();
         attributes.animationBehavior = alertPanelAnimation;
-        sharingNotificationWindow()->setAttributes(attributes);
+        m_sharingNotificationWindow->setAttributes(attributes);
     }
 }
 
@@ -234,124 +253,6 @@ DrawViewController &DrawingWindowController::content() const
 {
     return *require(dynamic_cast<DrawViewController *>(m_drawingWindow->contentViewController()),
         "the drawing window's content is no drawing");
-}
-
-void DrawingWindowController::placeToolBar()
-{
-    if (!m_tPanelWindowController) {
-        platform::printLine(missingToolBar);
-        return;
-    }
-    platform::Window *const panel = m_tPanelWindowController->window();
-    if (!panel)
-        return;
-    setWindowPositionRelativeToMainWindow(
-        *panel, toolBarInset, m_drawingWindow->frame().height * 0.5 - panel->frame().height * 0.5);
-    platform::WindowAttributes attributes = panel->attributes();
-    attributes.hasShadow = true;
-    panel->setAttributes(attributes);
-    m_tPanelWindowController->keepEndInReach();
-    m_tPanelWindowController->showWindow(this);
-}
-
-void DrawingWindowController::setWindowPositionRelativeToMainWindow(
-    platform::Window &window, double xoffset, double yOffset)
-{
-    if (!m_drawingWindowOrigin)
-        platform::fatalError("the drawing window has not been placed");
-    window.setFrameOrigin(*m_drawingWindowOrigin + platform::Point { xoffset, yOffset });
-}
-
-// The banner
-
-platform::Window *DrawingWindowController::sharingNotificationWindow() const
-{
-    return m_bannerController ? m_bannerController->window() : nullptr;
-}
-
-void DrawingWindowController::centreBanner()
-{
-    const platform::Size drawing = m_drawingWindow->frame().size();
-    const platform::Size banner = sharingNotificationWindow()->frame().size();
-    setWindowPositionRelativeToMainWindow(*sharingNotificationWindow(),
-        drawing.width * 0.5 - banner.width * 0.5, drawing.height * 0.5 - banner.height * 0.5);
-}
-
-void DrawingWindowController::showSharingNotificationWindow()
-{
-    if (!sharingNotificationWindow())
-        return;
-    require(m_drawingWindow.data(), "the drawing window is gone");
-    centreBanner();
-    m_drawingWindow->addChildWindow(*sharingNotificationWindow());
-    platform::callLater(
-        *this, bannerTime, &DrawingWindowController::closeSharingNotificationWindow);
-}
-
-void DrawingWindowController::closeSharingNotificationWindow()
-{
-    if (platform::Window *const banner = sharingNotificationWindow()) {
-        banner->orderOut();
-        banner->close();
-    }
-}
-
-// Moving, resizing, closing
-
-void DrawingWindowController::windowDidMove()
-{
-    if (m_drawingWindow)
-        m_drawingWindowOrigin = m_drawingWindow->frame().origin();
-    if (m_tPanelWindowController)
-        m_tPanelWindowController->keepEndInReach(); // it has followed
-}
-
-void DrawingWindowController::windowDidResize()
-{
-    platform::Window *const panel
-        = m_tPanelWindowController ? m_tPanelWindowController->window() : nullptr;
-    if (!panel) {
-        platform::printLine(missingToolBar);
-        return;
-    }
-    if (!m_drawingWindowOrigin || !m_drawingWindow)
-        return;
-    const platform::Point origin = m_drawingWindow->frame().origin();
-    panel->setFrameOrigin(panel->frame().origin() + (origin - *m_drawingWindowOrigin));
-    m_tPanelWindowController->adjustPosition();
-    m_drawingWindowOrigin = origin;
-}
-
-void DrawingWindowController::windowWillMove()
-{
-    hideThePopover();
-}
-
-void DrawingWindowController::windowDidResignMain()
-{
-    hideThePopover();
-}
-
-void DrawingWindowController::hideThePopover()
-{
-    if (!m_drawingWindow)
-        return;
-    auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView());
-    if (canvas && canvas->popoverWindow())
-        canvas->popoverWindow()->orderOut();
-}
-
-bool DrawingWindowController::keyDown(const QKeyEvent &event)
-{
-    return m_tPanelWindowController && m_tPanelWindowController->content().performKey(event);
-}
-
-void DrawingWindowController::windowWillClose()
-{
-    if (m_tPanelWindowController && m_tPanelWindowController->toolPanelWindow())
-        m_tPanelWindowController->toolPanelWindow()->close();
-    platform::NotificationCenter::defaultCenter().postNotification(
-        penwickSessionEndNotificationKey(), m_windowType == WindowType::imageAnnotation);
 }
 
 } // namespace penwick

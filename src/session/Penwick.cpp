@@ -45,6 +45,11 @@ std::shared_ptr<DrawingWindowController> Penwick::penwickWindowController() cons
     return m_penwickWindowController;
 }
 
+void Penwick::setPenwickWindowController(std::shared_ptr<DrawingWindowController> controller)
+{
+    m_penwickWindowController = std::move(controller);
+}
+
 std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
     WindowType windowType, QScreen *drawScreen, const std::optional<QImage> &annotatedImage,
     const std::optional<QString> &windowTitle)

@@ -12,7 +12,14 @@ class ToolBarPanelWindow final : public platform::Window
     Q_OBJECT
 
 public:
-    using platform::Window::Window;
+    explicit ToolBarPanelWindow(QWidget *parent = nullptr)
+        : Window(parent)
+    { }
+    /// All four go to the panel's own constructor as they are.
+    ToolBarPanelWindow(const platform::Rect &contentRect, unsigned styleMask,
+        platform::BackingStore backing, bool defer)
+        : Window(contentRect, styleMask, backing, defer)
+    { }
 };
 
 } // namespace penwick

@@ -28,6 +28,10 @@ platform::Rect reachableBeside(const platform::Window &parent, const platform::R
 ToolPanelWindowController::ToolPanelWindowController() = default;
 ToolPanelWindowController::~ToolPanelWindowController() = default;
 
+ToolPanelWindowController::ToolPanelWindowController(std::unique_ptr<platform::Window> window)
+    : WindowController(std::move(window))
+{ }
+
 ToolPanelViewController &ToolPanelWindowController::content() const
 {
     const ToolBarPanelWindow *const panel

@@ -8,6 +8,9 @@
 
 #include <QPointer>
 
+#include <memory>
+#include <utility>
+
 namespace penwick {
 
 class ToolPanelViewController;
@@ -21,11 +24,23 @@ class ToolPanelWindowController final : public platform::WindowController,
 
 public:
     ToolPanelWindowController();
+    /// The same, with a window that did not come from the scene: it is not set up, and not the
+    /// panel until setToolPanelWindow() says so.
+    explicit ToolPanelWindowController(std::unique_ptr<platform::Window> window);
     ~ToolPanelWindowController() override;
 
     /// The panel; the scene connects it. Weak.
     [[nodiscard]] ToolBarPanelWindow *toolPanelWindow() const { return m_toolPanelWindow; }
     void setToolPanelWindow(ToolBarPanelWindow *window) { m_toolPanelWindow = window; }
+    /// A window kept for the popover, which nothing here reads; null at first. Owned.
+    [[nodiscard]] const std::shared_ptr<platform::Window> &popoverWindow() const
+    {
+        return m_popoverWindow;
+    }
+    void setPopoverWindow(std::shared_ptr<platform::Window> window)
+    {
+        m_popoverWindow = std::move(window);
+    }
     /// The content's controller; a panel without one stops the process.
     [[nodiscard]] ToolPanelViewController &content() const;
 
@@ -40,6 +55,7 @@ public:
 
 private:
     QPointer<ToolBarPanelWindow> m_toolPanelWindow;
+    std::shared_ptr<platform::Window> m_popoverWindow;
 };
 
 } // namespace penwick

@@ -44,6 +44,36 @@ TEST(WindowController, windowIsLoadedOnceItIsSet)
     EXPECT_EQ(controller.loads(), 1);
 }
 
+TEST(WindowController, windowFromElsewhereIsTakenWithoutBeingLoaded)
+{
+    auto window = std::make_unique<Window>();
+    Window *const taken = window.get();
+
+    const WindowController controller(std::move(window));
+
+    EXPECT_EQ(controller.window(), taken);
+    EXPECT_EQ(taken->windowController(), &controller);
+    EXPECT_EQ(WindowController(nullptr).window(), nullptr);
+}
+
+TEST(WindowController, windowThatTakesNoKeysIsShownWithoutAskingForThem)
+{
+    WindowController controller;
+    controller.setWindow(
+        std::make_unique<Window>(Rect { 0, 0, 40, 30 }, 0U, BackingStore::Buffered, false));
+    controller.window()->winId();
+    static QStringList warnings;
+    warnings.clear();
+    const auto former = qInstallMessageHandler(
+        [](QtMsgType, const QMessageLogContext &, const QString &text) { warnings << text; });
+
+    controller.showWindow(nullptr);
+
+    qInstallMessageHandler(former);
+    EXPECT_TRUE(controller.window()->isVisible());
+    EXPECT_TRUE(warnings.filter(QStringLiteral("requestActivate")).isEmpty());
+}
+
 TEST(WindowController, shownWindowIsTheKeyWindow)
 {
     WindowController controller;

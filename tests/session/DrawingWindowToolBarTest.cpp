@@ -170,6 +170,56 @@ TEST_F(DrawingWindowToolBar, closedWindowTakesItAlong)
     EXPECT_EQ(ends(), std::vector<QVariant> { false });
 }
 
+TEST_F(DrawingWindowToolBar, comesBackWithAWindowThatIsShownAfterItWasClosed)
+{
+    show();
+    drawing().close();
+    ASSERT_FALSE(panel().isVisible());
+
+    show();
+
+    EXPECT_TRUE(drawing().isVisible());
+    EXPECT_TRUE(panel().isVisible());
+    EXPECT_EQ(panel().frame(), (Rect { 340, 364, 52, 352 }));
+    openPopover();
+    m_controller->tPanelWindowController()->content().button(QStringLiteral("state"))->click();
+    EXPECT_FALSE(drawing().isVisible());
+    EXPECT_EQ(ends(), (std::vector<QVariant> { false, false }));
+}
+
+TEST_F(DrawingWindowToolBar, comesBackWithUndoAndRedoAsTheyWere)
+{
+    show();
+    ToolPanelViewController &bar = m_controller->tPanelWindowController()->content();
+    bar.button(QStringLiteral("undo"))->setEnabled(true);
+
+    drawing().close();
+    show();
+
+    EXPECT_TRUE(bar.button(QStringLiteral("undo"))->isEnabled());
+    EXPECT_FALSE(bar.button(QStringLiteral("redo"))->isEnabled());
+    bar.button(QStringLiteral("undo"))->setEnabled(false);
+    bar.button(QStringLiteral("redo"))->setEnabled(true);
+    drawing().close();
+    show();
+    EXPECT_FALSE(bar.button(QStringLiteral("undo"))->isEnabled());
+    EXPECT_TRUE(bar.button(QStringLiteral("redo"))->isEnabled());
+}
+
+TEST_F(DrawingWindowToolBar, isNotBroughtToAWindowThatHadNone)
+{
+    const auto board
+        = m_penwick.createDrawingWindowController(WindowType::imageAnnotation, primary());
+    Window &bar = *board->tPanelWindowController()->window();
+    board->showWindow(nullptr);
+    board->windowDidMove(); // somebody has pulled it elsewhere
+
+    board->drawingWindow()->close();
+    board->showWindow(nullptr);
+
+    EXPECT_FALSE(bar.isVisible());
+}
+
 TEST_F(DrawingWindowToolBar, isClosedBeforeTheEndIsTold)
 {
     show();

@@ -9,8 +9,8 @@
 
 #include "appearance/PenwickBundle.h"
 
-#include <QElapsedTimer>
 #include <QTest>
+#include <QTimer>
 
 #include <memory>
 
@@ -62,7 +62,52 @@ TEST_F(ToolPanelWindow, newControllerHasNoPanel)
     const ToolPanelWindowController controller;
 
     EXPECT_EQ(controller.toolPanelWindow(), nullptr);
+    EXPECT_EQ(controller.popoverWindow(), nullptr);
     EXPECT_EQ(controller.window(), nullptr);
+}
+
+TEST_F(ToolPanelWindow, controllerOfAWindowFromElsewhereHasNothingElse)
+{
+    auto window = std::make_unique<Window>();
+    const Window *const taken = window.get();
+
+    const ToolPanelWindowController controller(std::move(window));
+
+    EXPECT_EQ(controller.window(), taken);
+    EXPECT_EQ(taken->windowController(), &controller);
+    EXPECT_EQ(taken->delegate(), nullptr) << "it was not loaded";
+    EXPECT_EQ(controller.toolPanelWindow(), nullptr);
+    EXPECT_EQ(controller.popoverWindow(), nullptr);
+}
+
+TEST_F(ToolPanelWindow, windowForThePopoverIsKeptAndLeftAlone)
+{
+    auto window = std::make_shared<Window>();
+    const std::weak_ptr<Window> kept = window;
+
+    m_controller.setPopoverWindow(std::move(window));
+
+    ASSERT_FALSE(kept.expired());
+    EXPECT_EQ(m_controller.popoverWindow(), kept.lock());
+    EXPECT_NE(m_controller.popoverWindow().get(), m_controller.content().popoverW());
+    m_controller.setPopoverWindow(nullptr);
+    EXPECT_TRUE(kept.expired());
+}
+
+TEST_F(ToolPanelWindow, panelIsWhatItsFourWordsSay)
+{
+    const Rect frame { 10, 20, 60, 400 };
+
+    const ToolBarPanelWindow panel(frame, 8U + 32768U, platform::BackingStore::Buffered, true);
+
+    EXPECT_EQ(panel.frame(), frame);
+    EXPECT_EQ(panel.attributes().styleMask, 8U + 32768U);
+    EXPECT_FALSE(panel.isVisible());
+}
+
+TEST_F(ToolPanelWindow, panelsDelegateIsItsController)
+{
+    EXPECT_EQ(m_panel.delegate(), &m_controller);
 }
 
 TEST_F(ToolPanelWindow, loadedPanelHasItsAttributes)
@@ -193,14 +238,28 @@ TEST_F(ToolPanelWindow, isAdjustedTwoTenthsOfASecondAfterTheButtonWasLetGo)
     show();
     m_panel.setFrameOrigin({ 100, 300 });
     QCoreApplication::processEvents();
-    QElapsedTimer sinceRelease;
-    sinceRelease.start();
 
     m_controller.mouseUp();
 
+    auto *const waiting = m_controller.findChild<QTimer *>();
+    ASSERT_NE(waiting, nullptr);
+    EXPECT_EQ(waiting->interval(), 200);
+    EXPECT_TRUE(waiting->isSingleShot());
     EXPECT_EQ(m_panel.frame().x, 100);
-    EXPECT_TRUE(QTest::qWaitFor([this] { return m_panel.frame().x == 343; }));
-    EXPECT_GE(sinceRelease.elapsed(), 190); // a coarse timer may come a twentieth early
+    QTimerEvent itsTime(waiting->timerId());
+    QCoreApplication::sendEvent(waiting, &itsTime);
+    EXPECT_EQ(m_panel.frame().x, 343);
+}
+
+TEST_F(ToolPanelWindow, everyReleaseIsAdjustedAfterAndNothingWaitsThen)
+{
+    show();
+    m_controller.mouseUp();
+    m_controller.mouseUp();
+
+    EXPECT_EQ(m_controller.findChildren<QTimer *>().size(), 2);
+
+    EXPECT_TRUE(QTest::qWaitFor([this] { return !m_controller.findChild<QTimer *>(); }));
 }
 
 TEST_F(ToolPanelWindow, controllerThatDiesBeforeItIsAdjustedIsLeftAlone)

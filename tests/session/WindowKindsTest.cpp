@@ -151,7 +151,7 @@ TEST_F(WindowKinds, bannerStandsInTheMiddleAndGoesAfterOneAndAHalfSeconds)
     EXPECT_EQ(banner.parentWindow(), controller.drawingWindow());
     EXPECT_TRUE(QTest::qWaitFor([&banner] { return !banner.isVisible(); }));
     EXPECT_GE(clock.elapsed(), 1400); // a coarse timer may come a little early
-    EXPECT_EQ(controller.sharingNotificationWindow(), &banner);
+    EXPECT_EQ(controller.sharingNotificationWindow().get(), &banner);
 }
 
 TEST_F(WindowKinds, bannerAskedForTwiceIsCentredAgain)

@@ -60,11 +60,21 @@ class PENWICK_EXPORT WindowDelegate
 {
 public:
     virtual ~WindowDelegate();
+    virtual void windowWillAppear() { } ///< asked to the screen, where it is not yet
     virtual void windowWillMove() { } ///< the user has begun to move it
     virtual void windowDidMove() { }
     virtual void windowDidResize() { } ///< before windowDidMove() where both changed
     virtual void windowDidResignMain() { } ///< another window of the desktop has taken over
     virtual void windowWillClose() { }
+};
+
+/// How the pixels of a window are kept, with the values that the word has elsewhere. The toolkit
+/// buffers every window, whatever is asked.
+enum class BackingStore
+{
+    Retained = 0,
+    Nonretained = 1,
+    Buffered = 2
 };
 
 enum class Animate
@@ -83,6 +93,9 @@ class PENWICK_EXPORT Window : public QWidget
 
 public:
     explicit Window(QWidget *parent = nullptr);
+    /// A window of `styleMask` whose frame is `contentRect`; a title bar takes its room from it.
+    /// `backing` and `defer` change nothing: the desktop has the window from its first showing on.
+    Window(const Rect &contentRect, unsigned styleMask, BackingStore backing, bool defer);
     ~Window() override;
 
     // Frame
@@ -135,6 +148,7 @@ public:
     [[nodiscard]] QImage contentImage() const;
     [[nodiscard]] WindowController *windowController() const;
     void setWindowController(WindowController *controller);
+    [[nodiscard]] WindowDelegate *delegate() const; ///< null without one, or once it is gone
     void setDelegate(WindowDelegate *delegate); ///< weak
 
     // Responders

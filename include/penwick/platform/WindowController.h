@@ -21,6 +21,8 @@ class PENWICK_EXPORT WindowController : public QObject
 
 public:
     WindowController();
+    /// Takes `window`, which did not come from a scene: windowDidLoad() is not run. Null: none.
+    explicit WindowController(std::unique_ptr<Window> window);
     ~WindowController() override;
 
     /// The window; null before it was loaded.

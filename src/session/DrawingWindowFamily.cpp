@@ -1,0 +1,176 @@
+// SPDX-License-Identifier: MIT
+// How a drawing window and the windows that stand above it, tool bar, popover and banner, live
+// together.
+#include <penwick/DrawingWindowController.h>
+
+#include "canvas/DrawingCanvasView.h"
+#include "platform/OneShotTimer.h"
+#include "platform/foundation/FatalError.h"
+#include "platform/foundation/StandardOutput.h"
+#include "session/ToolPanelWindowController.h"
+#include "toolpanel/ToolPanelButton.h"
+#include "toolpanel/ToolPanelViewController.h"
+
+#include <penwick/Penwick.h>
+#include <penwick/platform/NotificationCenter.h>
+
+namespace penwick {
+
+namespace {
+
+using platform::require;
+
+constexpr int bannerTime = 1500; // ms
+constexpr double toolBarInset = 20.0; // points, from the drawing window's left edge
+constexpr auto missingToolBar = "Warning: ToolPanelWindowController not created!";
+
+} // namespace
+
+// The tool bar
+
+void DrawingWindowController::placeToolBar()
+{
+    if (!m_tPanelWindowController) {
+        platform::printLine(missingToolBar);
+        return;
+    }
+    platform::Window *const panel = m_tPanelWindowController->window();
+    if (!panel)
+        return;
+    setWindowPositionRelativeToMainWindow(
+        *panel, toolBarInset, m_drawingWindow->frame().height * 0.5 - panel->frame().height * 0.5);
+    platform::WindowAttributes attributes = panel->attributes();
+    attributes.hasShadow = true;
+    panel->setAttributes(attributes);
+    m_tPanelWindowController->keepEndInReach();
+    m_tPanelWindowController->showWindow(this);
+    m_isToolBarPlaced = true;
+}
+
+// Undo and redo are what they were, though a tool bar that appears has neither: the drawing is
+// still there.
+void DrawingWindowController::reopenToolBar()
+{
+    ToolPanelViewController &bar = m_tPanelWindowController->content();
+    ToolPanelButton &undo = *bar.button(QStringLiteral("undo"));
+    ToolPanelButton &redo = *bar.button(QStringLiteral("redo"));
+    const bool canUndo = undo.isEnabled();
+    const bool canRedo = redo.isEnabled();
+    m_tPanelWindowController->showWindow(this);
+    undo.setEnabled(canUndo);
+    redo.setEnabled(canRedo);
+}
+
+void DrawingWindowController::setWindowPositionRelativeToMainWindow(
+    platform::Window &window, double xoffset, double yOffset)
+{
+    if (!m_drawingWindowOrigin)
+        platform::fatalError("the drawing window has not been placed");
+    window.setFrameOrigin(*m_drawingWindowOrigin + platform::Point { xoffset, yOffset });
+}
+
+// The banner
+
+void DrawingWindowController::setNotificationWindowProperties(platform::Window &window)
+{
+    platform::WindowAttributes attributes = window.attributes();
+    attributes.isOpaque = false;
+    attributes.sharingType = 0;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.backgroundColor = Qt::transparent;
+    window.setAttributes(attributes);
+}
+
+void DrawingWindowController::centreBanner()
+{
+    const platform::Size drawing = m_drawingWindow->frame().size();
+    const platform::Size banner = m_sharingNotificationWindow->frame().size();
+    setWindowPositionRelativeToMainWindow(*m_sharingNotificationWindow,
+        drawing.width * 0.5 - banner.width * 0.5, drawing.height * 0.5 - banner.height * 0.5);
+}
+
+void DrawingWindowController::showSharingNotificationWindow()
+{
+    if (!m_sharingNotificationWindow)
+        return;
+    require(m_drawingWindow.data(), "the drawing window is gone");
+    centreBanner();
+    m_drawingWindow->addChildWindow(*m_sharingNotificationWindow);
+    m_sharingNotificationWindow->orderFront(); // at once, or as soon as the drawing window is there
+    platform::callLater(
+        *this, bannerTime, &DrawingWindowController::closeSharingNotificationWindow);
+}
+
+void DrawingWindowController::closeSharingNotificationWindow()
+{
+    if (!m_sharingNotificationWindow)
+        return;
+    m_sharingNotificationWindow->orderOut();
+    m_sharingNotificationWindow->close();
+}
+
+// Appearing, moving, resizing, closing
+
+void DrawingWindowController::windowWillAppear()
+{
+    if (m_isToolBarPlaced && m_tPanelWindowController && m_tPanelWindowController->window())
+        reopenToolBar();
+}
+
+void DrawingWindowController::windowDidMove()
+{
+    if (m_drawingWindow)
+        m_drawingWindowOrigin = m_drawingWindow->frame().origin();
+    if (m_tPanelWindowController)
+        m_tPanelWindowController->keepEndInReach(); // it has followed
+}
+
+void DrawingWindowController::windowDidResize()
+{
+    platform::Window *const panel
+        = m_tPanelWindowController ? m_tPanelWindowController->window() : nullptr;
+    if (!panel) {
+        platform::printLine(missingToolBar);
+        return;
+    }
+    if (!m_drawingWindowOrigin || !m_drawingWindow)
+        return;
+    const platform::Point origin = m_drawingWindow->frame().origin();
+    panel->setFrameOrigin(panel->frame().origin() + (origin - *m_drawingWindowOrigin));
+    m_tPanelWindowController->adjustPosition();
+    m_drawingWindowOrigin = origin;
+}
+
+void DrawingWindowController::windowWillMove()
+{
+    hideThePopover();
+}
+
+void DrawingWindowController::windowDidResignMain()
+{
+    hideThePopover();
+}
+
+void DrawingWindowController::hideThePopover()
+{
+    if (!m_drawingWindow)
+        return;
+    auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView());
+    if (canvas && canvas->popoverWindow())
+        canvas->popoverWindow()->orderOut();
+}
+
+bool DrawingWindowController::keyDown(const QKeyEvent &event)
+{
+    return m_tPanelWindowController && m_tPanelWindowController->content().performKey(event);
+}
+
+void DrawingWindowController::windowWillClose()
+{
+    if (m_tPanelWindowController && m_tPanelWindowController->toolPanelWindow())
+        m_tPanelWindowController->toolPanelWindow()->close();
+    platform::NotificationCenter::defaultCenter().postNotification(
+        penwickSessionEndNotificationKey(), m_windowType == WindowType::imageAnnotation);
+}
+
+} // namespace penwick
