@@ -8,6 +8,8 @@ build=build/release
 # ON where the sources are changed, and in continuous integration; see build_release.
 warnings_as_errors=${PENWICK_WARNINGS_AS_ERRORS:-OFF}
 
+log=build/log.txt
+
 say() {
     printf '==> %s\n' "$*"
 }
@@ -19,7 +21,6 @@ fail() {
 
 # Runs a command that says much: what it said is shown only if it fails.
 quietly() {
-    local log=build/log.txt
     "$@" >"$log" 2>&1 || {
         tail -n 60 "$log" >&2
         fail "this failed: $*"
@@ -69,10 +70,30 @@ missing_elsewhere() {
     done < <(needed) | paste -sd ' '
 }
 
+# Sets as_root to what goes before a command that only root may run.
+become_root() { # why that is necessary
+    as_root=()
+    ((EUID != 0)) || return 0
+    command -v sudo >/dev/null || fail "$1, and there is neither root nor sudo"
+    as_root=(sudo)
+}
+
+# By itself apt-get takes a network that is down for success.
+refresh_package_lists() {
+    quietly "${as_root[@]}" apt-get -o APT::Update::Error-Mode=any update
+}
+
+install_packages() {
+    become_root "these packages are missing: $*"
+    say "Installing $* (a minute or two)"
+    refresh_package_lists
+    quietly "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
+        apt-get install -y --no-install-recommends "$@"
+}
+
 install_what_is_missing() {
     say "Looking for what is needed"
     local missing
-    local -a as_root=()
     if ! is_debian; then
         missing=$(missing_elsewhere)
         [[ -z $missing ]] ||
@@ -80,18 +101,8 @@ install_what_is_missing() {
         return
     fi
     missing=$(missing_on_debian)
-    [[ -n $missing ]] || return 0
-    if ((EUID != 0)); then
-        command -v sudo >/dev/null ||
-            fail "these packages are missing, and there is neither root nor sudo to install them: $missing"
-        as_root=(sudo)
-    fi
-    say "Installing $missing (a minute or two)"
-    # By itself it takes a network that is down for success.
-    quietly "${as_root[@]}" apt-get -o APT::Update::Error-Mode=any update
     # shellcheck disable=SC2086
-    quietly "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
-        apt-get install -y --no-install-recommends $missing
+    [[ -z $missing ]] || install_packages $missing
 }
 
 # Whether what was configured is what is asked for now: a change of the presets, or of the switch
