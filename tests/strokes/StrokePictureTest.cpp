@@ -10,6 +10,10 @@
 
 #include <QImage>
 
+#include <optional>
+#include <string>
+#include <vector>
+
 namespace penwick::test {
 namespace {
 
@@ -28,6 +32,66 @@ QImage shownBy(const StrokePicture &picture, QSize size)
     if (picture.pixels().area().isEmpty())
         return PixelLayer(size).image();
     return picture.pixels().image().copy(picture.pixels().inImage({ QPoint(), size }));
+}
+
+/// A horizontal stroke, of the colour before it if it has none.
+StrokeEntry coloredLineAt(double y, const std::optional<QColor> &color)
+{
+    StrokeEntry stroke = lineAt(y);
+    stroke.bPathParams.pathColor = color;
+    return stroke;
+}
+
+EntryList<StrokeEntry> listOf(const std::vector<StrokeEntry> &strokes)
+{
+    EntryList<StrokeEntry> list;
+    for (const StrokeEntry &stroke : strokes)
+        list.append(stroke);
+    return list;
+}
+
+/// What the middle of a line at `y` shows after `before` was painted and then gave way to `after`.
+std::string colorAt(
+    int y, const std::vector<StrokeEntry> &before, const std::vector<StrokeEntry> &after)
+{
+    StrokePicture picture;
+    for (const auto &strokes : { before, after }) {
+        picture.follow(listOf(strokes));
+        picture.update({ 100, 70 }, 1.0);
+    }
+    const PixelLayer &pixels = picture.pixels();
+    const QRect place = pixels.inImage({ 30, y, 1, 1 });
+    return pixels.image().pixelColor(place.topLeft()).name().toStdString();
+}
+
+TEST(StrokePicture, olderStrokeWithoutAColourTakesAnotherWhenTheOneBeforeItGoes)
+{
+    const StrokeEntry green = coloredLineAt(10, Qt::green);
+    const StrokeEntry red = coloredLineAt(20, Qt::red);
+    const StrokeEntry plain = coloredLineAt(40, std::nullopt);
+    const StrokeEntry newest = coloredLineAt(60, Qt::blue);
+
+    EXPECT_EQ(colorAt(40, { green, red, plain, newest }, { green, red, plain, newest }), "#ff0000");
+    EXPECT_EQ(colorAt(40, { green, red, plain, newest }, { green, plain, newest }), "#00ff00");
+    EXPECT_EQ(colorAt(40, { red, plain, newest }, { plain, newest }), "#000000");
+}
+
+TEST(StrokePicture, olderStrokeWithoutAColourTakesTheOneThatComesBackBeforeIt)
+{
+    const StrokeEntry red = coloredLineAt(20, Qt::red);
+    const StrokeEntry plain = coloredLineAt(40, std::nullopt);
+    const StrokeEntry newest = coloredLineAt(60, Qt::blue);
+
+    EXPECT_EQ(colorAt(40, { plain, newest }, { red, plain, newest }), "#ff0000");
+}
+
+TEST(StrokePicture, newestStrokeWithoutAColourTakesAnotherWhenTheOneBeforeItGoes)
+{
+    const StrokeEntry red = coloredLineAt(20, Qt::red);
+    const StrokeEntry plain = coloredLineAt(40, std::nullopt);
+
+    EXPECT_EQ(colorAt(40, { red, plain }, { plain }), "#000000");
+    EXPECT_EQ(colorAt(40, { plain }, { red, plain }), "#ff0000");
 }
 
 TEST(StrokePicture, pictureOfNothingHasNoPixelsAndKeepsNone)
