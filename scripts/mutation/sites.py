@@ -42,7 +42,7 @@ class Site:
 
 class SourceFile:
     def __init__(self, path, flags):
-        self.path, self.flags = path, flags
+        self.path, self.flags, self.unit = path, flags, None
         self.source = self._with_changeable_constants(path.read_bytes())
         self.sites = {}
         unit = self._parse(self.source)
@@ -126,10 +126,18 @@ class SourceFile:
     def _parse(self, text):
         unsaved = [('/penwick_mutant/penwick_mutant.h', 'bool penwick_mutant(int);\n'),
                    (str(self.path), text.decode())]
-        return Index.create().parse(
-            str(self.path),
-            args=self.flags + ['-I/penwick_mutant', '-Wno-everything', '-ferror-limit=0'],
-            unsaved_files=unsaved, options=TranslationUnit.PARSE_NONE)
+        # What the file includes is read once, and not each time that the file itself is read anew.
+        if self.unit:
+            self.unit.reparse(unsaved)
+        else:
+            self.unit = Index.create().parse(
+                str(self.path),
+                args=self.flags + ['-I/penwick_mutant', '-Wno-everything', '-ferror-limit=0'],
+                unsaved_files=unsaved, options=TranslationUnit.PARSE_PRECOMPILED_PREAMBLE)
+        return self.unit
+
+    def __getstate__(self):
+        return {**self.__dict__, 'unit': None}
 
     @staticmethod
     def _errors(unit):
