@@ -5,6 +5,7 @@
 #include "appearance/Theme.h"
 #include "platform/ViewOf.h"
 
+#include <QTest>
 #include <QWidget>
 
 #include <gtest/gtest.h>
@@ -13,9 +14,19 @@ namespace penwick {
 
 namespace {
 
-/// Any view.
+/// Any view; counts how often it is painted.
 class PlainView final : public platform::ViewOf<QWidget>
-{ };
+{
+public:
+    int paints = 0;
+
+protected:
+    void paintEvent(QPaintEvent *event) override
+    {
+        ++paints;
+        ViewOf<QWidget>::paintEvent(event);
+    }
+};
 
 } // namespace
 
@@ -30,6 +41,20 @@ TEST(ViewBorder, layerTakesColourWidthAndRadius)
     EXPECT_EQ(view.layer()->borderWidth, 3.0);
     EXPECT_EQ(view.layer()->cornerRadius, 1.5);
     EXPECT_EQ(view.layer()->backgroundColor, QColor(Qt::transparent));
+}
+
+TEST(ViewBorder, borderIsShownAtOnce)
+{
+    PlainView view;
+    view.setWantsLayer(true);
+    view.show();
+    ASSERT_TRUE(QTest::qWaitFor([&view] { return view.paints > 0; }));
+    QCoreApplication::processEvents();
+    const int before = view.paints;
+
+    setViewBorder(view, TnhColors::borderGreenColor, 3.0, 1.5);
+
+    EXPECT_TRUE(QTest::qWaitFor([&view, before] { return view.paints > before; }));
 }
 
 TEST(ViewBorder, viewWithoutALayerStaysAsItIs)
