@@ -35,7 +35,8 @@ void prepareScreen(QTemporaryFile &file, int scale)
 {
     const QByteArray width = QByteArray::number(1920 * scale);
     const QByteArray height = QByteArray::number(1080 * scale);
-    file.open();
+    if (!file.open())
+        qFatal("there is no place for a temporary file");
     file.write(R"({"screens": [{"name": "screen", "x": 0, "y": 0, "width": )" + width
         + R"(, "height": )" + height + R"(, "logicalDpi": 96, "logicalBaseDpi": 96, "dpr": 1}]})");
     file.flush();
