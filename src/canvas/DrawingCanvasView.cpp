@@ -3,8 +3,14 @@
 
 #include "appearance/Theme.h"
 #include "canvas/DrawingCanvasModel.h"
+#include "canvas/ToolSelectionDelegate.h"
 #include "platform/foundation/FatalError.h"
 #include "textbox/TnTextBox.h"
+
+#include <QGuiApplication>
+#include <QStyleHints>
+
+#include <utility>
 
 namespace penwick {
 
@@ -61,6 +67,12 @@ void DrawingCanvasView::setTextBoxArray(const EntryList<TextBoxEntry> &boxes)
     m_textBoxArray = boxes;
 }
 
+void DrawingCanvasView::setLastSelecedTool(const QString &tool)
+{
+    m_lastSelecedTool = tool;
+    m_toolBeforeEraserEnd.clear(); // somebody has chosen
+}
+
 DrawingCanvasDelegate *DrawingCanvasView::drawingCanvasDelegate() const
 {
     return m_drawingCanvasDelegate.get();
@@ -81,9 +93,38 @@ DrawingCanvasModel &DrawingCanvasView::model() const
     return *require(controller().drawingCanvasModel(), "the canvas's controller has no model");
 }
 
+// With the text tool a click that trembles would else end the editing and begin a new box at once.
+double DrawingCanvasView::dragDistance() const
+{
+    return m_currentSelectedTool == Tools::text ? QGuiApplication::styleHints()->startDragDistance()
+                                                : 0.0;
+}
+
+// The toolkit tells the application alone which end comes near; here the press tells.
+void DrawingCanvasView::followPenEnd(platform::PenEnd end)
+{
+    if (end == platform::PenEnd::Tip && !m_toolBeforeEraserEnd.isEmpty()) {
+        chooseTool(std::exchange(m_toolBeforeEraserEnd, {}));
+    } else if (end == platform::PenEnd::Eraser && m_currentSelectedTool != Tools::eraser) {
+        const QString before = m_lastSelecedTool;
+        chooseTool(Tools::eraser);
+        m_toolBeforeEraserEnd = before;
+    }
+}
+
+void DrawingCanvasView::chooseTool(const QString &tool)
+{
+    if (ToolChooser *const chooser = m_toolChooser.get())
+        return chooser->chooseTool(tool);
+    if (auto *const selection
+        = dynamic_cast<ToolSelectionDelegate *>(m_drawingCanvasDelegate.get()))
+        selection->handleToolSelection(tool);
+}
+
 void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
 {
     platform::Window &ownWindow = *require(window(), "a canvas was pressed outside a window");
+    followPenEnd(event.penEnd);
     if (ownWindow.isKeyWindow() && m_popoverWindow) {
         m_popoverWindow->orderOut();
         m_currentSelectedTool = m_lastSelecedTool; // a colour that was not chosen is given up

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "canvas/DrawingCanvasDelegate.h"
+#include "canvas/ToolChooser.h"
 #include "history/CanvasContent.h"
 #include "platform/ViewOf.h"
 #include "platform/WeakReference.h"
@@ -57,7 +58,7 @@ public:
     void setCurrentSelectedTool(const QString &tool) { m_currentSelectedTool = tool; }
     /// The drawing tool that a momentary one gives way to again. The spelling is fixed.
     [[nodiscard]] const QString &lastSelecedTool() const { return m_lastSelecedTool; }
-    void setLastSelecedTool(const QString &tool) { m_lastSelecedTool = tool; }
+    void setLastSelecedTool(const QString &tool);
     /// The cursor over the whole canvas.
     [[nodiscard]] const platform::Cursor &cursorType() const { return m_cursorType; }
     void setCursorType(const platform::Cursor &cursor) { m_cursorType = cursor; }
@@ -76,18 +77,26 @@ public:
     /// The window in which the tool bar shows its options; null where there is none. Weak.
     [[nodiscard]] platform::Window *popoverWindow() const { return m_popoverWindow; }
     void setPopoverWindow(platform::Window *window) { m_popoverWindow = window; }
+    /// Who chooses the eraser when the eraser end of a pen is put down, and the tool before it
+    /// with the other end, unless another was chosen meanwhile; without one the controller does.
+    /// Weak.
+    void setToolChooser(ToolChooser *chooser) { m_toolChooser = chooser; }
     [[nodiscard]] DrawingCanvasDelegate *drawingCanvasDelegate() const;
     void setDrawingCanvasDelegate(DrawingCanvasDelegate *delegate);
 
     void mouseDown(const platform::MouseEvent &event) override;
     void mouseDragged(const platform::MouseEvent &event) override;
     void mouseUp(const platform::MouseEvent &event) override;
+    [[nodiscard]] double dragDistance() const override;
+    [[nodiscard]] bool takesPens() const override { return true; }
     void resetCursorRects() override;
     void draw(const platform::Rect &dirtyRect) override;
     /// The strokes, and under them the window's paper where this covers it.
     void drawContent(QPainter &painter) override;
 
 private:
+    void followPenEnd(platform::PenEnd end);
+    void chooseTool(const QString &tool);
     void beginStroke();
     void endStroke(platform::Point point);
     [[nodiscard]] bool isOver(platform::Point point) const;
@@ -115,6 +124,8 @@ private:
     QColor m_brushColor;
     QString m_currentSelectedTool;
     QString m_lastSelecedTool;
+    QString m_toolBeforeEraserEnd; // empty: the tool is not the pen's doing
+    platform::WeakReference<ToolChooser> m_toolChooser;
     platform::Cursor m_cursorType = platform::Cursor::arrow();
     std::shared_ptr<platform::View> m_textBoxView;
     QPointer<platform::Window> m_popoverWindow;

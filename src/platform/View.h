@@ -22,11 +22,20 @@ namespace penwick::platform {
 class PanGestureRecognizer;
 class Window;
 
-/// One press, drag, release or move of the left button's pointer.
+/// Which end of a pen a pointer is; none of a mouse or a finger.
+enum class PenEnd
+{
+    None,
+    Tip,
+    Eraser
+};
+
+/// One press, drag, release or move of the left button's pointer, or of a pen's end.
 struct MouseEvent
 {
     Point locationInWindow; ///< points from the bottom left corner of the window's content
     int clickCount = 0; ///< 1 for a click, 2 for the second of a double click
+    PenEnd penEnd = PenEnd::None;
 };
 
 /// One key going down or up.
@@ -109,6 +118,16 @@ public:
     void removeGestureRecognizer(PanGestureRecognizer &recognizer);
 
     // What classes override.
+
+    /// How far from its press the pointer has to go before that is a drag, in points along both
+    /// axes together; 0 makes one of every move. Asked at every move until it is one: the first
+    /// mouseDragged() is the move that got there, at its own place, and then every move is one,
+    /// back at the press too. Gestures have a distance of their own.
+    [[nodiscard]] virtual double dragDistance() const { return 0.0; }
+    /// Whether the view takes a pen's own events, which know fractions of a pixel. Else the toolkit
+    /// makes a mouse's of them. One that does has to override all of mouseDown(), mouseDragged()
+    /// and mouseUp().
+    [[nodiscard]] virtual bool takesPens() const { return false; }
 
     /// Paints the content; `dirtyRect` is in the view's own coordinates.
     virtual void draw(const Rect &dirtyRect) = 0;

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "platform/PanGestureRecognizer.h"
+#include "platform/PointerContact.h"
 #include "platform/PointerPress.h"
 #include "platform/View.h"
 
@@ -11,9 +12,9 @@
 #include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
+#include <QTabletEvent>
 
 #include <type_traits>
-#include <utility>
 
 namespace penwick::platform {
 
@@ -110,26 +111,34 @@ protected:
     {
         event->accept();
         m_mouseEvent = event;
+        if (event->buttons() == Qt::NoButton && m_contact.isBeliedBy(*event))
+            forgetPress();
         if (event->buttons() == Qt::NoButton)
             mouseMoved(translated(event, 0));
-        else if (m_isPressed && event->buttons().testFlag(Qt::LeftButton))
-            drag(translated(event, m_clickCount));
+        else if (m_contact.isContinuedBy(*event) && event->buttons().testFlag(Qt::LeftButton))
+            drag(translated(event, m_contact.clickCount()));
         m_mouseEvent = nullptr;
     }
 
     void mouseReleaseEvent(QMouseEvent *event) override
     {
         event->accept();
-        if (event->button() != Qt::LeftButton || !m_isPressed)
+        if (event->button() != Qt::LeftButton || !m_contact.isContinuedBy(*event))
             return;
-        m_isPressed = false;
         m_mouseEvent = event;
-        const MouseEvent release = translated(event, m_clickCount);
-        for (PanGestureRecognizer *const recognizer : gestureRecognizers())
-            recognizer->released(release.locationInWindow);
-        mouseUp(release);
+        endContact(translated(event, m_contact.clickCount()));
         m_mouseEvent = nullptr;
-        pointerWasReleased();
+    }
+
+    // A pen's events that are not taken come again as a mouse's.
+    void tabletEvent(QTabletEvent *event) override
+    {
+        if (!takesPens())
+            return Base::tabletEvent(event);
+        if (event->type() == QEvent::TabletPress)
+            event->setAccepted(pressPen(*event));
+        else
+            event->setAccepted(followPen(*event));
     }
 
     // A view that leaves the screen under the pointer hears of no release.
@@ -184,44 +193,79 @@ private:
     void press(QMouseEvent *event, int clickCount)
     {
         event->accept();
-        if (event->button() != Qt::LeftButton)
+        if (event->button() != Qt::LeftButton || m_contact.excludes(*event))
             return;
-        m_isPressed = true;
-        pointerWasPressed();
-        m_clickCount = clickCount;
         m_mouseEvent = event;
-        const MouseEvent press = translated(event, clickCount);
+        beginContact(*event, translated(event, clickCount));
+        m_mouseEvent = nullptr;
+    }
+
+    bool pressPen(const QTabletEvent &event)
+    {
+        if (m_contact.excludes(event))
+            return true; // or it would come again
+        const bool isOnSubview = surface().childAt(event.position().toPoint());
+        if (isOnSubview || !mayTakePress(event))
+            return false;
+        beginContact(event, translated(&event, 1));
+        return true;
+    }
+
+    bool followPen(const QTabletEvent &event)
+    {
+        if (!m_contact.isContinuedBy(event))
+            return false;
+        const MouseEvent translatedEvent = translated(&event, m_contact.clickCount());
+        if (event.type() == QEvent::TabletRelease && event.button() == Qt::LeftButton)
+            endContact(translatedEvent);
+        else if (event.buttons().testFlag(Qt::LeftButton))
+            drag(translatedEvent);
+        return true;
+    }
+
+    void beginContact(const QPointerEvent &event, const MouseEvent &press)
+    {
+        m_contact.begin(event, press.locationInWindow, press.clickCount);
+        pointerWasPressed();
         mouseDown(press);
         for (PanGestureRecognizer *const recognizer : gestureRecognizers())
             recognizer->pressed(press.locationInWindow);
-        m_mouseEvent = nullptr;
+    }
+
+    void endContact(const MouseEvent &release)
+    {
+        m_contact.end();
+        for (PanGestureRecognizer *const recognizer : gestureRecognizers())
+            recognizer->released(release.locationInWindow);
+        mouseUp(release);
+        pointerWasReleased();
     }
 
     void forgetPress()
     {
-        if (std::exchange(m_isPressed, false))
+        if (m_contact.end())
             pointerWasReleased();
     }
 
     void drag(const MouseEvent &event)
     {
-        mouseDragged(event);
+        if (m_contact.isDrag(event.locationInWindow, dragDistance()))
+            mouseDragged(event);
         for (PanGestureRecognizer *const recognizer : gestureRecognizers())
             recognizer->dragged(event.locationInWindow);
     }
 
-    [[nodiscard]] MouseEvent translated(const QMouseEvent *event, int clickCount) const
+    [[nodiscard]] MouseEvent translated(const QSinglePointEvent *event, int clickCount) const
     {
         const QPointF position = event->position();
-        return { locationInWindow(position.x(), position.y()), clickCount };
+        return { locationInWindow(position.x(), position.y()), clickCount, penEndOf(*event) };
     }
 
     // The event being handled, for the operations that a class leaves to Base.
     QPaintEvent *m_paintEvent = nullptr;
     QMouseEvent *m_mouseEvent = nullptr;
     QKeyEvent *m_keyEvent = nullptr;
-    bool m_isPressed = false;
-    int m_clickCount = 0;
+    PointerContact m_contact;
 };
 
 } // namespace penwick::platform

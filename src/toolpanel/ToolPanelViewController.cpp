@@ -160,6 +160,7 @@ void ToolPanelViewController::connectToDrawing()
     m_popoverVc->setToolPopoverDelegate(m_toolSelectionDelegate);
     m_popoverVc->setToolPanelOptionDelegate(this);
     canvas().setPopoverWindow(m_popoverW.get());
+    canvas().setToolChooser(this);
 }
 
 void ToolPanelViewController::paintPanel()
@@ -224,6 +225,12 @@ void ToolPanelViewController::OnToolBarItemSelection(platform::Button &sender)
     // Last: "state" ends the session, and with it this panel.
     if (m_toolSelectionDelegate)
         m_toolSelectionDelegate->handleToolSelection(m_selectedButtonId);
+}
+
+void ToolPanelViewController::chooseTool(const QString &tool)
+{
+    if (ToolPanelButton *const pressed = button(tool))
+        OnToolBarItemSelection(*pressed);
 }
 
 void ToolPanelViewController::showPopoverFor(const QString &identifier, const QString &toolBefore)

@@ -2,6 +2,7 @@
 // The controller of the tool bar's content.
 #pragma once
 
+#include "canvas/ToolChooser.h"
 #include "platform/ViewController.h"
 #include "toolpanel/PopoverChoice.h"
 #include "toolpanel/ToolPanelOptionDelegate.h"
@@ -49,7 +50,8 @@ struct ToolPanelOutlets
 /// Keeps the button of the canvas's tool selected, hands every press on to the drawing side, shows
 /// the popovers in a window of their own and enables undo and redo as the history says.
 class ToolPanelViewController final : public platform::ViewController,
-                                      public ToolPanelOptionDelegate
+                                      public ToolPanelOptionDelegate,
+                                      public ToolChooser
 {
     Q_OBJECT
 
@@ -78,6 +80,7 @@ public:
 
     /// The action of all eight buttons; a sender without identifier stops the process.
     void OnToolBarItemSelection(platform::Button &sender); // NOLINT: the name is fixed
+    void chooseTool(const QString &tool) override;
     /// Enables undo and redo as the notification's object says; any other object is ignored.
     void updateUndoRedoButtonState(const platform::Notification &notification);
     void changeColorToolImage(const QString &newColorState) override;

@@ -2,6 +2,8 @@
 // The eraser and the text tool under the pointer.
 #include "canvas/CanvasFixture.h"
 
+#include <QApplication>
+
 namespace penwick::test {
 namespace {
 
@@ -152,6 +154,50 @@ TEST_F(DrawingCanvasViewToolsTest, textClickWhileABoxIsEditedOnlyEndsTheEditing)
     click({ 20, 160 });
     EXPECT_EQ(model().textBoxArray().size(), 2);
     EXPECT_EQ(window.firstResponder(), model().textBoxArray().last().textBox.get());
+}
+
+TEST_F(DrawingCanvasViewToolsTest, textClickThatTremblesWhileABoxIsEditedOnlyEndsTheEditing)
+{
+    canvas->setCurrentSelectedTool(text);
+    writtenTextBox({ 20, 100 });
+    ASSERT_NE(window.firstResponder(), canvas);
+    const double almost = QApplication::startDragDistance() - 1;
+
+    press({ 20, 160 });
+    drag({ 21, 160 });
+    drag({ 20 + almost, 160 });
+    EXPECT_NE(window.firstResponder(), canvas); // it may still become a drag
+    release({ 20 + almost, 160 });
+
+    EXPECT_EQ(model().textBoxArray().size(), 1);
+    EXPECT_EQ(window.firstResponder(), canvas);
+}
+
+TEST_F(DrawingCanvasViewToolsTest, textDragEndsTheEditingAndItsReleasePlacesABox)
+{
+    canvas->setCurrentSelectedTool(text);
+    writtenTextBox({ 20, 100 });
+    const double enough = QApplication::startDragDistance();
+
+    press({ 20, 160 });
+    drag({ 20 + enough, 160 });
+    EXPECT_EQ(window.firstResponder(), canvas);
+    release({ 20 + enough, 160 });
+
+    ASSERT_EQ(model().textBoxArray().size(), 2);
+    EXPECT_EQ(
+        model().textBoxArray().last().textBox->frame().origin(), (Point { 20 + enough, 136 }));
+}
+
+TEST_F(DrawingCanvasViewToolsTest, eraserDragOfAPixelIsADrag)
+{
+    stroke({ { 20, 50 }, { 200, 50 } });
+    canvas->setCurrentSelectedTool(eraser);
+
+    press({ 100, 52 });
+    drag({ 100, 51 });
+
+    EXPECT_TRUE(model().pathArray().isEmpty());
 }
 
 TEST_F(DrawingCanvasViewToolsTest, textClickWhileNobodyIsFirstResponderOnlyMakesTheCanvasIt)

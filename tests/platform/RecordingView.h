@@ -29,6 +29,8 @@ public:
     {
         m_reaction = std::move(reaction);
     }
+    void setDragDistance(double distance) { m_dragDistance = distance; }
+    [[nodiscard]] double dragDistance() const override { return m_dragDistance; }
     void setKeepsFirstResponder(bool keeps) { m_keepsFirstResponder = keeps; }
 
     void draw(const Rect &) override { }
@@ -64,6 +66,7 @@ private:
     std::vector<std::string> m_log;
     std::function<void(const std::string &)> m_reaction;
     bool m_keepsFirstResponder = false;
+    double m_dragDistance = 0.0;
 };
 
 } // namespace penwick::platform

@@ -79,6 +79,36 @@ TEST_F(ViewEvent, moveWithoutAButtonIsAMove)
     EXPECT_EQ(m_content.take(), Log { "move 5,90 x0" });
 }
 
+TEST_F(ViewEvent, dragBeginsWithTheMoveThatGotFarEnoughAndThenGoesOnBackAtThePress)
+{
+    m_content.setDragDistance(10.0);
+
+    send(QEvent::MouseButtonPress, { 50, 50 }, left, left);
+    send(QEvent::MouseMove, { 55, 46 }, none, left); // five and four are nine
+    send(QEvent::MouseMove, { 44, 53 }, none, left);
+    send(QEvent::MouseMove, { 44, 54 }, none, left);
+    send(QEvent::MouseMove, { 51, 50 }, none, left);
+    send(QEvent::MouseButtonRelease, { 51, 50 }, left, none);
+
+    EXPECT_EQ(m_content.take(),
+        (Log { "down 50,50 x1", "drag 44,46 x1", "drag 51,50 x1", "up 51,50 x1" }));
+}
+
+TEST_F(ViewEvent, everyPressHasItsDragDistanceAhead)
+{
+    m_content.setDragDistance(10.0);
+    send(QEvent::MouseButtonPress, { 50, 50 }, left, left);
+    send(QEvent::MouseMove, { 80, 50 }, none, left);
+    send(QEvent::MouseButtonRelease, { 80, 50 }, left, none);
+    static_cast<void>(m_content.take());
+
+    send(QEvent::MouseButtonPress, { 80, 50 }, left, left);
+    send(QEvent::MouseMove, { 85, 50 }, none, left);
+    send(QEvent::MouseButtonRelease, { 85, 50 }, left, none);
+
+    EXPECT_EQ(m_content.take(), (Log { "down 80,50 x1", "up 85,50 x1" }));
+}
+
 TEST_F(ViewEvent, dragThatWasNotPressedHereIsNotDelivered)
 {
     const bool isAccepted = send(QEvent::MouseMove, { 5, 10 }, none, left);

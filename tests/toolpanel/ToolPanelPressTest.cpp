@@ -304,4 +304,21 @@ TEST_F(ToolPanelPress, samePopoverIsOnlyShownAgain)
     EXPECT_TRUE(isPopoverShown());
 }
 
+TEST_F(ToolPanelPress, eraserEndOfAPenOnTheCanvasIsShownAsAPressOnTheEraserUntilTheTipIsBack)
+{
+    press("text");
+    press("text"); // its popover
+    const auto putDown = [this](platform::PenEnd end) {
+        canvas().mouseDown({ { 50, 50 }, 1, end });
+        canvas().mouseUp({ { 50, 50 }, 1, end });
+        return Outcome { selected(), canvas().currentSelectedTool(), isPopoverShown() };
+    };
+
+    EXPECT_EQ(putDown(platform::PenEnd::Eraser), outcome("eraser", "eraser"));
+    EXPECT_EQ(bar.selectedButtonId(), QStringLiteral("eraser"));
+    EXPECT_EQ(putDown(platform::PenEnd::Eraser), outcome("eraser", "eraser"));
+    EXPECT_EQ(putDown(platform::PenEnd::Tip), outcome("text", "text")); // and no popover
+    EXPECT_EQ(putDown(platform::PenEnd::Tip), outcome("text", "text"));
+}
+
 } // namespace penwick::test
