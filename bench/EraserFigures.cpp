@@ -24,23 +24,29 @@ Figure missFigure()
     Board full(manyStrokes);
     Board empty(0);
     const auto places = freePlaces();
-    const auto missOn = [&places](Board &board) {
-        return [&places, &board](int number) {
+    std::size_t turn = 0;
+    const auto placeOfTurn = [&] { return places[turn % places.size()]; };
+    const auto missOn = [&placeOfTurn](Board &board) {
+        return [&placeOfTurn, &board](int) {
             for (int event = 0; event < eventsAtOnce; ++event) {
-                const int place = number * eventsAtOnce + event;
-                board.drag(places[static_cast<std::size_t>(place) % places.size()]);
+                board.drag(around(placeOfTurn(), event));
                 paintMarked();
             }
         };
     };
+    // The way from one place to the next would come upon strokes, so each has a press of its own.
+    const auto goOn = [&](Board &board) {
+        return [&turn, &placeOfTurn, &board] {
+            ++turn;
+            board.takePointer();
+            board.press(around(placeOfTurn(), 0));
+        };
+    };
     Turns turns;
-    const auto onFull = turns.add(
-        missOn(full), [&full] { full.takePointer(); }, eventsAtOnce);
-    const auto onEmpty = turns.add(
-        missOn(empty), [&empty] { empty.takePointer(); }, eventsAtOnce);
+    const auto onFull = turns.add(missOn(full), goOn(full), eventsAtOnce);
+    const auto onEmpty = turns.add(missOn(empty), goOn(empty), eventsAtOnce);
     for (Board *const board : { &full, &empty }) {
         board->choose(QStringLiteral("eraser"));
-        board->press(places.front());
     }
     settle();
     turns.take(rounds);

@@ -40,18 +40,17 @@ double dragTime(Board &board, Pen &pen)
 double missTime(Board &board)
 {
     const auto places = freePlaces();
+    std::size_t turn = 0;
     Turns turns;
     turns.add(
-        [&](int number) {
+        [&](int) {
             for (int event = 0; event < missesAtOnce; ++event) {
-                const int place = number * missesAtOnce + event;
-                board.drag(places[static_cast<std::size_t>(place) % places.size()]);
+                board.drag(around(places[turn % places.size()], event));
                 paintMarked();
             }
         },
-        {}, missesAtOnce);
+        [&] { board.press(around(places[++turn % places.size()], 0)); }, missesAtOnce);
     board.choose(QStringLiteral("eraser"));
-    board.press(places.front());
     settle();
     turns.take(100);
     return turns.of(0).cpu();

@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <iterator>
 
 namespace penwick::bench {
 
@@ -67,6 +68,14 @@ std::vector<Point> freePlaces()
             places.push_back({ middle(column), middle(row) });
     }
     return places;
+}
+
+Point around(Point freePlace, int number)
+{
+    constexpr double radius = 5.0;
+    constexpr Point steps[] { { radius, 0.0 }, { 0.0, radius }, { -radius, 0.0 },
+        { 0.0, -radius } };
+    return freePlace + steps[static_cast<std::size_t>(number) % std::size(steps)];
 }
 
 void scribble(DrawingCanvasModel &model, Pen &pen, int strokes, int segments)

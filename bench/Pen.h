@@ -45,6 +45,10 @@ private:
 /// Places on which a pen that writes with strokes of ordinary thickness leaves nothing.
 [[nodiscard]] std::vector<platform::Point> freePlaces();
 
+/// Where a pointer goes with its event `number` that moves around `freePlace`, seven points from
+/// one event to the next, and comes upon nothing.
+[[nodiscard]] platform::Point around(platform::Point freePlace, int number);
+
 /// Draws strokes of so many segments into `model`.
 void scribble(DrawingCanvasModel &model, Pen &pen, int strokes, int segments = segmentsOfAStroke);
 

@@ -97,6 +97,13 @@ bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLo
     return true;
 }
 
+std::vector<platform::Point> DrawingCanvasModel::strokesMetBetween(
+    platform::Point from, platform::Point to)
+{
+    m_strokeIndex.follow(pathArray());
+    return m_strokeIndex.meetingPoints({ from, to });
+}
+
 void DrawingCanvasModel::createTextBox(
     platform::Point textBoxLocation, const QColor &fontColor, double fontSize, QObject *delegate)
 {

@@ -124,6 +124,7 @@ void DrawingCanvasView::chooseTool(const QString &tool)
 void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
 {
     platform::Window &ownWindow = *require(window(), "a canvas was pressed outside a window");
+    m_eraserPlace = convertTo(event.locationInWindow, nullptr);
     followPenEnd(event.penEnd);
     if (ownWindow.isKeyWindow() && m_popoverWindow) {
         m_popoverWindow->orderOut();
@@ -154,9 +155,32 @@ bool DrawingCanvasView::isOver(Point point) const
 
 void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
 {
+    const Point point = convertFrom(event.locationInWindow, this);
+    if (m_currentSelectedTool == Tools::eraser)
+        dragEraserAcross(point);
+    dragTo(point);
+}
+
+// However fast the eraser is, each stroke on its way gets an event of its own. Strokes that the
+// events took are not there to be met again; what is left was nearer to the edge than can be told.
+void DrawingCanvasView::dragEraserAcross(Point point)
+{
+    const Point from = std::exchange(m_eraserPlace, point).value_or(point);
+    int strokesLeft = -1;
+    for (;;) {
+        const std::vector<Point> met = model().strokesMetBetween(from, point);
+        if (met.empty() || model().pathArray().size() == strokesLeft)
+            return;
+        strokesLeft = model().pathArray().size();
+        for (const Point &place : met)
+            dragTo(place);
+    }
+}
+
+void DrawingCanvasView::dragTo(Point point)
+{
     if (window())
         window()->makeFirstResponder(this);
-    const Point point = convertFrom(event.locationInWindow, this);
     if (isOver(point) && !(platform::Cursor::currentCursor() == m_cursorType))
         m_cursorType.set(*this);
     if (m_currentSelectedTool == Tools::brush) {
@@ -186,11 +210,13 @@ void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
     if (m_currentSelectedTool == Tools::brush) {
         endStroke(point);
     } else if (m_currentSelectedTool == Tools::eraser) {
+        dragEraserAcross(point);
         eraseAt(point);
         setNeedsDisplay();
     } else if (m_currentSelectedTool == Tools::text) {
         placeTextBox(point);
     }
+    m_eraserPlace.reset();
 }
 
 void DrawingCanvasView::endStroke(Point point)

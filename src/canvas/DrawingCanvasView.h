@@ -15,6 +15,8 @@
 #include <QPointer>
 #include <QWidget>
 
+#include <optional>
+
 namespace penwick {
 
 /// Turns the pointer into canvas operations, as the current tool says, and shows the strokes and
@@ -100,6 +102,8 @@ private:
     void beginStroke();
     void endStroke(platform::Point point);
     [[nodiscard]] bool isOver(platform::Point point) const;
+    void dragTo(platform::Point point);
+    void dragEraserAcross(platform::Point point);
     void eraseAt(platform::Point point);
     void placeTextBox(platform::Point point);
     [[nodiscard]] DrawingCanvasDelegate &controller() const;
@@ -124,6 +128,7 @@ private:
     QColor m_brushColor;
     QString m_currentSelectedTool;
     QString m_lastSelecedTool;
+    std::optional<platform::Point> m_eraserPlace; // where it was last, while it is held down
     QString m_toolBeforeEraserEnd; // empty: the tool is not the pen's doing
     platform::WeakReference<ToolChooser> m_toolChooser;
     platform::Cursor m_cursorType = platform::Cursor::arrow();

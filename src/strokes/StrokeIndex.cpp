@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <utility>
 
 namespace penwick {
 
@@ -28,6 +29,8 @@ using TreePoint = geometry::model::d2::point_xy<float>;
 using TreeBox = geometry::model::box<TreePoint>;
 
 constexpr std::size_t strokesOfANode = 16;
+constexpr double longestPiece = 64.0; // points
+constexpr double mostPieces = 1000.0; // however far a pointer claims to have gone
 
 // Rounded outwards: the tree may find a stroke too many, never one too few.
 float below(double value)
@@ -140,6 +143,37 @@ std::optional<int> StrokeIndex::oldestAt(Point point) const
             oldest = index;
     });
     return oldest;
+}
+
+// A long way has little in common with the one rectangle around it, so it is taken in pieces.
+std::vector<int> StrokeIndex::near(const Way &way) const
+{
+    const double wanted = std::ceil(way.length() / longestPiece);
+    const int pieces = static_cast<int>(std::clamp(wanted, 1.0, mostPieces));
+    std::vector<int> found;
+    for (int piece = 0; piece < pieces; ++piece) {
+        const auto end = [&](int number) { return way.at(static_cast<double>(number) / pieces); };
+        visit(Rect::spanning(end(piece), end(piece + 1)),
+            [&found](int index) { found.push_back(index); });
+    }
+    std::ranges::sort(found);
+    const auto repeated = std::ranges::unique(found);
+    found.erase(repeated.begin(), repeated.end());
+    return found;
+}
+
+std::vector<Point> StrokeIndex::meetingPoints(const Way &way) const
+{
+    std::vector<std::pair<double, int>> met; // part of the way, index
+    for (const int index : near(way)) {
+        if (const auto part = partThatMeets(way, *m_strokes[index].bPath))
+            met.emplace_back(*part, index);
+    }
+    std::ranges::sort(met);
+    std::vector<Point> points;
+    for (const auto &[part, index] : met)
+        points.push_back(way.at(part));
+    return points;
 }
 
 std::vector<int> StrokeIndex::touching(const Rect &area) const

@@ -4,6 +4,7 @@
 
 #include "history/CanvasContent.h"
 #include "history/EntryListChange.h"
+#include "strokes/StrokeCrossing.h"
 
 #include <penwick/platform/Geometry.h>
 
@@ -32,6 +33,9 @@ public:
 
     /// The index of the oldest stroke that `point` lies on.
     [[nodiscard]] std::optional<int> oldestAt(platform::Point point) const;
+    /// Where each stroke that is met on `way` is met first, in the order of the way; of strokes
+    /// that are met at once the oldest comes first. What is met only at the end is left out.
+    [[nodiscard]] std::vector<platform::Point> meetingPoints(const Way &way) const;
     /// The indices, oldest first, of the strokes whose bounds, thickness included, touch `area`.
     [[nodiscard]] std::vector<int> touching(const platform::Rect &area) const;
 
@@ -52,6 +56,7 @@ private:
     static Bounds boundsOf(const StrokeEntry &stroke);
     void insert(int from, int to);
     void remove(int from, int to);
+    [[nodiscard]] std::vector<int> near(const Way &way) const;
     template <class Visit>
     void visit(const platform::Rect &area, Visit visit) const;
 

@@ -6,10 +6,19 @@
 
 namespace penwick::sessions {
 
+namespace {
+
+constexpr double dragDistance = 10; // the toolkit's, where no desktop says otherwise
+
+} // namespace
+
 // The pointer on the canvas
 
 void PlainCanvas::press(Spot spot)
 {
+    m_pressedAt = spot;
+    m_cameFrom = spot;
+    m_isFar = false;
     if (currentTool != "brush")
         return;
     makeFirstResponder("canvas");
@@ -19,6 +28,10 @@ void PlainCanvas::press(Spot spot)
 
 void PlainCanvas::drag(Spot spot)
 {
+    m_isFar = m_isFar
+        || std::abs(spot.x - m_pressedAt.x) + std::abs(spot.y - m_pressedAt.y) >= dragDistance;
+    if (currentTool == "text" && !m_isFar)
+        return;
     makeFirstResponder("canvas");
     if (currentTool == "brush") {
         m_isDragged = true;
@@ -26,6 +39,7 @@ void PlainCanvas::drag(Spot spot)
         copyContent();
         m_start = spot;
     } else if (currentTool == "eraser") {
+        eraseUpTo(spot);
         erase(spot);
     }
 }
@@ -42,6 +56,7 @@ void PlainCanvas::release(Spot spot)
             m_isDragged = false;
         }
     } else if (currentTool == "eraser") {
+        eraseUpTo(spot);
         erase(spot);
     } else if (currentTool == "text") {
         placeBox(spot);
@@ -52,6 +67,13 @@ void PlainCanvas::erase(Spot spot)
 {
     if (m_drawing.eraseAt(spot))
         copyContent();
+}
+
+void PlainCanvas::eraseUpTo(Spot spot)
+{
+    for (const Spot &met : m_drawing.metBetween(m_cameFrom, spot))
+        erase(met);
+    m_cameFrom = spot;
 }
 
 void PlainCanvas::placeBox(Spot spot)
@@ -226,6 +248,7 @@ void PlainCanvas::showButton(const std::string &name)
 
 void PlainCanvas::paint()
 {
+    turn(); // what is painted is never without an earlier stroke
     for (const std::string &name : boxes)
         putOn(name);
     for (const std::string &view : std::vector(views)) {

@@ -86,12 +86,16 @@ private:
     void showButton(const std::string &name);
     void placeBox(Spot spot);
     void erase(Spot spot);
+    void eraseUpTo(Spot spot);
     void clear();
     [[nodiscard]] bool isOnCanvas(const std::string &view) const;
 
     PlainDrawing &m_drawing;
     std::string m_responder; // empty: the window itself
     Spot m_start;
+    Spot m_pressedAt; // on the canvas
+    Spot m_cameFrom; // the eraser
+    bool m_isFar = false; // from where the canvas was pressed; a click before
     bool m_isDragged = false;
     bool m_hasDropped = false;
     bool m_canPan = false; // of the box that is held down

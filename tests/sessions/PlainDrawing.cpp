@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 
 namespace penwick::sessions {
 
@@ -23,6 +24,61 @@ double distance(Spot from, const std::pair<Spot, Spot> &segment)
         ? 0.0
         : std::clamp(((from.x - a.x) * dx + (from.y - a.y) * dy) / square, 0.0, 1.0);
     return std::hypot(from.x - (a.x + along * dx), from.y - (a.y + along * dy));
+}
+
+Spot between(Spot from, Spot to, double part)
+{
+    return { from.x + (to.x - from.x) * part, from.y + (to.y - from.y) * part };
+}
+
+/// Where `value`, which falls up to `end`, reaches `wanted`.
+template <class Value>
+double halved(Value value, double wanted, double end)
+{
+    double begin = 0.0;
+    for (int step = 0; step < 60; ++step) {
+        const double middle = (begin + end) / 2;
+        (value(middle) > wanted ? begin : end) = middle;
+    }
+    return end;
+}
+
+/// Where `value`, which falls and then rises, is least from 0 to 1.
+template <class Value>
+double lowest(Value value)
+{
+    double begin = 0.0;
+    double end = 1.0;
+    for (int step = 0; step < 100; ++step) {
+        const double left = begin + (end - begin) / 3;
+        const double right = end - (end - begin) / 3;
+        (value(left) > value(right) ? begin : end) = value(left) > value(right) ? left : right;
+    }
+    return value(0.0) <= value(end) ? 0.0 : end;
+}
+
+/// Whether two pairs of places lie apart by more than `gap`, to the sides or up and down.
+bool areApart(const std::pair<Spot, Spot> &a, const std::pair<Spot, Spot> &b, double gap)
+{
+    const auto isApart = [gap](double a1, double a2, double b1, double b2) {
+        return std::max(a1, a2) + gap < std::min(b1, b2)
+            || std::max(b1, b2) + gap < std::min(a1, a2);
+    };
+    return isApart(a.first.x, a.second.x, b.first.x, b.second.x)
+        || isApart(a.first.y, a.second.y, b.first.y, b.second.y);
+}
+
+/// How far along the way a segment is met first; nothing where it is not.
+std::optional<double> partThatMeets(
+    Spot from, Spot to, const std::pair<Spot, Spot> &segment, double radius)
+{
+    if (areApart({ from, to }, segment, radius))
+        return std::nullopt;
+    const auto away = [&](double part) { return distance(between(from, to, part), segment); };
+    const double nearest = lowest(away);
+    if (away(nearest) > radius)
+        return std::nullopt;
+    return away(0.0) <= radius ? 0.0 : halved(away, radius, nearest);
 }
 
 } // namespace
@@ -111,6 +167,29 @@ bool PlainDrawing::eraseAt(Spot place)
     emptyRedo();
     m_strokes.erase(hit);
     return true;
+}
+
+std::vector<Spot> PlainDrawing::metBetween(Spot from, Spot to) const
+{
+    constexpr double behindTheEdge = 1e-6; // points, so that it surely is on it
+    const double length = std::hypot(to.x - from.x, to.y - from.y);
+    std::vector<double> parts;
+    for (const std::string &name : m_strokes) {
+        const Stroke &stroke = m_known.at(name);
+        std::optional<double> first;
+        for (const auto &segment : stroke.segments) {
+            const auto part = partThatMeets(from, to, segment, stroke.width / 2);
+            if (part && (!first || *part < *first))
+                first = part;
+        }
+        if (first && (1 - *first) * length > behindTheEdge)
+            parts.push_back(*first + behindTheEdge / length);
+    }
+    std::sort(parts.begin(), parts.end());
+    std::vector<Spot> places;
+    for (const double part : parts)
+        places.push_back(between(from, to, part));
+    return places;
 }
 
 std::string PlainDrawing::addBox()

@@ -47,6 +47,8 @@ public:
     void beginStroke(Spot start, double width);
     void extendStroke(Spot to);
     bool eraseAt(Spot place);
+    /// Where an eraser that goes straight on meets strokes before it arrives, in that order.
+    [[nodiscard]] std::vector<Spot> metBetween(Spot from, Spot to) const;
     std::string addBox(); ///< answers its name
     void deleteBox(const std::string &name);
     void clear();

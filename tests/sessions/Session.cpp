@@ -115,6 +115,8 @@ void Session::take(const Step &step)
         return dragText(step);
     case Kind::Menu:
         return workMenu(step);
+    case Kind::Tremble:
+        return tremble(step);
     default:
         takeWindowStep(step);
     }

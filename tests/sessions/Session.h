@@ -32,6 +32,7 @@ private:
     void pressText(const Step &step);
     void goTo(Spot spot);
     void drag(Spot spot);
+    void tremble(const Step &step);
     void release(Spot spot);
     void stroke(const Step &step);
     void otherButton(const Step &step);
@@ -67,6 +68,7 @@ private:
     std::unique_ptr<PlainBoard> m_plain;
     std::string m_grab; // where the buttons that are held down were pressed
     QPointF m_at; // the pointer, on the desktop
+    Spot m_spot; // and where it last pointed at
     bool m_isBannerShown = false;
     bool m_hasTitleBar = false;
     std::vector<std::string> m_said;

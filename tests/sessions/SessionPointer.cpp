@@ -62,6 +62,7 @@ void Session::press(Spot spot, int clicks)
     say("press " + m_grab + inWords(spot));
     m_real.press(spot);
     m_at = m_real.onDesktop(spot);
+    m_spot = spot;
     m_plain->press(m_grab, spot, 1);
     for (int click = 2; click <= clicks; ++click) {
         if (m_real.held() != Qt::LeftButton || isGrabLost())
@@ -109,6 +110,7 @@ void Session::goTo(Spot spot)
     if (place != m_at && m_plain->isHeld())
         m_plain->drag(spot);
     m_at = place;
+    m_spot = spot;
 }
 
 void Session::drag(Spot spot)
@@ -120,6 +122,12 @@ void Session::drag(Spot spot)
     say("move" + inWords(spot));
     m_real.move(spot);
     goTo(spot);
+}
+
+// Less or more than makes a drag of a press.
+void Session::tremble(const Step &step)
+{
+    drag({ m_spot.x + step.a % 15 - 7, m_spot.y + step.b % 11 - 5 });
 }
 
 void Session::release(Spot spot)

@@ -22,9 +22,9 @@ rc::Gen<Kind> formerKind()
 
 rc::Gen<Kind> newKind()
 {
-    return rc::gen::weightedElement<Kind>(
-        { { 10, Kind::PressText }, { 30, Kind::Edit }, { 10, Kind::Compose }, { 5, Kind::DragText },
-            { 12, Kind::Menu }, { 3, Kind::MoveWindow }, { 2, Kind::ResizeWindow } });
+    return rc::gen::weightedElement<Kind>({ { 10, Kind::PressText }, { 30, Kind::Edit },
+        { 10, Kind::Compose }, { 5, Kind::DragText }, { 12, Kind::Menu }, { 3, Kind::MoveWindow },
+        { 2, Kind::ResizeWindow }, { 10, Kind::Tremble } });
 }
 
 rc::Gen<Step> anyStep(Kinds kinds)

@@ -44,7 +44,8 @@ struct Step
         DragText, ///< from another application
         Menu, ///< of a box: opened by its key, or chosen from
         MoveWindow,
-        ResizeWindow
+        ResizeWindow,
+        Tremble ///< the pointer goes a few points on
     };
 
     Kind kind = Kind::Press;

@@ -9,6 +9,7 @@
 #include <rapidcheck/gtest.h>
 
 #include <algorithm>
+#include <utility>
 
 namespace penwick::test {
 namespace {
@@ -67,6 +68,65 @@ TEST(StrokeIndex, strokeThatIsNewestAgainMayGrowAgain)
     strokes.append(lineAt(70));
     index.follow(strokes);
     EXPECT_EQ(index.oldestAt({ 50, 80 }), 0);
+}
+
+TEST(StrokeIndex, meetingPointsAreInTheOrderOfTheWayAndOldestFirstWhereStrokesAreMetAtOnce)
+{
+    EntryList<StrokeEntry> strokes;
+    for (const double y : { 70.0, 30.0, 30.0, 95.0, 50.0 })
+        strokes.append(lineAt(y));
+    StrokeIndex index;
+    index.follow(strokes);
+
+    const std::vector<Point> up = index.meetingPoints({ { 20, 0 }, { 20, 93 } });
+
+    ASSERT_EQ(up.size(), 4U); // the one that ends the way is not on it
+    EXPECT_NEAR(up[0].y, 28, 1e-5);
+    EXPECT_EQ(up[1], up[0]);
+    EXPECT_NEAR(up[2].y, 48, 1e-5);
+    EXPECT_NEAR(up[3].y, 68, 1e-5);
+    EXPECT_EQ(index.oldestAt(up[0]), 1);
+    const std::vector<Point> down = index.meetingPoints({ { 20, 94 }, { 20, 49 } });
+    ASSERT_EQ(down.size(), 3U);
+    EXPECT_NEAR(down[0].y, 94, 1e-5); // there from the beginning
+    EXPECT_NEAR(down[1].y, 72, 1e-5);
+    EXPECT_NEAR(down[2].y, 52, 1e-5);
+}
+
+TEST(StrokeIndex, wayAcrossEverythingMeetsEachStrokeOnce)
+{
+    EntryList<StrokeEntry> strokes;
+    for (int number = 1; number <= 200; ++number)
+        strokes.append(lineAt(number * 10.0));
+    StrokeIndex index;
+    index.follow(strokes);
+
+    EXPECT_EQ(index.meetingPoints({ { 11, -100 }, { 49, 1e4 } }).size(), 200U);
+    EXPECT_EQ(index.meetingPoints({ { 30, -1e9 }, { 30, 1e9 } }).size(), 200U);
+    EXPECT_TRUE(index.meetingPoints({ { 60, -100 }, { 60, 1e4 } }).empty());
+}
+
+RC_GTEST_PROP(StrokeIndexProperties, meetsOnAWayWhatAskingEveryStrokeMeets, ())
+{
+    AnyDrawing drawing;
+    StrokeIndex index;
+    const int steps = *rc::gen::inRange(1, 80);
+    for (int step = 0; step < steps; ++step) {
+        drawing.change();
+        index.follow(drawing.strokes());
+
+        const Way way { anyPoint(), anyPoint() };
+        std::vector<std::pair<double, int>> met;
+        for (int stroke = 0; stroke < drawing.strokes().size(); ++stroke) {
+            if (const auto part = partThatMeets(way, *drawing.strokes()[stroke].bPath))
+                met.emplace_back(*part, stroke);
+        }
+        std::ranges::sort(met);
+        std::vector<Point> points;
+        for (const auto &[part, stroke] : met)
+            points.push_back(way.at(part));
+        RC_ASSERT(index.meetingPoints(way) == points);
+    }
 }
 
 RC_GTEST_PROP(StrokeIndexProperties, answersAsAskingEveryStrokeDoes, ())

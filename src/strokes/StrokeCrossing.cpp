@@ -1,0 +1,142 @@
+// SPDX-License-Identifier: MIT
+#include "strokes/StrokeCrossing.h"
+
+#include "strokes/StrokeHitTest.h"
+#include "strokes/StrokeLines.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+#include <vector>
+
+namespace penwick {
+
+namespace {
+
+using platform::Point;
+using platform::Rect;
+
+constexpr double surelyOnIt = 1e-6; // points behind the edge
+
+double dot(Point a, Point b)
+{
+    return a.x * b.x + a.y * b.y;
+}
+
+double cross(Point a, Point b)
+{
+    return a.x * b.y - a.y * b.x;
+}
+
+/// A part of a way; none of it at first, and wherever it ends before it begins.
+struct Span
+{
+    double begin = std::numeric_limits<double>::infinity();
+    double end = -std::numeric_limits<double>::infinity();
+
+    void include(const Span &other)
+    {
+        if (other.begin > other.end)
+            return;
+        begin = std::min(begin, other.begin);
+        end = std::max(end, other.end);
+    }
+};
+
+constexpr Span wholeWay { 0.0, 1.0 };
+
+/// Of `span`, where start + part * slope lies from `lowest` to `highest`.
+Span within(Span span, double start, double slope, double lowest, double highest)
+{
+    if (slope == 0.0)
+        return start < lowest || start > highest ? Span() : span;
+    const double first = (lowest - start) / slope;
+    const double second = (highest - start) / slope;
+    return { std::max(span.begin, std::min(first, second)),
+        std::min(span.end, std::max(first, second)) };
+}
+
+Span spanOnDisc(const Way &way, Point centre, double radius)
+{
+    const Point direction = way.to - way.from;
+    const Point start = way.from - centre;
+    const double square = dot(direction, direction);
+    const double toNearest = -dot(start, direction) / square;
+    const double away = cross(start, direction); // times the way's length
+    const double halfSquare = radius * radius * square - away * away;
+    if (halfSquare < 0.0)
+        return {};
+    const double half = std::sqrt(halfSquare) / square;
+    return { std::max(0.0, toNearest - half), std::min(1.0, toNearest + half) };
+}
+
+/// Where the way is at most `radius` from the line but beside neither of its ends.
+Span spanBesideLine(const Way &way, const StrokeLine &line, double radius)
+{
+    const Point lineDirection = line.to - line.from;
+    const double length = std::hypot(lineDirection.x, lineDirection.y);
+    if (length == 0.0)
+        return {};
+    const Point unit { lineDirection.x / length, lineDirection.y / length };
+    const Point direction = way.to - way.from;
+    const Point start = way.from - line.from;
+    const Span along = within(wholeWay, dot(start, unit), dot(direction, unit), 0.0, length);
+    return within(along, cross(unit, start), cross(unit, direction), -radius, radius);
+}
+
+/// A thick line with round ends is convex: what a way has of it is in one piece.
+Span spanOnLine(const Way &way, const StrokeLine &line, double radius)
+{
+    Span span;
+    span.include(spanBesideLine(way, line, radius));
+    span.include(spanOnDisc(way, line.from, radius));
+    span.include(spanOnDisc(way, line.to, radius));
+    return span;
+}
+
+bool isApart(const Rect &area, const StrokeLine &line)
+{
+    return std::max(line.from.x, line.to.x) < area.x
+        || std::min(line.from.x, line.to.x) > area.maxX()
+        || std::max(line.from.y, line.to.y) < area.y
+        || std::min(line.from.y, line.to.y) > area.maxY();
+}
+
+} // namespace
+
+double Way::length() const
+{
+    return std::hypot(to.x - from.x, to.y - from.y);
+}
+
+Point Way::at(double part) const
+{
+    return { from.x + (to.x - from.x) * part, from.y + (to.y - from.y) * part };
+}
+
+std::optional<double> partThatMeets(const Way &way, const platform::BezierPath &path)
+{
+    const double length = way.length();
+    if (length == 0.0 || path.lineWidth() <= 0.0)
+        return std::nullopt;
+    const double radius = path.lineWidth() / 2;
+    const Rect area = Rect::spanning(way.from, way.to).grownBy(radius);
+    std::vector<Span> spans;
+    visitLines(path, [&](const StrokeLine &line) {
+        const Span span = isApart(area, line) ? Span() : spanOnLine(way, line, radius);
+        if (span.begin < span.end && (1.0 - span.begin) * length > surelyOnIt)
+            spans.push_back(span);
+        return false;
+    });
+    std::ranges::sort(spans, {}, &Span::begin);
+    for (const Span &span : spans) {
+        const double middle = (span.begin + span.end) / 2;
+        for (const double part : { std::min(span.begin + surelyOnIt / length, middle), middle }) {
+            if (strokeContains(path, way.at(part)))
+                return part;
+        }
+    }
+    return std::nullopt;
+}
+
+} // namespace penwick
