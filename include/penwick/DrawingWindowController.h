@@ -25,7 +25,8 @@ class ToolPanelWindowController;
 /// Builds and places the drawing window and announces the end of the session when it closes.
 ///
 /// Penwick::createDrawingWindowController() makes it; the window lives as long as this object.
-/// GUI thread only.
+/// GUI thread only: anywhere else, and where there is no QApplication, its operations stop the
+/// process.
 class PENWICK_EXPORT DrawingWindowController final : public platform::WindowController,
                                                      public platform::WindowDelegate
 {

@@ -23,8 +23,9 @@ namespace penwick {
 
 /// The component's entry object. It holds the controller of the drawing window that it opened
 /// last, and with it the window: a second window replaces the first, and both leave the screen
-/// with this object unless the host holds their controllers. GUI thread only; needs a
-/// QApplication, of which it changes nothing.
+/// with this object unless the host holds their controllers. Needs a QApplication, of which it
+/// changes nothing. GUI thread only: on any other thread, and without a QApplication (one that has
+/// no widgets, as a QGuiApplication, is none), each operation stops the process.
 class PENWICK_EXPORT Penwick
 {
 public:
@@ -41,9 +42,10 @@ public:
     /// Builds and places a drawing window, which the host then shows with showWindow().
     ///
     /// `drawScreen` must not be null: a null screen stops the process. `annotatedImage` and
-    /// `windowTitle` are used by imageAnnotation windows only. Returns null, after printing "Not
-    /// able to create Penwick WindowController!" to standard output, where the component's
-    /// resources are damaged.
+    /// `windowTitle` are used by imageAnnotation windows only. One that is given no image, or a
+    /// null one, has no tool bar, and keeps the frame that it was loaded with. Returns null, after
+    /// printing "Not able to create Penwick WindowController!" to standard output, where the
+    /// component's resources are damaged.
     std::shared_ptr<DrawingWindowController> createDrawingWindowController(WindowType windowType,
         QScreen *drawScreen, const std::optional<QImage> &annotatedImage = std::nullopt,
         const std::optional<QString> &windowTitle = std::nullopt);

@@ -4,6 +4,7 @@
 #include <penwick/platform/Window.h>
 
 #include "platform/View.h"
+#include "platform/foundation/GuiThread.h"
 
 #include <QImage>
 #include <QPainter>
@@ -29,6 +30,7 @@ void View::paintContent(QPainter &painter)
 
 QImage Window::contentImage() const
 {
+    requireGuiThread();
     const double scale = devicePixelRatioF();
     QImage image((QSizeF(size()) * scale).toSize(), QImage::Format_ARGB32_Premultiplied);
     if (image.isNull())

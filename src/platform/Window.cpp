@@ -4,6 +4,7 @@
 #include "platform/View.h"
 #include "platform/WindowFlags.h"
 #include "platform/WindowPrivate.h"
+#include "platform/foundation/GuiThread.h"
 #include "platform/native/NativeDesktop.h"
 
 #include <QWindow>
@@ -12,10 +13,21 @@
 
 namespace penwick::platform {
 
+namespace {
+
+// Asked before the toolkit would end the process in words of its own.
+QWidget *checked(QWidget *parent)
+{
+    requireApplication();
+    return parent;
+}
+
+} // namespace
+
 WindowDelegate::~WindowDelegate() = default;
 
 Window::Window(QWidget *parent)
-    : QWidget(parent, Qt::Window)
+    : QWidget(checked(parent), Qt::Window)
     , d(std::make_unique<Private>(*this))
 {
     setAttribute(Qt::WA_QuitOnClose, false);
@@ -43,6 +55,7 @@ Window::Window(const Rect &contentRect, unsigned styleMask, BackingStore, bool)
 
 Window::~Window()
 {
+    requireGuiThreadAtEnd();
     // A view that goes down with the window has nobody left to resign to.
     m_firstResponder = nullptr;
     for (Window *const child : childWindows())
@@ -54,11 +67,13 @@ Window::~Window()
 
 Rect Window::frame() const
 {
+    requireGuiThread();
     return d->glide->target().value_or(d->tracker->frame());
 }
 
 void Window::setFrame(const Rect &frame, Animate animate)
 {
+    requireGuiThread();
     if (animate == Animate::Yes && isVisible() && !(frame == d->tracker->frame()))
         return d->glide->start(frame);
     d->glide->stop();
@@ -67,13 +82,21 @@ void Window::setFrame(const Rect &frame, Animate animate)
 
 void Window::setFrameOrigin(Point origin)
 {
+    requireGuiThread();
     setFrame({ origin.x, origin.y, frame().width, frame().height });
 }
 
 // Attributes
 
+const WindowAttributes &Window::attributes() const
+{
+    requireGuiThread();
+    return m_attributes;
+}
+
 void Window::setAttributes(const WindowAttributes &attributes)
 {
+    requireGuiThread();
     if (attributes == m_attributes)
         return;
     m_attributes = attributes;
@@ -98,8 +121,15 @@ void Window::applyAttributes()
 
 // Content
 
+View *Window::contentView() const
+{
+    requireGuiThread();
+    return m_contentView;
+}
+
 void Window::setContentView(View *view)
 {
+    requireGuiThread();
     if (view != m_contentView)
         releaseContentView();
     m_contentView = view;
@@ -125,11 +155,13 @@ void Window::releaseContentView()
 
 ViewController *Window::contentViewController() const
 {
+    requireGuiThread();
     return d->contentViewController.get();
 }
 
 void Window::setContentViewController(std::unique_ptr<ViewController> controller)
 {
+    requireGuiThread();
     d->contentViewController = std::move(controller);
     if (d->contentViewController) {
         d->contentViewController->setParent(this); // found by introspection
@@ -139,11 +171,13 @@ void Window::setContentViewController(std::unique_ptr<ViewController> controller
 
 WindowController *Window::windowController() const
 {
+    requireGuiThread();
     return d->windowController;
 }
 
 void Window::setWindowController(WindowController *controller)
 {
+    requireGuiThread();
     d->windowController = controller;
 }
 
@@ -155,17 +189,20 @@ void Window::tellDelegate(void (WindowDelegate::*what)())
 
 WindowDelegate *Window::delegate() const
 {
+    requireGuiThread();
     return m_delegateObject ? m_delegate : nullptr;
 }
 
 void Window::setDelegate(WindowDelegate *delegate)
 {
+    requireGuiThread();
     m_delegateObject = dynamic_cast<QObject *>(delegate);
     m_delegate = delegate;
 }
 
 void Window::adoptScene()
 {
+    requireGuiThread();
     d->tracker->request({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
     for (View *const view : topViews()) {
         view->adoptScene();
@@ -185,8 +222,21 @@ std::vector<View *> Window::topViews() const
 
 // Responders
 
+View *Window::firstResponder() const
+{
+    requireGuiThread();
+    return m_firstResponder;
+}
+
+bool Window::isKeyWindow() const
+{
+    requireGuiThread();
+    return isActiveWindow();
+}
+
 bool Window::makeFirstResponder(View *view)
 {
+    requireGuiThread();
     if (view != m_firstResponder) {
         View *const previous = m_firstResponder;
         // Nobody is, while it resigns: it may take itself out of the window as it does.
@@ -206,6 +256,7 @@ bool Window::makeFirstResponder(View *view)
 
 void Window::forgetView(const View &view)
 {
+    requireGuiThread();
     if (m_firstResponder == &view)
         m_firstResponder = nullptr;
     if (m_contentView == &view)
@@ -214,6 +265,7 @@ void Window::forgetView(const View &view)
 
 void Window::invalidateCursorRects(View &view)
 {
+    requireGuiThread();
     view.refreshCursorRects();
 }
 
@@ -221,6 +273,7 @@ void Window::invalidateCursorRects(View &view)
 
 void Window::addChildWindow(Window &child)
 {
+    requireGuiThread();
     if (child.parentWindow() != this) {
         if (Window *const former = child.parentWindow())
             former->d->family.remove(child);
@@ -233,11 +286,13 @@ void Window::addChildWindow(Window &child)
 
 Window *Window::parentWindow() const
 {
+    requireGuiThread();
     return d->family.parent();
 }
 
 std::vector<Window *> Window::childWindows() const
 {
+    requireGuiThread();
     return d->family.children();
 }
 
@@ -265,9 +320,16 @@ void Window::hideFamily()
 
 void Window::orderFront()
 {
+    requireGuiThread();
     show();
     raise();
     raiseChildrenOf(*this);
+}
+
+void Window::orderOut()
+{
+    requireGuiThread();
+    hide();
 }
 
 void Window::orderIn()
@@ -283,6 +345,7 @@ void Window::orderIn()
 
 void Window::setVisible(bool visible)
 {
+    requireGuiThread();
     if (visible)
         orderIn();
     else

@@ -6,6 +6,7 @@
 #include "platform/ScreenCoordinates.h"
 #include "platform/View.h"
 #include "platform/WindowFlags.h"
+#include "platform/foundation/GuiThread.h"
 #include "platform/native/NativeDesktop.h"
 
 #include <QBitmap>
@@ -46,6 +47,7 @@ QPixmap pictureOf(const QRect &area)
 
 bool Window::showsWhatIsBelow() const
 {
+    requireGuiThread();
     return attributes().isOpaque || NativeDesktop::instance().isCompositing();
 }
 

@@ -4,28 +4,39 @@
 #include <penwick/platform/Window.h>
 
 #include "platform/WindowFlags.h"
+#include "platform/foundation/GuiThread.h"
 
 #include <utility>
 
 namespace penwick::platform {
 
-WindowController::WindowController() = default;
-WindowController::~WindowController() = default;
+WindowController::WindowController()
+{
+    requireApplication();
+}
+
+WindowController::~WindowController()
+{
+    requireGuiThreadAtEnd();
+}
 
 WindowController::WindowController(std::unique_ptr<Window> window)
-    : m_window(std::move(window))
+    : WindowController()
 {
+    m_window = std::move(window);
     if (m_window)
         m_window->setWindowController(this);
 }
 
 Window *WindowController::window() const
 {
+    requireGuiThread();
     return m_window.get();
 }
 
 void WindowController::setWindow(std::unique_ptr<Window> window)
 {
+    requireGuiThread();
     m_window = std::move(window);
     m_window->setWindowController(this);
     windowDidLoad();
@@ -33,6 +44,7 @@ void WindowController::setWindow(std::unique_ptr<Window> window)
 
 void WindowController::showWindow(QObject *)
 {
+    requireGuiThread();
     if (!m_window)
         return;
     m_window->orderFront();
@@ -40,13 +52,30 @@ void WindowController::showWindow(QObject *)
         m_window->activateWindow();
 }
 
+void WindowController::windowDidLoad()
+{
+    requireGuiThread();
+}
+
+void WindowController::mouseDown()
+{
+    requireGuiThread();
+}
+
+void WindowController::mouseUp()
+{
+    requireGuiThread();
+}
+
 bool WindowController::keyDown(const QKeyEvent &)
 {
+    requireGuiThread();
     return false;
 }
 
 void WindowController::retire()
 {
+    requireGuiThread();
     if (m_window)
         m_window->orderOut();
 }

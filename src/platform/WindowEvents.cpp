@@ -4,6 +4,7 @@
 
 #include "platform/View.h"
 #include "platform/WindowPrivate.h"
+#include "platform/foundation/GuiThread.h"
 
 #include <QCloseEvent>
 #include <QPainter>
@@ -25,6 +26,7 @@ void Window::changeEvent(QEvent *event)
 
 void Window::closeEvent(QCloseEvent *event)
 {
+    requireGuiThread();
     event->accept();
     if (!std::exchange(d->isClosed, true))
         tellDelegate(&WindowDelegate::windowWillClose);

@@ -10,6 +10,7 @@
 #include "platform/View.h"
 #include "platform/WindowFlags.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/GuiThread.h"
 #include "session/ToolPanelWindowController.h"
 
 #include <QCoreApplication>
@@ -71,68 +72,81 @@ DrawingWindowController::~DrawingWindowController()
 
 std::optional<platform::Point> DrawingWindowController::drawingWindowOrigin() const
 {
+    platform::requireGuiThread();
     return m_drawingWindowOrigin;
 }
 
 void DrawingWindowController::setDrawingWindowOrigin(const std::optional<platform::Point> &origin)
 {
+    platform::requireGuiThread();
     m_drawingWindowOrigin = origin;
 }
 
 std::optional<WindowType> DrawingWindowController::mWindowType() const
 {
+    platform::requireGuiThread();
     return m_windowType;
 }
 
 void DrawingWindowController::setMWindowType(std::optional<WindowType> type)
 {
+    platform::requireGuiThread();
     m_windowType = type;
 }
 
 platform::Window *DrawingWindowController::drawingWindow() const
 {
+    platform::requireGuiThread();
     return m_drawingWindow;
 }
 
 void DrawingWindowController::setDrawingWindow(platform::Window *window)
 {
+    platform::requireGuiThread();
     m_drawingWindow = window;
 }
 
 const std::shared_ptr<ToolPanelWindowController> &
 DrawingWindowController::tPanelWindowController() const
 {
+    platform::requireGuiThread();
     return m_tPanelWindowController;
 }
 
 void DrawingWindowController::setTPanelWindowController(
     std::shared_ptr<ToolPanelWindowController> controller)
 {
+    platform::requireGuiThread();
     m_tPanelWindowController = std::move(controller);
 }
 
 const std::shared_ptr<platform::Window> &DrawingWindowController::sharingNotificationWindow() const
 {
+    platform::requireGuiThread();
     return m_sharingNotificationWindow;
 }
 
 void DrawingWindowController::setSharingNotificationWindow(std::shared_ptr<platform::Window> window)
 {
+    platform::requireGuiThread();
     m_sharingNotificationWindow = std::move(window);
 }
 
 double DrawingWindowController::minWindowWidth() const
 {
+    platform::requireGuiThread();
     return m_minWindowWidth;
 }
 
 double DrawingWindowController::minWindowHeight() const
 {
+    platform::requireGuiThread();
     return m_minWindowHeight;
 }
 
 void DrawingWindowController::windowDidLoad()
 {
+    platform::requireGuiThread();
     WindowController::windowDidLoad();
     platform::Window &window = *require(m_drawingWindow.data(), "the drawing window is gone");
     platform::WindowAttributes attributes = window.attributes();
@@ -173,6 +187,7 @@ void DrawingWindowController::attachToolBar()
 void DrawingWindowController::createWindowForApplication(WindowType win_type, QScreen &screen,
     const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle)
 {
+    platform::requireGuiThread();
     m_windowType = win_type;
     const Rect screenFrame = platform::frameOfScreen(screen);
     m_minWindowWidth = screenFrame.width * 2 / 3;

@@ -6,6 +6,7 @@
 #include "canvas/DrawingCanvasView.h"
 #include "platform/OneShotTimer.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/GuiThread.h"
 #include "platform/foundation/StandardOutput.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -64,6 +65,7 @@ void DrawingWindowController::reopenToolBar()
 void DrawingWindowController::setWindowPositionRelativeToMainWindow(
     platform::Window &window, double xoffset, double yOffset)
 {
+    platform::requireGuiThread();
     if (!m_drawingWindowOrigin)
         platform::fatalError("the drawing window has not been placed");
     window.setFrameOrigin(*m_drawingWindowOrigin + platform::Point { xoffset, yOffset });
@@ -73,6 +75,7 @@ void DrawingWindowController::setWindowPositionRelativeToMainWindow(
 
 void DrawingWindowController::setNotificationWindowProperties(platform::Window &window)
 {
+    platform::requireGuiThread();
     platform::WindowAttributes attributes = window.attributes();
     attributes.isOpaque = false;
     attributes.sharingType = 0;
@@ -91,6 +94,7 @@ void DrawingWindowController::centreBanner()
 
 void DrawingWindowController::showSharingNotificationWindow()
 {
+    platform::requireGuiThread();
     if (!m_sharingNotificationWindow)
         return;
     require(m_drawingWindow.data(), "the drawing window is gone");
@@ -103,6 +107,7 @@ void DrawingWindowController::showSharingNotificationWindow()
 
 void DrawingWindowController::closeSharingNotificationWindow()
 {
+    platform::requireGuiThread();
     if (!m_sharingNotificationWindow)
         return;
     m_sharingNotificationWindow->orderOut();
@@ -113,12 +118,14 @@ void DrawingWindowController::closeSharingNotificationWindow()
 
 void DrawingWindowController::windowWillAppear()
 {
+    platform::requireGuiThread();
     if (m_isToolBarPlaced && m_tPanelWindowController && m_tPanelWindowController->window())
         reopenToolBar();
 }
 
 void DrawingWindowController::windowDidMove()
 {
+    platform::requireGuiThread();
     if (m_drawingWindow)
         m_drawingWindowOrigin = m_drawingWindow->frame().origin();
     if (m_tPanelWindowController)
@@ -127,6 +134,7 @@ void DrawingWindowController::windowDidMove()
 
 void DrawingWindowController::windowDidResize()
 {
+    platform::requireGuiThread();
     platform::Window *const panel
         = m_tPanelWindowController ? m_tPanelWindowController->window() : nullptr;
     if (!panel) {
@@ -143,16 +151,19 @@ void DrawingWindowController::windowDidResize()
 
 void DrawingWindowController::windowWillMove()
 {
+    platform::requireGuiThread();
     hideThePopover();
 }
 
 void DrawingWindowController::windowDidResignMain()
 {
+    platform::requireGuiThread();
     hideThePopover();
 }
 
 void DrawingWindowController::hideThePopover()
 {
+    platform::requireGuiThread();
     if (!m_drawingWindow)
         return;
     auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView());
@@ -162,11 +173,13 @@ void DrawingWindowController::hideThePopover()
 
 bool DrawingWindowController::keyDown(const QKeyEvent &event)
 {
+    platform::requireGuiThread();
     return m_tPanelWindowController && m_tPanelWindowController->content().performKey(event);
 }
 
 void DrawingWindowController::windowWillClose()
 {
+    platform::requireGuiThread();
     if (m_tPanelWindowController && m_tPanelWindowController->toolPanelWindow())
         m_tPanelWindowController->toolPanelWindow()->close();
     platform::NotificationCenter::defaultCenter().postNotification(

@@ -5,6 +5,7 @@
 #include "history/NotificationNames.h"
 #include "platform/Storyboard.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/GuiThread.h"
 #include "platform/foundation/StandardOutput.h"
 #include "session/ComponentBundle.h"
 
@@ -35,18 +36,24 @@ const QString &penwickSessionEndNotificationKey()
 
 Penwick::Penwick()
 {
+    platform::requireApplication();
     setPenwickBundle(makeComponentBundle());
 }
 
-Penwick::~Penwick() = default;
+Penwick::~Penwick()
+{
+    platform::requireGuiThreadAtEnd();
+}
 
 std::shared_ptr<DrawingWindowController> Penwick::penwickWindowController() const
 {
+    platform::requireGuiThread();
     return m_penwickWindowController;
 }
 
 void Penwick::setPenwickWindowController(std::shared_ptr<DrawingWindowController> controller)
 {
+    platform::requireGuiThread();
     m_penwickWindowController = std::move(controller);
 }
 
@@ -54,6 +61,7 @@ std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
     WindowType windowType, QScreen *drawScreen, const std::optional<QImage> &annotatedImage,
     const std::optional<QString> &windowTitle)
 {
+    platform::requireGuiThread();
     const auto &bundle = platform::require(penwickBundle(), "the resource bundle is not set");
     const platform::Storyboard storyboard(QStringLiteral("Main"), *bundle);
     m_penwickWindowController = shared(
@@ -70,6 +78,7 @@ std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
 
 void Penwick::showWindowSharingNotification()
 {
+    platform::requireGuiThread();
     if (m_penwickWindowController)
         m_penwickWindowController->showSharingNotificationWindow();
 }

@@ -86,7 +86,8 @@ enum class Animate
 /// A window whose frame is its outer one, title bar included, in points, y up, from the primary
 /// screen's bottom left corner. Inside it, views have frames from the content's bottom left.
 ///
-/// It never ends the host by being the last one closed. GUI thread only.
+/// It never ends the host by being the last one closed. GUI thread only: anywhere else, and where
+/// there is no QApplication, these operations stop the process.
 class PENWICK_EXPORT Window : public QWidget
 {
     Q_OBJECT
@@ -109,7 +110,7 @@ public:
 
     // Attributes
 
-    [[nodiscard]] const WindowAttributes &attributes() const { return m_attributes; }
+    [[nodiscard]] const WindowAttributes &attributes() const;
     void setAttributes(const WindowAttributes &attributes);
     /// Whether what lies below the window can be seen where the window is transparent. On a
     /// desktop that cannot, a transparent layer over the screen shows a picture of what was below
@@ -129,7 +130,7 @@ public:
 
     // Content
 
-    [[nodiscard]] View *contentView() const { return m_contentView; }
+    [[nodiscard]] View *contentView() const;
     /// Lets `view` fill the window's content. A view from outside is borrowed: it comes into this
     /// window and leaves it again when another one takes its place.
     void setContentView(View *view);
@@ -154,12 +155,12 @@ public:
     // Responders
 
     /// Who gets the keys. Null: the window itself. Kept while the window is not active.
-    [[nodiscard]] View *firstResponder() const { return m_firstResponder; }
+    [[nodiscard]] View *firstResponder() const;
     /// Makes `view` (null: the window itself) the first responder after the present one resigned.
     /// Answers whether it is the first responder now.
     bool makeFirstResponder(View *view);
     /// Whether this is the window that gets the keys.
-    [[nodiscard]] bool isKeyWindow() const { return isActiveWindow(); }
+    [[nodiscard]] bool isKeyWindow() const;
     void forgetView(const View &view); ///< `view` is being destroyed
     /// Makes views of the widgets that a scene built in this window.
     void adoptScene();
@@ -171,7 +172,7 @@ public:
     /// window that is not on the screen comes up together with that one.
     void orderFront();
     /// Takes the window and its children off the screen without closing it.
-    void orderOut() { hide(); }
+    void orderOut();
 
     void setVisible(bool visible) override;
 

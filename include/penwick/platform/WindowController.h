@@ -14,7 +14,8 @@ namespace penwick::platform {
 
 class Window;
 
-/// Holds a window and keeps it alive; the window goes with its controller. GUI thread only.
+/// Holds a window and keeps it alive; the window goes with its controller. GUI thread only:
+/// anywhere else, and where there is no QApplication, its operations stop the process.
 class PENWICK_EXPORT WindowController : public QObject
 {
     Q_OBJECT
@@ -38,11 +39,11 @@ public:
     void retire();
 
     /// The window has been loaded.
-    virtual void windowDidLoad() { }
+    virtual void windowDidLoad();
     /// The left button went down where no view of the window took it.
-    virtual void mouseDown() { }
+    virtual void mouseDown();
     /// It was let go again.
-    virtual void mouseUp() { }
+    virtual void mouseUp();
     /// A key went down that no view of the window took; answers whether it does something here.
     virtual bool keyDown(const QKeyEvent &event);
 
