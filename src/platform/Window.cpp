@@ -101,6 +101,7 @@ void Window::setAttributes(const WindowAttributes &attributes)
         return;
     m_attributes = attributes;
     applyAttributes();
+    d->captures.check();
 }
 
 void Window::applyAttributes()
@@ -279,6 +280,7 @@ void Window::addChildWindow(Window &child)
             former->d->family.remove(child);
         child.d->family.setParent(this);
         d->family.add(child);
+        d->captures.add(child.d->captures);
     }
     if (child.d->family.canShow())
         child.orderFront();

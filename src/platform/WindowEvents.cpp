@@ -7,6 +7,7 @@
 #include "platform/foundation/GuiThread.h"
 
 #include <QCloseEvent>
+#include <QCoreApplication>
 #include <QPainter>
 
 #include <utility>
@@ -22,6 +23,19 @@ void Window::changeEvent(QEvent *event)
     // Not every desktop takes along what is on all its virtual desktops.
     if (std::exchange(d->isMinimised, isMinimized()) != isMinimized() && isVisible())
         isMinimized() ? hideFamily() : showFamily();
+}
+
+// Not the toolkit's: that lets go of the native window, and whoever captures the screen would leave
+// out one that is gone when the window is shown again.
+bool Window::close()
+{
+    requireGuiThread();
+    const QPointer<Window> closing = this; // whoever is told may end it
+    QCloseEvent event;
+    QCoreApplication::sendEvent(this, &event);
+    if (closing)
+        hide();
+    return true;
 }
 
 void Window::closeEvent(QCloseEvent *event)

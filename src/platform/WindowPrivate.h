@@ -6,6 +6,7 @@
 #include <penwick/platform/WindowController.h>
 
 #include "platform/BackgroundDrag.h"
+#include "platform/CaptureExclusion.h"
 #include "platform/FrameTracker.h"
 #include "platform/Glide.h"
 #include "platform/ViewController.h"
@@ -22,11 +23,13 @@ public:
         : tracker(new FrameTracker(window))
         , glide(new Glide(*tracker))
         , shape(new WindowShape(window, *tracker))
+        , captures(window)
     { }
 
     FrameTracker *const tracker; // a child of the window
     Glide *const glide; // a child of the tracker
     WindowShape *const shape; // a child of the tracker
+    CaptureExclusion captures;
     WindowFamily family;
     std::unique_ptr<ViewController> contentViewController;
     QPointer<WindowController> windowController;

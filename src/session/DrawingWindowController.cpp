@@ -65,9 +65,12 @@ DrawingWindowController::DrawingWindowController(std::unique_ptr<platform::Windo
 
 DrawingWindowController::~DrawingWindowController()
 {
-    // The window goes after this object and must not tell it so.
-    if (window())
+    // The window goes after this object and must not tell it so; nor is it news to the host that
+    // what stood above the window goes first.
+    if (window()) {
         window()->setDelegate(nullptr);
+        window()->blockSignals(true);
+    }
 }
 
 std::optional<platform::Point> DrawingWindowController::drawingWindowOrigin() const
@@ -130,6 +133,8 @@ void DrawingWindowController::setSharingNotificationWindow(std::shared_ptr<platf
 {
     platform::requireGuiThread();
     m_sharingNotificationWindow = std::move(window);
+    if (m_drawingWindow && m_sharingNotificationWindow)
+        m_drawingWindow->expectChildWindow(*m_sharingNotificationWindow);
 }
 
 double DrawingWindowController::minWindowWidth() const
@@ -173,6 +178,7 @@ void DrawingWindowController::loadBanner()
     // The window goes with its controller, which has nothing else to do.
     m_sharingNotificationWindow = { controller, controller->window() };
     setNotificationWindowProperties(*m_sharingNotificationWindow);
+    m_drawingWindow->expectChildWindow(*m_sharingNotificationWindow);
 }
 
 void DrawingWindowController::attachToolBar()

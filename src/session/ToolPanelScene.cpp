@@ -52,6 +52,7 @@ std::unique_ptr<QObject> makeToolPanelScene(const platform::Bundle &bundle)
     panel->adoptScene();
     content->outlets() = outletsOf(scene);
     content->setView(*scene.toolPanelRoot);
+    panel->expectChildWindow(*content->popoverW());
     panel->setContentViewController(std::move(content));
 
     auto controller = std::make_unique<ToolPanelWindowController>();

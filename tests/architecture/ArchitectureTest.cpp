@@ -242,8 +242,10 @@ TEST(Architecture, examplesKnowOnlyWhatIsInstalled)
 
 TEST(Architecture, desktopsAreToldApartOnlyInPlatform)
 {
-    const std::vector<std::string> product { "src", "include", "host", "examples" };
+    // Capturing the screen, which examples/capture shows, is a host's own native business.
+    const std::vector<std::string> product { "src", "include", "host", "examples/embed" };
 
+    EXPECT_FALSE(files({ "examples/embed" }).empty());
     EXPECT_EQ(linesLike(nativeInclude, product, "src/platform"), Findings {});
     EXPECT_EQ(linesLike(privateQtInclude, product, "src/platform"), Findings {});
     EXPECT_EQ(linesLike(desktopQuestion, product, "src/platform"), Findings {});

@@ -155,6 +155,9 @@ const Operation operations[] {
     OF_WINDOW(attributes),
     { "Window", "setAttributes", [](Subject &s) { s.window.setAttributes({}); } },
     OF_WINDOW(showsWhatIsBelow),
+    OF_WINDOW(isKeptOutOfCaptures),
+    OF_WINDOW(windowsToLeaveOutOfCaptures),
+    { "Window", "expectChildWindow", [](Subject &s) { s.window.expectChildWindow(s.banner); } },
     { "Window", "addChildWindow", [](Subject &s) { s.window.addChildWindow(s.banner); } },
     OF_WINDOW(parentWindow),
     OF_WINDOW(childWindows),
@@ -187,8 +190,9 @@ const Operation operations[] {
     OF_WINDOW(orderOut),
     { "Window", "setVisible", [](Subject &s) { s.window.setVisible(true); } },
     // The toolkit's own, by which a host ends a session.
-    // The toolkit's own, by which a host ends a session.
-    { "Window", "close", [](Subject &s) { s.window.close(); } },
+    OF_WINDOW(close),
+    // The toolkit's own, by another way.
+    { "Window", "closeEvent", [](Subject &s) { s.window.QWidget::close(); } },
 };
 
 #undef OF_WINDOW

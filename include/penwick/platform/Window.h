@@ -118,8 +118,24 @@ public:
     /// logging category "penwick.desktop".
     [[nodiscard]] bool showsWhatIsBelow() const;
 
+    // Captures of the screen
+
+    /// Whether this desktop keeps the window out of captures of the screen: one whose sharing type
+    /// is 0, where the desktop can do that. X11 cannot: there it is false for every window, and
+    /// whoever captures leaves out windowsToLeaveOutOfCaptures().
+    [[nodiscard]] bool isKeptOutOfCaptures() const;
+    /// The native identifiers (QWidget::winId()) of the windows that are not to be seen by a
+    /// capture, their sharing type being 0: this one, and those that stand above it or will when
+    /// they are shown; of a drawing window the tool bar, its popover and the banner, however often
+    /// they come and go. On X11 a window manager puts a window into a frame of its own. Native
+    /// windows that were not there are made. Tool tips and menus are the toolkit's and not in it.
+    [[nodiscard]] std::vector<WId> windowsToLeaveOutOfCaptures() const;
+
     // Child windows
 
+    /// Tells that `child` will be added before it is shown. Until then it is no child, but has its
+    /// part in windowsToLeaveOutOfCaptures(). One that is a child already stays what it is.
+    void expectChildWindow(Window &child);
     /// Makes `child` stand above this window: it moves with it, stays where it is when this one is
     /// resized, and is on the screen only while this one is. Puts it on the screen if it can be
     /// there. A child of this window already is only brought to the front.
@@ -173,8 +189,17 @@ public:
     void orderFront();
     /// Takes the window and its children off the screen without closing it.
     void orderOut();
+    /// Tells the delegate that the window closes and takes it off the screen. The window stays
+    /// what it is, its native identifier included, and may be shown again. Answers whether it has
+    /// closed, as it always has.
+    bool close();
 
     void setVisible(bool visible) override;
+
+Q_SIGNALS:
+    /// windowsToLeaveOutOfCaptures() is another list than when it was last asked for, or told of.
+    /// The list may be asked for from the slot. Not sent for windows that go with their session.
+    void windowsToLeaveOutOfCapturesChanged();
 
 protected:
     void changeEvent(QEvent *event) override;

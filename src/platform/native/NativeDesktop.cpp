@@ -30,6 +30,11 @@ void NativeDesktop::followFrame(QWindow &, FrameListener) { }
 
 void NativeDesktop::forgetFrame(WId) { }
 
+bool NativeDesktop::keepsWindowsOutOfCaptures() const
+{
+    return false;
+}
+
 bool NativeDesktop::isCompositing() const
 {
     return true;

@@ -41,6 +41,8 @@ public:
     /// Ends it; `window` may be gone.
     virtual void forgetFrame(WId window);
 
+    /// Whether a window that is to be left out of captures of the screen is, once it is shown.
+    [[nodiscard]] virtual bool keepsWindowsOutOfCaptures() const;
     /// Whether transparent pixels of a window show what is below it.
     [[nodiscard]] virtual bool isCompositing() const;
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that

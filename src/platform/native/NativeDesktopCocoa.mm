@@ -2,6 +2,8 @@
 // macOS. Written to the platform's documentation; it has not been run yet.
 #include "platform/native/NativeDesktop.h"
 
+#include <QOperatingSystemVersion>
+
 #import <AppKit/AppKit.h>
 
 namespace penwick::platform {
@@ -11,6 +13,13 @@ namespace {
 class NativeDesktopCocoa final : public NativeDesktop
 {
 public:
+    [[nodiscard]] bool keepsWindowsOutOfCaptures() const override
+    {
+        // The system's newer way of capturing heeds the sharing type no longer.
+        return QOperatingSystemVersion::current() < QOperatingSystemVersion(
+                   QOperatingSystemVersion::MacOS, 15);
+    }
+
     void keepContentRatio(QWindow &window, const QSize &content) override
     {
         NSWindow *const native = nativeWindow(window);

@@ -2,6 +2,8 @@
 // Windows. Written to the platform's documentation; it has not been run yet.
 #include "platform/native/NativeDesktop.h"
 
+#include <QOperatingSystemVersion>
+
 #include <windows.h>
 
 namespace penwick::platform {
@@ -11,6 +13,11 @@ namespace {
 class NativeDesktopWindows final : public NativeDesktop
 {
 public:
+    [[nodiscard]] bool keepsWindowsOutOfCaptures() const override
+    {
+        return QOperatingSystemVersion::current() >= QOperatingSystemVersion::Windows10_2004;
+    }
+
     void applyAttributes(QWindow &window, const NativeWindowValues &values) override
     {
         SetWindowDisplayAffinity(reinterpret_cast<HWND>(window.winId()),
