@@ -28,12 +28,23 @@ void settleDisplay()
         XSync(x11->display(), False);
 }
 
+/// Whether it stands for the whole screen; the toolkit makes one when a pointer first enters a
+/// window.
+bool isToolkitsOwn(const QWidget *widget)
+{
+    // Nobody else is to use the flag any more, but the toolkit does.
+    QT_WARNING_PUSH
+    QT_WARNING_DISABLE_DEPRECATED
+    return widget->windowType() == Qt::Desktop;
+    QT_WARNING_POP
+}
+
 } // namespace
 
 QWidgetList Ledger::widgetsThatAre()
 {
     QWidgetList widgets = QApplication::allWidgets();
-    widgets.removeIf([](const QWidget *widget) { return widget->windowType() == Qt::Desktop; });
+    widgets.removeIf(isToolkitsOwn);
     return widgets;
 }
 

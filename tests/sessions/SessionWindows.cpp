@@ -21,7 +21,7 @@ void Session::clickTool(const Step &step)
 {
     // The end is rare, so that there is something to end.
     const auto &names = toolNames();
-    const std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
+    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     if (name == "state" && step.b > 20)
         return;
     const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
@@ -32,7 +32,8 @@ void Session::clickTool(const Step &step)
 
 void Session::chooseOption(const Step &step)
 {
-    const auto &options = optionsOf(m_plain->popover());
+    const std::string popover = m_plain->popover();
+    const auto &options = optionsOf(popover);
     if (!m_plain->isPopoverVisible() || options.empty())
         return;
     const std::string name = options[static_cast<std::size_t>(step.a) % options.size()];
