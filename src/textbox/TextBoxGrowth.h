@@ -8,6 +8,9 @@ class QTextDocument;
 
 namespace penwick {
 
+constexpr double sidePadding = 5.0; ///< points, left and right of the text
+constexpr double bottomPadding = 3.0; ///< points
+
 /// The least that a text box shrinks to.
 constexpr platform::Size smallestTextBox { 200.0, 30.0 };
 

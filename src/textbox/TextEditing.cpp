@@ -32,6 +32,14 @@ void prepareForPress(QTextEdit &editor, const QMouseEvent &press)
         editor.setTextCursor(editor.cursorForPosition(press.position().toPoint()));
 }
 
+bool endsEditing(const QKeyEvent &press)
+{
+    const bool isReturn = press.key() == Qt::Key_Return || press.key() == Qt::Key_Enter;
+    return (isReturn && !press.modifiers().testFlag(Qt::ShiftModifier))
+        || press.key() == Qt::Key_Tab || press.key() == Qt::Key_Backtab
+        || press.key() == Qt::Key_Escape;
+}
+
 bool redoIfAsked(QTextEdit &editor, QKeyEvent &press)
 {
     // Where the desktop has other keys for it, the editor would leave these to the canvas.

@@ -19,6 +19,9 @@ void endEditIn(QTextEdit &editor);
 /// its own, in which the host may end the session.
 void prepareForPress(QTextEdit &editor, const QMouseEvent &press);
 
+/// Whether `press` is one of the keys that end an edit: Return without Shift, Tab and Escape.
+[[nodiscard]] bool endsEditing(const QKeyEvent &press);
+
 /// Redoes if `press` is Ctrl+Y and `editor` can be written in; whether it was. The press is
 /// accepted then.
 bool redoIfAsked(QTextEdit &editor, QKeyEvent &press);

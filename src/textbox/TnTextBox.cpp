@@ -12,11 +12,8 @@
 
 #include <penwick/platform/Window.h>
 
-#include <QMimeData>
 #include <QScrollBar>
 #include <QTextDocument>
-#include <QTextFrame>
-#include <QTextOption>
 
 namespace penwick {
 
@@ -25,8 +22,6 @@ namespace {
 using platform::Point;
 using platform::Rect;
 
-constexpr double sidePadding = 5.0; // points, left and right of the text
-constexpr double bottomPadding = 3.0; // points
 constexpr double placedBorderWidth = 3.0; // points
 constexpr double placedBorderRadius = 1.0; // points
 constexpr double dashedBorderWidth = 2.0; // points
@@ -54,8 +49,6 @@ TnTextBox::TnTextBox(const Rect &frame, double fontSize, const QColor &fontColor
     : m_textFontSize(fontSize)
     , m_textFontColor(fontColor)
     , m_panGesture([this](const auto &gesture) { handleGesture(gesture); })
-    , m_caret(*this)
-    , m_hiding(*this)
 {
     setFrame(frame);
     customizeTextBox();
@@ -68,49 +61,14 @@ void TnTextBox::customizeTextBox()
     // The two full stops are meant.
     m_placeholderAttributedString = { tr("Type your text here.."), faded(m_textFontColor),
         systemFontOf(placeholderFontSize), Qt::AlignJustify };
-    setUpEditor();
+    setInk(textFontOf(m_textFontSize), m_textFontColor, textContainerOrigin());
     setEditable(true);
     m_hasDashedBorder = true;
     m_deleteTextButton = platform::makeView<DeleteTextBoxButton>(frame());
     connect(m_deleteTextButton.get(), &QAbstractButton::clicked, this, &TnTextBox::deleteTextBox);
     setAccessibleName(tr("Text box"));
-}
-
-void TnTextBox::setUpEditor()
-{
-    setFrameShape(QFrame::NoFrame);
-    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    viewport()->setAutoFillBackground(false);
-    setAcceptRichText(false); // whatever is pasted arrives in the box's own font and colour
-    setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
-    setCursorWidth(0); // the caret is painted here
-    setFont(textFontOf(m_textFontSize));
-    QTextCharFormat ink;
-    ink.setForeground(m_textFontColor);
-    textCursor().setBlockCharFormat(ink); // lasts when all of the text is deleted
-    setTextColor(m_textFontColor);
-    QPalette colors = palette();
-    colors.setColor(QPalette::Text, m_textFontColor);
-    setPalette(colors);
-    m_caret.setColor(m_textFontColor);
-
-    document()->setDocumentMargin(0.0);
-    QTextFrameFormat margins = document()->rootFrame()->frameFormat();
-    margins.setLeftMargin(sidePadding);
-    margins.setRightMargin(sidePadding);
-    margins.setTopMargin(textContainerOrigin().y);
-    margins.setBottomMargin(bottomPadding);
-    document()->rootFrame()->setFrameFormat(margins);
-    document()->clearUndoRedoStacks(); // the user did none of this
-
-    connect(document(), &QTextDocument::contentsChanged, this, &TnTextBox::fitToText);
-    connect(this, &QTextEdit::cursorPositionChanged, &m_caret, &TextCaret::restart);
-    // A new box is lower than a line of a large font; it grows with the first letter.
-    connect(verticalScrollBar(), &QScrollBar::valueChanged, this, [this] {
-        if (isEmpty())
-            verticalScrollBar()->setValue(0);
-    });
+    connect(this, &TextEditor::writingChanged, this, &TnTextBox::fitToText);
+    connect(this, &TextEditor::endAsked, this, &TnTextBox::endEditing);
 }
 
 Point TnTextBox::textContainerOrigin() const
@@ -118,21 +76,12 @@ Point TnTextBox::textContainerOrigin() const
     return { sidePadding, m_textFontSize <= largestSmallFont ? 6.0 : 3.0 };
 }
 
-bool TnTextBox::isEmpty() const
-{
-    return document()->isEmpty();
-}
-
 // Appearance
 
 void TnTextBox::draw(const Rect &dirtyRect)
 {
-    ViewOf::draw(dirtyRect);
+    TextEditor::draw(dirtyRect);
     drawPlaceholder();
-    if (hasFocus()) {
-        QPainter painter(viewport());
-        m_caret.paint(painter);
-    }
     if (!m_hasDashedBorder)
         return;
     drawBorder(bounds()); // always whole: the clip alone decides what of it is painted
@@ -199,7 +148,7 @@ void TnTextBox::mouseDown(const platform::MouseEvent &event)
     }
     if (platform::Window *const ownWindow = window())
         ownWindow->makeFirstResponder(this);
-    ViewOf::mouseDown(event);
+    TextEditor::mouseDown(event);
 }
 
 void TnTextBox::mouseUp(const platform::MouseEvent &)
@@ -231,55 +180,7 @@ void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)
     setFrameOrigin(location - m_mouseDownPoint);
 }
 
-// Pressing is only half of what the editor does with a press: it selects text as the pointer goes
-// on, and on X11 the wheel's button pastes.
-void TnTextBox::mousePressEvent(QMouseEvent *event)
-{
-    prepareForPress(*this, *event);
-    if (event->button() == Qt::MiddleButton && isEditable())
-        QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
-    ViewOf::mousePressEvent(event);
-}
-
-void TnTextBox::mouseMoveEvent(QMouseEvent *event)
-{
-    if (event->buttons().testFlag(Qt::LeftButton) && isEditable()) {
-        if (!compositionIn(*this).isEmpty())
-            commitCompositionIn(*this);
-        QTextEdit::mouseMoveEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
-    }
-    ViewOf::mouseMoveEvent(event);
-}
-
-void TnTextBox::mouseReleaseEvent(QMouseEvent *event)
-{
-    if (event->button() == Qt::LeftButton || (event->button() == Qt::MiddleButton && isEditable()))
-        QTextEdit::mouseReleaseEvent(event); // NOLINT(bugprone-parent-virtual-call): as above
-    ViewOf::mouseReleaseEvent(event);
-}
-
-void TnTextBox::wheelEvent(QWheelEvent *event)
-{
-    event->ignore(); // a read-only editor would change its font's size
-}
-
 // Keys
-
-void TnTextBox::keyPressEvent(QKeyEvent *event)
-{
-    const bool isReturn = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
-    const bool ends = (isReturn && !event->modifiers().testFlag(Qt::ShiftModifier))
-        || event->key() == Qt::Key_Tab || event->key() == Qt::Key_Backtab
-        || event->key() == Qt::Key_Escape;
-    if (ends) {
-        event->accept();
-        endEditing();
-        return;
-    }
-    m_caret.restart();
-    if (!redoIfAsked(*this, *event))
-        ViewOf::keyPressEvent(event);
-}
 
 void TnTextBox::keyUp(const platform::KeyEvent &event)
 {
@@ -287,44 +188,7 @@ void TnTextBox::keyUp(const platform::KeyEvent &event)
         removeAndReport();
 }
 
-// The editor's own would read an offer that has no format at all as if it had one, and crash.
-void TnTextBox::insertFromMimeData(const QMimeData *source)
-{
-    if (!isEditable() || !source || !source->hasText())
-        return;
-    insertPlainText(source->text());
-    ensureCursorVisible();
-}
-
-void TnTextBox::inputMethodEvent(QInputMethodEvent *event)
-{
-    ViewOf::inputMethodEvent(event);
-    fitToText();
-}
-
-void TnTextBox::focusInEvent(QFocusEvent *event)
-{
-    ViewOf::focusInEvent(event);
-    if (isEditable())
-        m_caret.show();
-}
-
-void TnTextBox::focusOutEvent(QFocusEvent *event)
-{
-    ViewOf::focusOutEvent(event);
-    m_caret.hide();
-}
-
 // Modes
-
-void TnTextBox::setEditable(bool editable)
-{
-    setReadOnly(!editable);
-    if (editable && hasFocus())
-        m_caret.show();
-    else
-        m_caret.hide();
-}
 
 void TnTextBox::endEditing()
 {

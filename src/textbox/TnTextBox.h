@@ -4,15 +4,12 @@
 
 #include "platform/AttributedString.h"
 #include "platform/PanGestureRecognizer.h"
-#include "platform/ViewOf.h"
 #include "platform/WeakReference.h"
 #include "textbox/DeleteTextBoxButton.h"
-#include "textbox/EditorHiding.h"
 #include "textbox/TextBoxDelegate.h"
-#include "textbox/TextCaret.h"
+#include "textbox/TextEditor.h"
 
 #include <QColor>
-#include <QTextEdit>
 
 #include <memory>
 #include <optional>
@@ -25,7 +22,7 @@ namespace penwick {
 /// Held by reference: history keeps a box that has left its canvas, and the same box comes back.
 /// Its own coordinates run downwards, as text does. A box that reports its end without a delegate
 /// stops the process.
-class TnTextBox final : public platform::ViewOf<QTextEdit>
+class TnTextBox final : public TextEditor
 {
     Q_OBJECT
     Q_PROPERTY(penwick::platform::AttributedString placeholderAttributedString READ
@@ -38,8 +35,6 @@ public:
 
     TnTextBox(const platform::Rect &frame, double fontSize, const QColor &fontColor);
     ~TnTextBox() override;
-
-    [[nodiscard]] bool isFlipped() const override { return true; }
 
     /// The owner to tell when the box deletes itself; weak.
     [[nodiscard]] TextBoxDelegate *textBoxDelegate() const { return m_textBoxDelegate.get(); }
@@ -58,7 +53,6 @@ public:
     }
     /// Whether the box has deleted itself; not any more once it is back on a canvas.
     [[nodiscard]] bool isTextBoxDeleted() const { return m_isTextBoxDeleted; }
-    [[nodiscard]] bool isEditable() const { return !isReadOnly(); }
     [[nodiscard]] platform::PanGestureRecognizer &panGesture() { return m_panGesture; }
 
     /// Where the text begins, from the box's top left corner: smaller fonts stand lower.
@@ -83,28 +77,14 @@ public:
     /// Takes the box off its canvas and tells the owner.
     void deleteTextBox();
 
-protected:
-    void mousePressEvent(QMouseEvent *event) override;
-    void mouseMoveEvent(QMouseEvent *event) override;
-    void mouseReleaseEvent(QMouseEvent *event) override;
-    void keyPressEvent(QKeyEvent *event) override;
-    void focusInEvent(QFocusEvent *event) override;
-    void focusOutEvent(QFocusEvent *event) override;
-    void inputMethodEvent(QInputMethodEvent *event) override;
-    void wheelEvent(QWheelEvent *event) override;
-    void insertFromMimeData(const QMimeData *source) override;
-
 private:
     void customizeTextBox();
-    void setUpEditor();
-    void setEditable(bool editable);
     void showPlacedBorder();
     void showDeleteTextButton();
     void removeAndReport();
     void endEditing();
     void fitToText();
     void drawPlaceholder();
-    [[nodiscard]] bool isEmpty() const;
 
     platform::Point m_mouseDownPoint; // of the grab, from the box's origin
     bool m_hasDashedBorder = true;
@@ -115,8 +95,6 @@ private:
     platform::AttributedString m_placeholderAttributedString;
     bool m_isTextBoxDeleted = false;
     platform::PanGestureRecognizer m_panGesture;
-    TextCaret m_caret;
-    EditorHiding m_hiding;
     std::optional<platform::Cursor> m_pointer; // for the mode that m_pointerIsForText says
     bool m_pointerIsForText = false;
     bool m_isFitting = false;

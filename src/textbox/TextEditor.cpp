@@ -1,0 +1,163 @@
+// SPDX-License-Identifier: MIT
+#include "textbox/TextEditor.h"
+
+#include "textbox/TextBoxGrowth.h"
+#include "textbox/TextComposition.h"
+#include "textbox/TextEditing.h"
+
+#include <QMimeData>
+#include <QScrollBar>
+#include <QTextDocument>
+#include <QTextFrame>
+#include <QTextOption>
+
+namespace penwick {
+
+TextEditor::TextEditor(QTextDocument *text, QWidget *parent)
+    : ViewOf(parent)
+    , m_caret(*this)
+    , m_hiding(*this)
+{
+    if (text)
+        setDocument(text);
+    setFrameShape(QFrame::NoFrame);
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    viewport()->setAutoFillBackground(false);
+    setAcceptRichText(false); // whatever is pasted arrives in the editor's own font and colour
+    setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    setCursorWidth(0); // the caret is painted here
+
+    connect(document(), &QTextDocument::contentsChanged, this, &TextEditor::writingChanged);
+    connect(this, &QTextEdit::cursorPositionChanged, &m_caret, &TextCaret::restart);
+    // A new box is lower than a line of a large font; it grows with the first letter.
+    connect(verticalScrollBar(), &QScrollBar::valueChanged, this, [this] {
+        if (isEmpty())
+            verticalScrollBar()->setValue(0);
+    });
+}
+
+TextEditor::~TextEditor() = default;
+
+void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point origin)
+{
+    setFont(font);
+    QTextCharFormat ink;
+    ink.setForeground(color);
+    textCursor().setBlockCharFormat(ink); // lasts when all of the text is deleted
+    setTextColor(color);
+    QPalette colors = palette();
+    colors.setColor(QPalette::Text, color);
+    setPalette(colors);
+    m_caret.setColor(color);
+
+    document()->setDocumentMargin(0.0);
+    QTextFrameFormat margins = document()->rootFrame()->frameFormat();
+    margins.setLeftMargin(origin.x);
+    margins.setRightMargin(origin.x);
+    margins.setTopMargin(origin.y);
+    margins.setBottomMargin(bottomPadding);
+    document()->rootFrame()->setFrameFormat(margins);
+    document()->clearUndoRedoStacks(); // the user did none of this
+}
+
+void TextEditor::setEditable(bool editable)
+{
+    setReadOnly(!editable);
+    if (editable && hasFocus())
+        m_caret.show();
+    else
+        m_caret.hide();
+}
+
+bool TextEditor::isEmpty() const
+{
+    return document()->isEmpty();
+}
+
+void TextEditor::draw(const platform::Rect &dirtyRect)
+{
+    ViewOf::draw(dirtyRect);
+    if (hasFocus()) {
+        QPainter painter(viewport());
+        m_caret.paint(painter);
+    }
+}
+
+// The pointer
+
+// Pressing is only half of what the editor does with a press: it selects text as the pointer goes
+// on, and on X11 the wheel's button pastes.
+void TextEditor::mousePressEvent(QMouseEvent *event)
+{
+    prepareForPress(*this, *event);
+    if (event->button() == Qt::MiddleButton && isEditable())
+        QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
+    ViewOf::mousePressEvent(event);
+}
+
+void TextEditor::mouseMoveEvent(QMouseEvent *event)
+{
+    if (event->buttons().testFlag(Qt::LeftButton) && isEditable()) {
+        if (!compositionIn(*this).isEmpty())
+            commitCompositionIn(*this);
+        QTextEdit::mouseMoveEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
+    }
+    ViewOf::mouseMoveEvent(event);
+}
+
+void TextEditor::mouseReleaseEvent(QMouseEvent *event)
+{
+    if (event->button() == Qt::LeftButton || (event->button() == Qt::MiddleButton && isEditable()))
+        QTextEdit::mouseReleaseEvent(event); // NOLINT(bugprone-parent-virtual-call): as above
+    ViewOf::mouseReleaseEvent(event);
+}
+
+void TextEditor::wheelEvent(QWheelEvent *event)
+{
+    event->ignore(); // a read-only editor would change its font's size
+}
+
+// Keys
+
+void TextEditor::keyPressEvent(QKeyEvent *event)
+{
+    if (endsEditing(*event)) {
+        event->accept();
+        Q_EMIT endAsked();
+        return;
+    }
+    m_caret.restart();
+    if (!redoIfAsked(*this, *event))
+        ViewOf::keyPressEvent(event);
+}
+
+// The editor's own would read an offer that has no format at all as if it had one, and crash.
+void TextEditor::insertFromMimeData(const QMimeData *source)
+{
+    if (!isEditable() || !source || !source->hasText())
+        return;
+    insertPlainText(source->text());
+    ensureCursorVisible();
+}
+
+void TextEditor::inputMethodEvent(QInputMethodEvent *event)
+{
+    ViewOf::inputMethodEvent(event);
+    Q_EMIT writingChanged();
+}
+
+void TextEditor::focusInEvent(QFocusEvent *event)
+{
+    ViewOf::focusInEvent(event);
+    if (isEditable())
+        m_caret.show();
+}
+
+void TextEditor::focusOutEvent(QFocusEvent *event)
+{
+    ViewOf::focusOutEvent(event);
+    m_caret.hide();
+}
+
+} // namespace penwick

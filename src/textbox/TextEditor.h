@@ -1,0 +1,59 @@
+// SPDX-License-Identifier: MIT
+// The editor under a text box: plain text in one font and colour, with the caret of its own.
+#pragma once
+
+#include "platform/ViewOf.h"
+#include "textbox/EditorHiding.h"
+#include "textbox/TextCaret.h"
+
+#include <QTextEdit>
+
+namespace penwick {
+
+/// Edits plain text, or shows it where it is not editable. It has no background, no frame and no
+/// scroll bars, and its size is its owner's to set.
+///
+/// Its own coordinates run downwards, as text does.
+class TextEditor : public platform::ViewOf<QTextEdit>
+{
+    Q_OBJECT
+
+public:
+    /// Shows `text`, which must outlive it; a text of its own where that is null.
+    explicit TextEditor(QTextDocument *text = nullptr, QWidget *parent = nullptr);
+    ~TextEditor() override;
+
+    [[nodiscard]] bool isFlipped() const override { return true; }
+
+    [[nodiscard]] bool isEditable() const { return !isReadOnly(); }
+    void setEditable(bool editable);
+    [[nodiscard]] bool isEmpty() const; ///< what is half composed is no text yet
+
+    /// Writes everything in `font` and `color`, beginning at `origin` from the top left corner.
+    void setInk(const QFont &font, const QColor &color, platform::Point origin);
+
+    void draw(const platform::Rect &dirtyRect) override;
+
+Q_SIGNALS:
+    /// The text, or what is half composed in it, has changed.
+    void writingChanged();
+    /// A key was pressed that ends editing.
+    void endAsked();
+
+protected:
+    void mousePressEvent(QMouseEvent *event) override;
+    void mouseMoveEvent(QMouseEvent *event) override;
+    void mouseReleaseEvent(QMouseEvent *event) override;
+    void wheelEvent(QWheelEvent *event) override;
+    void keyPressEvent(QKeyEvent *event) override;
+    void focusInEvent(QFocusEvent *event) override;
+    void focusOutEvent(QFocusEvent *event) override;
+    void inputMethodEvent(QInputMethodEvent *event) override;
+    void insertFromMimeData(const QMimeData *source) override;
+
+private:
+    TextCaret m_caret;
+    EditorHiding m_hiding;
+};
+
+} // namespace penwick
