@@ -2,6 +2,7 @@
 #include "textbox/TextBoxFont.h"
 
 #include <QFontDatabase>
+#include <QStringList>
 
 #include <algorithm>
 #include <cmath>
@@ -10,25 +11,59 @@ namespace penwick {
 
 namespace {
 
+constexpr char16_t beforeStyle = u'-'; // in the name of a face
+
 constexpr double smallestFont = 1.0; // points
 constexpr double largestFont = 1000.0; // points; beyond it no line would fit a screen
+
+bool isSameWithoutSpaces(const QString &name, QStringView wanted)
+{
+    auto next = wanted.begin();
+    for (const QChar letter : name) {
+        if (letter == u' ')
+            continue;
+        if (next == wanted.end() || letter != *next)
+            return false;
+        ++next;
+    }
+    return next == wanted.end();
+}
+
+QFont sized(QFont font, double size)
+{
+    font.setPixelSize(static_cast<int>(std::lround(std::clamp(size, smallestFont, largestFont))));
+    return font;
+}
 
 } // namespace
 
 QFont systemFontOf(double size)
 {
-    QFont font = QFontDatabase::systemFont(QFontDatabase::GeneralFont);
-    font.setPixelSize(static_cast<int>(std::lround(std::clamp(size, smallestFont, largestFont))));
-    return font;
+    return sized(QFontDatabase::systemFont(QFontDatabase::GeneralFont), size);
+}
+
+std::optional<QFont> fontNamed(const QString &face, double size)
+{
+    const auto hyphen = face.lastIndexOf(beforeStyle);
+    if (hyphen < 0)
+        return std::nullopt;
+    const QStringView all(face);
+    for (const QString &family : QFontDatabase::families()) {
+        if (!isSameWithoutSpaces(family, all.first(hyphen)))
+            continue;
+        for (const QString &style : QFontDatabase::styles(family)) {
+            if (isSameWithoutSpaces(style, all.sliced(hyphen + 1)))
+                return sized(QFontDatabase::font(family, style, 1), size);
+        }
+    }
+    return std::nullopt;
 }
 
 QFont textFontOf(double size)
 {
     static const QString preferred = QStringLiteral("ProximaNova-Regular");
-    QFont font = systemFontOf(size);
-    if (QFontDatabase::hasFamily(preferred))
-        font.setFamily(preferred);
-    return font;
+    const std::optional<QFont> font = fontNamed(preferred, size);
+    return font ? *font : systemFontOf(size);
 }
 
 } // namespace penwick
