@@ -9,6 +9,8 @@
 #include <QWidget>
 
 #include <cmath>
+#include <utility>
+#include <vector>
 
 namespace penwick::platform {
 
@@ -41,6 +43,7 @@ struct Cursor::Data
 {
     QIcon image;
     Point hotSpot;
+    mutable std::vector<std::pair<double, QCursor>> rendered {}; ///< by scale; a desktop has few
 };
 
 Cursor::Cursor(std::shared_ptr<const Data> data)
@@ -78,18 +81,26 @@ QCursor Cursor::forScale(double devicePixelRatio) const
 {
     if (m_data->image.isNull())
         return QCursor(Qt::ArrowCursor);
+    for (const auto &[scale, cursor] : m_data->rendered) {
+        if (scale == devicePixelRatio)
+            return cursor;
+    }
     const QSize size = m_data->image.actualSize(QSize(largestCursor, largestCursor));
     const QPixmap pixmap = m_data->image.pixmap(size, devicePixelRatio);
     const double scale = hotSpotScale(devicePixelRatio);
-    return QCursor(pixmap, static_cast<int>(std::lround(m_data->hotSpot.x * scale)),
+    const QCursor cursor(pixmap, static_cast<int>(std::lround(m_data->hotSpot.x * scale)),
         static_cast<int>(std::lround(m_data->hotSpot.y * scale)));
+    m_data->rendered.emplace_back(devicePixelRatio, cursor);
+    return cursor;
 }
 
 void Cursor::set(View &view) const
 {
     current() = *this;
     const QCursor shown = forScale(view.widget().devicePixelRatioF());
-    view.surface().setCursor(shown);
+    // Set again, it would go to the desktop again: too much for every move of a pointer.
+    if (!view.surface().testAttribute(Qt::WA_SetCursor) || view.surface().cursor() != shown)
+        view.surface().setCursor(shown);
     lastSet() = { &view.surface(), shown };
 }
 

@@ -5,6 +5,8 @@
 #include "platform/RecordingView.h"
 #include "platform/SvgFile.h"
 
+#include <QEvent>
+#include <QIconEngine>
 #include <QPixmap>
 
 #include <gtest/gtest.h>
@@ -17,6 +19,40 @@ struct Scale
 {
     double factor;
     QSize pixels; // of an image of 20 x 10 points
+};
+
+/// Counts how often its icon is made a picture of.
+class CountingEngine final : public QIconEngine
+{
+public:
+    explicit CountingEngine(int &count)
+        : m_count(count)
+    { }
+    void paint(QPainter *, const QRect &, QIcon::Mode, QIcon::State) override { }
+    QPixmap pixmap(const QSize &size, QIcon::Mode, QIcon::State) override
+    {
+        ++m_count;
+        return QPixmap(size);
+    }
+    QSize actualSize(const QSize &, QIcon::Mode, QIcon::State) override { return { 20, 10 }; }
+    [[nodiscard]] QIconEngine *clone() const override { return new CountingEngine(*this); }
+
+private:
+    int &m_count;
+};
+
+/// Counts how often a view's cursor is set.
+class CursorChanges final : public QObject
+{
+public:
+    explicit CursorChanges(RecordingView &view) { view.installEventFilter(this); }
+    bool eventFilter(QObject *, QEvent *event) override
+    {
+        count += event->type() == QEvent::CursorChange;
+        return false;
+    }
+
+    int count = 0;
 };
 
 class CursorScale : public testing::TestWithParam<Scale>
@@ -70,6 +106,45 @@ TEST(Cursor, cursorThatSomebodyElseReplacedIsNotTheCurrentOne)
     EXPECT_EQ(Cursor::currentCursor(), Cursor::arrow());
     cursor.set(view);
     EXPECT_EQ(Cursor::currentCursor(), cursor);
+}
+
+TEST(Cursor, isRenderedOnceForEachScaleWhoeverHasACopy)
+{
+    int renderings = 0;
+    const Cursor cursor(QIcon(new CountingEngine(renderings)), { 3.0, 7.0 });
+    const Cursor copy = cursor; // NOLINT(performance-unnecessary-copy-initialization): the subject
+
+    EXPECT_EQ(cursor.forScale(1.0), copy.forScale(1.0));
+    EXPECT_EQ(renderings, 1);
+    EXPECT_NE(cursor.forScale(2.0), cursor.forScale(1.0));
+    EXPECT_EQ(cursor.forScale(2.0), copy.forScale(2.0));
+    EXPECT_EQ(renderings, 2);
+}
+
+TEST(Cursor, cursorThatIsShownAlreadyIsNotGivenToTheDesktopAgain)
+{
+    const SvgFile artwork(20, 10);
+    const Cursor cursor(artwork.icon(), { 3.0, 7.0 });
+    RecordingView view;
+    CursorChanges changes(view);
+
+    cursor.set(view);
+    cursor.set(view);
+    EXPECT_EQ(changes.count, 1);
+
+    Cursor::arrow().set(view);
+    Cursor::arrow().set(view);
+    EXPECT_EQ(changes.count, 2);
+    EXPECT_EQ(Cursor::currentCursor(), Cursor::arrow());
+}
+
+TEST(Cursor, arrowIsGivenToAViewThatHasNoCursorOfItsOwn)
+{
+    RecordingView view;
+
+    Cursor::arrow().set(view);
+
+    EXPECT_TRUE(view.testAttribute(Qt::WA_SetCursor));
 }
 
 // Off X11 Qt takes the hot spot in points, whatever the scale.
