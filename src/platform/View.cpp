@@ -64,10 +64,12 @@ void View::place()
         m_widget.setGeometry(geometry);
 }
 
-void View::widgetResized()
+void View::widgetResized(Size former)
 {
-    for (const Subview &subview : m_subviews)
-        subview.view->place();
+    for (View *const view : subviews()) {
+        view->place();
+        view->superviewDidResize(former);
+    }
 }
 
 Point View::toWindow(Point point) const
@@ -140,7 +142,23 @@ void View::addSubview(const std::shared_ptr<View> &view)
     view->place();
     view->m_widget.setVisible(!view->m_isHidden);
     view->m_widget.raise();
+    restack();
     view->announceWindow();
+}
+
+void View::restack()
+{
+    for (const Subview &subview : m_subviews) {
+        if (subview.view->m_isAboveSiblings)
+            subview.view->m_widget.raise();
+    }
+}
+
+void View::setAboveSiblings(bool isAbove)
+{
+    m_isAboveSiblings = isAbove;
+    if (m_superview)
+        m_superview->restack();
 }
 
 void View::setSubviews(const std::vector<View *> &views)
@@ -161,6 +179,7 @@ void View::setSubviews(const std::vector<View *> &views)
         view->m_widget.raise();
     }
     m_subviews = std::move(ordered);
+    restack();
 }
 
 void View::removeFromSuperview()

@@ -41,7 +41,8 @@ struct MouseEvent
 /// One key going down or up.
 struct KeyEvent
 {
-    /// The key at the place of a keyboard's own Backspace.
+    /// Backspace or Delete, into which other keyboards split what is one key on some. Alone: with
+    /// modifiers held it is no such key.
     static constexpr int backspaceKeyCode = 51;
 
     int keyCode = 0; ///< 0 for every key that no view asks about
@@ -97,6 +98,10 @@ public:
     [[nodiscard]] Window *window() const;
     [[nodiscard]] bool isHidden() const { return m_isHidden; }
     void setHidden(bool hidden);
+    /// Whether the view lies above its siblings on the screen, wherever it stands among the
+    /// subviews.
+    [[nodiscard]] bool isAboveSiblings() const { return m_isAboveSiblings; }
+    void setAboveSiblings(bool isAbove);
 
     // Appearance.
 
@@ -149,6 +154,8 @@ public:
     virtual void awakeFromScene() { }
     /// The view came into a window or left one.
     virtual void viewDidMoveToWindow() { }
+    /// The superview has another size than `former`, its size before.
+    virtual void superviewDidResize(Size /*former*/) { }
     /// Answers whether the view gives the first responder up.
     virtual bool resignFirstResponder() { return true; }
 
@@ -169,7 +176,7 @@ public:
 protected:
     explicit View(QWidget &widget);
 
-    void widgetResized();
+    void widgetResized(Size former);
     void pointerEntered();
     /// The recognizers that follow the pointer now; a copy, because an action may change them.
     [[nodiscard]] std::vector<PanGestureRecognizer *> gestureRecognizers() const;
@@ -187,6 +194,7 @@ private:
     };
 
     void detachFrom(View &superview);
+    void restack();
     void resignInside();
     void forgetInside();
     [[nodiscard]] Point toWindow(Point point) const;
@@ -198,6 +206,7 @@ private:
     View *m_superview = nullptr;
     std::vector<Subview> m_subviews;
     bool m_isHidden = false;
+    bool m_isAboveSiblings = false;
     bool m_wantsLayer = false;
     Layer m_layer;
     std::optional<Cursor> m_cursor;

@@ -161,12 +161,21 @@ protected:
         mouseExited();
     }
 
+    void keyPressEvent(QKeyEvent *event) override
+    {
+        m_keyOfChord = isOfChord(*event) ? event->key() : 0;
+        Base::keyPressEvent(event);
+    }
+
     void keyReleaseEvent(QKeyEvent *event) override
     {
         if (event->isAutoRepeat()) // the key is still down
             return;
+        // The modifiers of a chord may be let go first.
+        const bool isErasing = (event->key() == Qt::Key_Backspace || event->key() == Qt::Key_Delete)
+            && !isOfChord(*event) && event->key() != m_keyOfChord;
         m_keyEvent = event;
-        keyUp({ event->key() == Qt::Key_Backspace ? KeyEvent::backspaceKeyCode : 0 });
+        keyUp({ isErasing ? KeyEvent::backspaceKeyCode : 0 });
         m_keyEvent = nullptr;
     }
 
@@ -186,10 +195,16 @@ protected:
     void resizeEvent(QResizeEvent *event) override
     {
         Base::resizeEvent(event);
-        widgetResized();
+        const QSizeF former(event->oldSize());
+        widgetResized({ former.width(), former.height() });
     }
 
 private:
+    static bool isOfChord(const QKeyEvent &event)
+    {
+        return event.modifiers() & ~Qt::KeypadModifier;
+    }
+
     void press(QMouseEvent *event, int clickCount)
     {
         event->accept();
@@ -266,6 +281,7 @@ private:
     QMouseEvent *m_mouseEvent = nullptr;
     QKeyEvent *m_keyEvent = nullptr;
     PointerContact m_contact;
+    int m_keyOfChord = 0; // the last one pressed, if it was together with others
 };
 
 } // namespace penwick::platform

@@ -28,9 +28,10 @@ protected:
         return event.isAccepted();
     }
 
-    void sendKey(QEvent::Type type, int key, bool isRepeated = false)
+    void sendKey(QEvent::Type type, int key, bool isRepeated = false,
+        Qt::KeyboardModifiers modifiers = Qt::NoModifier)
     {
-        QKeyEvent event(type, key, Qt::NoModifier, QString(), isRepeated);
+        QKeyEvent event(type, key, modifiers, QString(), isRepeated);
         QCoreApplication::sendEvent(&m_content, &event);
     }
 };
@@ -150,15 +151,40 @@ TEST_F(ViewEvent, keyWithoutAMeaningIsZero)
 {
     sendKey(QEvent::KeyPress, Qt::Key_A);
     sendKey(QEvent::KeyRelease, Qt::Key_A);
-    sendKey(QEvent::KeyRelease, Qt::Key_Delete);
+    sendKey(QEvent::KeyRelease, Qt::Key_Return);
 
     EXPECT_EQ(m_content.take(), (Log { "key 0", "key 0" }));
 }
 
-TEST_F(ViewEvent, backspaceIsKeyFiftyOne)
+TEST_F(ViewEvent, backspaceAndDeleteAreKeyFiftyOne)
 {
     sendKey(QEvent::KeyRelease, Qt::Key_Backspace);
+    sendKey(QEvent::KeyRelease, Qt::Key_Delete);
+    sendKey(QEvent::KeyRelease, Qt::Key_Delete, false, Qt::KeypadModifier);
 
+    EXPECT_EQ(m_content.take(), (Log { "key 51", "key 51", "key 51" }));
+}
+
+TEST_F(ViewEvent, backspaceAndDeleteWithAModifierAreNot)
+{
+    for (const auto modifier :
+        { Qt::ControlModifier, Qt::ShiftModifier, Qt::AltModifier, Qt::MetaModifier }) {
+        sendKey(QEvent::KeyRelease, Qt::Key_Backspace, false, modifier);
+        sendKey(QEvent::KeyRelease, Qt::Key_Delete, false, modifier);
+    }
+
+    EXPECT_EQ(m_content.take(), Log(8, "key 0"));
+}
+
+TEST_F(ViewEvent, deleteWhoseModifierIsLetGoFirstIsNot)
+{
+    sendKey(QEvent::KeyPress, Qt::Key_Delete, false, Qt::ControlModifier);
+    sendKey(QEvent::KeyRelease, Qt::Key_Control);
+    sendKey(QEvent::KeyRelease, Qt::Key_Delete);
+    EXPECT_EQ(m_content.take(), (Log { "key 0", "key 0" }));
+
+    sendKey(QEvent::KeyPress, Qt::Key_Delete);
+    sendKey(QEvent::KeyRelease, Qt::Key_Delete);
     EXPECT_EQ(m_content.take(), Log { "key 51" });
 }
 

@@ -37,6 +37,23 @@ TEST_F(ViewFrame, superviewThatIsResizedKeepsItsSubviewsFrames)
     EXPECT_EQ(view->geometry(), QRect(10, 90, 30, 40));
 }
 
+TEST_F(ViewFrame, superviewThatIsResizedTellsItsSubviewsItsSizeBefore)
+{
+    class Listener final : public RecordingView
+    {
+    public:
+        void superviewDidResize(Size former) override { told.push_back(former); }
+        std::vector<Size> told;
+    };
+    const auto view = makeView<Listener>();
+    m_content.addSubview(view);
+
+    m_content.setFrame({ 0.0, 0.0, 200.0, 150.0 });
+    m_content.setFrame({ 0.0, 0.0, 180.0, 150.0 });
+
+    EXPECT_EQ(view->told, (std::vector<Size> { { 200.0, 100.0 }, { 200.0, 150.0 } }));
+}
+
 TEST_F(ViewFrame, superviewThatIsResizedMovesWhatLiesDeeper)
 {
     const auto view = added({ 10.0, 20.0, 30.0, 40.0 });

@@ -48,6 +48,32 @@ TEST_F(ViewTree, viewThatIsASubviewAlreadyStaysWhereItIs)
     EXPECT_EQ(first->take(), Log {});
 }
 
+TEST_F(ViewTree, viewAboveItsSiblingsLiesOverWhatIsAddedLaterAndKeepsItsPlaceAmongTheSubviews)
+{
+    const auto above = added({ 0.0, 0.0, 10.0, 10.0 });
+    above->setAboveSiblings(true);
+    const auto later = added({ 0.0, 0.0, 10.0, 10.0 });
+
+    EXPECT_EQ(m_content.subviews(), (Views { above.get(), later.get() }));
+    EXPECT_EQ(stacked(), (Views { later.get(), above.get() }));
+
+    m_content.setSubviews({ above.get(), later.get() });
+    EXPECT_EQ(m_content.subviews(), (Views { above.get(), later.get() }));
+    EXPECT_EQ(stacked(), (Views { later.get(), above.get() }));
+}
+
+TEST_F(ViewTree, viewComesAboveItsSiblingsAtOnce)
+{
+    const auto above = added({ 0.0, 0.0, 10.0, 10.0 });
+    const auto later = added({ 0.0, 0.0, 10.0, 10.0 });
+
+    EXPECT_FALSE(above->isAboveSiblings());
+    above->setAboveSiblings(true);
+
+    EXPECT_TRUE(above->isAboveSiblings());
+    EXPECT_EQ(stacked(), (Views { later.get(), above.get() }));
+}
+
 TEST_F(ViewTree, viewOfAnotherSuperviewChangesOver)
 {
     const auto first = added({ 0.0, 0.0, 100.0, 100.0 });
