@@ -4,6 +4,8 @@
 #include "appearance/PenwickBundle.h"
 #include "platform/foundation/FatalError.h"
 
+#include <utility>
+
 namespace penwick {
 
 namespace {
@@ -13,6 +15,10 @@ constexpr double side = 20.0; // points
 
 } // namespace
 
+DeleteTextBoxButton::DeleteTextBoxButton(QWidget *parent)
+    : Button(parent)
+{ }
+
 DeleteTextBoxButton::DeleteTextBoxButton(const platform::Rect &frame)
 {
     const platform::Point origin = originFor(frame);
@@ -21,6 +27,7 @@ DeleteTextBoxButton::DeleteTextBoxButton(const platform::Rect &frame)
     setImage(bundle->imageForResource(QStringLiteral("Delete_Text_Icon")));
     setAlternateImage(bundle->imageForResource(QStringLiteral("Delete_Text_Icon_Hover")));
     setHidden(true);
+    setAboveSiblings(true); // another box may lie there
     setAccessibleName(tr("Delete text"));
     setToolTip(accessibleName());
 }
@@ -32,13 +39,16 @@ platform::Point DeleteTextBoxButton::originFor(const platform::Rect &frame)
 
 void DeleteTextBoxButton::restoreImage()
 {
+    m_isHovered = false;
     if (!m_tempImage.isNull())
         setImage(m_tempImage);
 }
 
 void DeleteTextBoxButton::mouseEntered()
 {
-    m_tempImage = image();
+    // A desktop may tell of an entry twice without a leave between.
+    if (!std::exchange(m_isHovered, true))
+        m_tempImage = image();
     setImage(alternateImage());
     platform::Cursor::arrow().set(*this);
 }
@@ -48,7 +58,12 @@ void DeleteTextBoxButton::mouseExited()
     restoreImage();
 }
 
-void DeleteTextBoxButton::mouseMoved(const platform::MouseEvent &)
+void DeleteTextBoxButton::mouseMoved(const platform::MouseEvent &event)
+{
+    cursorUpdate(event);
+}
+
+void DeleteTextBoxButton::cursorUpdate(const platform::MouseEvent &)
 {
     platform::Cursor::arrow().set(*this);
 }

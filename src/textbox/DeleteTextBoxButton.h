@@ -13,6 +13,8 @@ class DeleteTextBoxButton final : public platform::Button
     Q_OBJECT
 
 public:
+    /// A button without images or a place; for a scene.
+    explicit DeleteTextBoxButton(QWidget *parent = nullptr);
     /// `frame` is the text box's.
     explicit DeleteTextBoxButton(const platform::Rect &frame);
 
@@ -26,9 +28,12 @@ public:
     void mouseEntered() override;
     void mouseExited() override;
     void mouseMoved(const platform::MouseEvent &event) override;
+    /// Sets the arrow, as every move over the button does.
+    void cursorUpdate(const platform::MouseEvent &event);
 
 private:
     QIcon m_tempImage;
+    bool m_isHovered = false;
 };
 
 } // namespace penwick

@@ -1,36 +1,58 @@
 // SPDX-License-Identifier: MIT
-#include "textbox/TextBoxGrowth.h"
+#include "textbox/TextBoxLayout.h"
 
+#include "textbox/TextBoxPlace.h"
+
+#include <QTextBlock>
 #include <QTextDocument>
+#include <QTextLayout>
 
 #include <algorithm>
 #include <cmath>
 
 namespace penwick {
 
-double widestTextBox(const platform::Rect &frame, double canvasWidth)
+namespace {
+
+/// Laying out is what a long text costs at every key: never twice for the same width.
+void setWidth(QTextDocument &text, double width)
 {
-    // In whole points, as the editor is: half a point less would wrap what has just fitted.
-    return std::max(smallestTextBox.width, std::floor(canvasWidth - frame.x));
+    if (text.textWidth() != width)
+        text.setTextWidth(width);
 }
 
-platform::Rect textBoxFrameFor(
-    const platform::Rect &frame, platform::Size needed, double canvasWidth)
+bool isWrapped(const QTextBlock &block)
 {
-    const double top = frame.maxY();
-    const double width
-        = std::clamp(needed.width, smallestTextBox.width, widestTextBox(frame, canvasWidth));
-    const double height = std::max(smallestTextBox.height, std::min(needed.height, top));
-    return { frame.x, top - height, width, height };
+    const QTextLayout &layout = *block.layout();
+    for (int number = 0; number + 1 < layout.lineCount(); ++number) {
+        const QTextLine line = layout.lineAt(number);
+        const int last = line.textStart() + line.textLength() - 1;
+        if (last < 0 || block.text().at(last) != QChar::LineSeparator)
+            return true;
+    }
+    return false;
 }
+
+bool isWrapped(const QTextDocument &text)
+{
+    for (QTextBlock block = text.begin(); block.isValid(); block = block.next()) {
+        if (isWrapped(block))
+            return true;
+    }
+    return false;
+}
+
+} // namespace
 
 // Measured as wide as the box may become, then laid out as wide as it will be, so that text from
 // the right to the left stands at the right edge of the box and not of the canvas.
-platform::Size layOutText(QTextDocument &text, const platform::Rect &frame, double canvasWidth)
+platform::Size layOutText(QTextDocument &text, double canvasWidth)
 {
-    text.setTextWidth(widestTextBox(frame, canvasWidth));
-    const double width = std::ceil(text.idealWidth());
-    text.setTextWidth(textBoxFrameFor(frame, { width, 0.0 }, canvasWidth).width);
+    const double widest = std::max(1.0, std::floor(canvasWidth));
+    setWidth(text, widest);
+    const double ideal = std::ceil(text.idealWidth()); // lays all of it out
+    const double width = isWrapped(text) ? widest : std::min(ideal, widest);
+    setWidth(text, std::min(std::max(width, smallestTextBox.width), widest));
     return { width, std::ceil(text.size().height()) };
 }
 

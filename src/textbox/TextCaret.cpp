@@ -6,11 +6,14 @@
 #include <QTextEdit>
 #include <QTimerEvent>
 
+#include <algorithm>
+
 namespace penwick {
 
 namespace {
 
 constexpr double caretWidth = 2.0; // points
+constexpr double distanceFromEdge = 3.0; // points; where a box has its border
 
 } // namespace
 
@@ -50,6 +53,9 @@ void TextCaret::paint(QPainter &painter) const
         return;
     QRectF place = m_editor.cursorRect();
     place.setWidth(caretWidth);
+    // An empty editor may be lower than a line of its font.
+    const double height = m_editor.viewport()->height();
+    place.setBottom(std::min(place.bottom(), height - distanceFromEdge));
     painter.fillRect(place, m_color);
 }
 

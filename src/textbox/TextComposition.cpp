@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/TextComposition.h"
 
+#include "textbox/TextEditing.h"
+
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QInputMethod>
@@ -41,13 +43,24 @@ QString compositionIn(const QTextEdit &editor)
     return all;
 }
 
+QList<QInputMethodEvent::Attribute> attributesWithin(
+    QList<QInputMethodEvent::Attribute> attributes, int length)
+{
+    for (QInputMethodEvent::Attribute &attribute : attributes) {
+        if (attribute.type == QInputMethodEvent::Selection)
+            continue; // it is about the text
+        attribute.start = std::min(attribute.start, length);
+        if (attribute.type != QInputMethodEvent::Cursor) // whose length is no stretch
+            attribute.length = std::min(attribute.length, length - attribute.start);
+    }
+    return attributes;
+}
+
 void commitCompositionIn(QTextEdit &editor)
 {
     if (!compositionIn(editor).isEmpty()) {
         // The toolkit would put the composition in the place of what is selected.
-        QTextCursor cursor = editor.textCursor();
-        cursor.clearSelection();
-        editor.setTextCursor(cursor);
+        clearSelectionIn(editor);
     }
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();

@@ -2,6 +2,8 @@
 // What an input method has half composed in an editor, and is not yet part of its text.
 #pragma once
 
+#include <QInputMethodEvent>
+#include <QList>
 #include <QString>
 
 class QTextEdit;
@@ -10,6 +12,10 @@ namespace penwick {
 
 /// The composition in the text, wherever it stands; empty where there is none.
 [[nodiscard]] QString compositionIn(const QTextEdit &editor);
+
+/// `attributes` for a composition of which only the first `length` characters are shown.
+[[nodiscard]] QList<QInputMethodEvent::Attribute> attributesWithin(
+    QList<QInputMethodEvent::Attribute> attributes, int length);
 
 /// Makes the composition part of the text. An editor that became read-only would drop it.
 void commitCompositionIn(QTextEdit &editor);

@@ -12,12 +12,19 @@
 
 namespace penwick {
 
+namespace {
+
+bool isReturn(const QKeyEvent &press)
+{
+    return press.key() == Qt::Key_Return || press.key() == Qt::Key_Enter;
+}
+
+} // namespace
+
 void endEditIn(QTextEdit &editor)
 {
     commitCompositionIn(editor);
-    QTextCursor cursor = editor.textCursor();
-    cursor.clearSelection();
-    editor.setTextCursor(cursor);
+    clearSelectionIn(editor);
     editor.document()->clearUndoRedoStacks();
     closeMenuOf(editor);
 }
@@ -32,10 +39,32 @@ void prepareForPress(QTextEdit &editor, const QMouseEvent &press)
         editor.setTextCursor(editor.cursorForPosition(press.position().toPoint()));
 }
 
+void clearSelectionIn(QTextEdit &editor)
+{
+    QTextCursor cursor = editor.textCursor();
+    cursor.clearSelection();
+    editor.setTextCursor(cursor);
+}
+
+QString typedBy(const QKeyEvent &press)
+{
+    if (isReturn(press))
+        return QStringLiteral("\n");
+    const QString text = press.text();
+    if (text.isEmpty())
+        return text;
+    const QChar first = text.front();
+    const auto modifiers = press.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier);
+    // Some write marks of direction with Ctrl and Shift. With Alt beside it, Ctrl is AltGr.
+    const bool isWritten = first.category() == QChar::Other_Format
+        || (modifiers != Qt::ControlModifier
+            && (first.isPrint() || first.category() == QChar::Other_PrivateUse));
+    return isWritten ? text : QString();
+}
+
 bool endsEditing(const QKeyEvent &press)
 {
-    const bool isReturn = press.key() == Qt::Key_Return || press.key() == Qt::Key_Enter;
-    return (isReturn && !press.modifiers().testFlag(Qt::ShiftModifier))
+    return (isReturn(press) && !press.modifiers().testFlag(Qt::ShiftModifier))
         || press.key() == Qt::Key_Tab || press.key() == Qt::Key_Backtab
         || press.key() == Qt::Key_Escape;
 }

@@ -2,6 +2,8 @@
 // What an editor does with presses and when an edit ends, beyond the toolkit's own.
 #pragma once
 
+#include <QString>
+
 class QKeyEvent;
 class QMouseEvent;
 class QTextEdit;
@@ -18,6 +20,12 @@ void endEditIn(QTextEdit &editor);
 /// caret where it is pressed, because the editor would drag what is selected in a loop of events of
 /// its own, in which the host may end the session.
 void prepareForPress(QTextEdit &editor, const QMouseEvent &press);
+
+/// Selects nothing any more; the caret stays.
+void clearSelectionIn(QTextEdit &editor);
+
+/// What `press` would write where it is no command of the editor's; empty for those that are.
+[[nodiscard]] QString typedBy(const QKeyEvent &press);
 
 /// Whether `press` is one of the keys that end an edit: Return without Shift, Tab and Escape.
 [[nodiscard]] bool endsEditing(const QKeyEvent &press);

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/TextEditor.h"
 
-#include "textbox/TextBoxGrowth.h"
+#include "textbox/TextBoxLayout.h"
 #include "textbox/TextComposition.h"
 #include "textbox/TextEditing.h"
 
@@ -11,12 +11,15 @@
 #include <QTextFrame>
 #include <QTextOption>
 
+#include <algorithm>
+
 namespace penwick {
 
 TextEditor::TextEditor(QTextDocument *text, QWidget *parent)
     : ViewOf(parent)
     , m_caret(*this)
     , m_hiding(*this)
+    , m_selection(*this)
 {
     if (text)
         setDocument(text);
@@ -115,7 +118,10 @@ void TextEditor::mouseReleaseEvent(QMouseEvent *event)
 
 void TextEditor::wheelEvent(QWheelEvent *event)
 {
-    event->ignore(); // a read-only editor would change its font's size
+    if (verticalScrollBar()->maximum() == 0 || event->modifiers().testFlag(Qt::ControlModifier))
+        event->ignore();
+    else // not by the editor, which would change its font's size where it is read-only
+        QAbstractScrollArea::wheelEvent(event); // NOLINT(bugprone-parent-virtual-call): as said
 }
 
 // Keys
@@ -124,12 +130,33 @@ void TextEditor::keyPressEvent(QKeyEvent *event)
 {
     if (endsEditing(*event)) {
         event->accept();
-        Q_EMIT endAsked();
+        if (event->key() == Qt::Key_Escape && !compositionIn(*this).isEmpty())
+            commitCompositionIn(*this);
+        else
+            Q_EMIT endAsked();
         return;
     }
     m_caret.restart();
-    if (!redoIfAsked(*this, *event))
+    if (!refuses(*event) && !redoIfAsked(*this, *event))
         ViewOf::keyPressEvent(event);
+}
+
+TextRoom TextEditor::room() const
+{
+    TextRoom room = roomAt(textCursor());
+    // What is half composed has its place already.
+    const auto composed = static_cast<int>(compositionIn(*this).size());
+    room.characters = std::max(0, room.characters - composed);
+    return room;
+}
+
+bool TextEditor::refuses(const QKeyEvent &press)
+{
+    const QString text = isEditable() ? typedBy(press) : QString();
+    const auto count = static_cast<int>(text.size() - fittingPart(text, room()).size());
+    if (count > 0)
+        Q_EMIT refused(count);
+    return count > 0;
 }
 
 // The editor's own would read an offer that has no format at all as if it had one, and crash.
@@ -137,14 +164,31 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
 {
     if (!isEditable() || !source || !source->hasText())
         return;
-    insertPlainText(source->text());
+    const QString text = source->text();
+    const QString taken = fittingPart(text, room());
+    if (!taken.isEmpty())
+        insertPlainText(taken);
     ensureCursorVisible();
+    if (taken.size() < text.size())
+        Q_EMIT refused(static_cast<int>(text.size() - taken.size()));
 }
 
 void TextEditor::inputMethodEvent(QInputMethodEvent *event)
 {
-    ViewOf::inputMethodEvent(event);
+    TextRoom room = roomAt(textCursor());
+    const QString commit = fittingPart(event->commitString(), room);
+    room.characters -= static_cast<int>(commit.size());
+    const QString half = fittingPart(event->preeditString(), room);
+    QInputMethodEvent fitting(
+        half, attributesWithin(event->attributes(), static_cast<int>(half.size())));
+    fitting.setCommitString(commit, event->replacementStart(), event->replacementLength());
+    ViewOf::inputMethodEvent(&fitting);
+    event->setAccepted(fitting.isAccepted());
     Q_EMIT writingChanged();
+    const auto count = (event->commitString().size() - commit.size())
+        + (event->preeditString().size() - half.size());
+    if (isEditable() && count > 0)
+        Q_EMIT refused(static_cast<int>(count));
 }
 
 void TextEditor::focusInEvent(QFocusEvent *event)

@@ -4,14 +4,17 @@
 
 #include "platform/ViewOf.h"
 #include "textbox/EditorHiding.h"
+#include "textbox/PlacedSelection.h"
 #include "textbox/TextCaret.h"
+#include "textbox/TextRoom.h"
 
 #include <QTextEdit>
 
 namespace penwick {
 
 /// Edits plain text, or shows it where it is not editable. It has no background, no frame and no
-/// scroll bars, and its size is its owner's to set.
+/// scroll bars, and its size is its owner's to set; what is longer is scrolled by the wheel. It
+/// takes only so much text (TextRoom.h), however that comes.
 ///
 /// Its own coordinates run downwards, as text does.
 class TextEditor : public platform::ViewOf<QTextEdit>
@@ -39,6 +42,8 @@ Q_SIGNALS:
     void writingChanged();
     /// A key was pressed that ends editing.
     void endAsked();
+    /// `count` characters were not taken: there is no room for them.
+    void refused(int count);
 
 protected:
     void mousePressEvent(QMouseEvent *event) override;
@@ -52,8 +57,12 @@ protected:
     void insertFromMimeData(const QMimeData *source) override;
 
 private:
+    [[nodiscard]] TextRoom room() const;
+    [[nodiscard]] bool refuses(const QKeyEvent &press);
+
     TextCaret m_caret;
     EditorHiding m_hiding;
+    PlacedSelection m_selection;
 };
 
 } // namespace penwick

@@ -6,7 +6,9 @@
 #include "appearance/ViewBorder.h"
 #include "platform/foundation/FatalError.h"
 #include "textbox/TextBoxFont.h"
-#include "textbox/TextBoxGrowth.h"
+#include "textbox/TextBoxLayout.h"
+#include "textbox/TextBoxNotice.h"
+#include "textbox/TextBoxPlace.h"
 #include "textbox/TextComposition.h"
 #include "textbox/TextEditing.h"
 
@@ -45,12 +47,36 @@ std::shared_ptr<TnTextBox> TnTextBox::create(
     return platform::makeView<TnTextBox>(frame, fontSize, fontColor);
 }
 
-TnTextBox::TnTextBox(const Rect &frame, double fontSize, const QColor &fontColor)
-    : m_textFontSize(fontSize)
-    , m_textFontColor(fontColor)
-    , m_panGesture([this](const auto &gesture) { handleGesture(gesture); })
+TnTextBox::TnTextBox(QTextDocument *textContainer, QWidget *parent)
+    : TextEditor(textContainer, parent)
+    , m_textFontColor(TextBoxParams::defaultTextFontColor)
+{
+    connect(this, &TextEditor::writingChanged, this, &TnTextBox::fitToText);
+    connect(this, &TextEditor::endAsked, this, &TnTextBox::endEditing);
+    connect(this, &TextEditor::refused, this, &TnTextBox::sayRefused);
+}
+
+TnTextBox::TnTextBox(QWidget *parent)
+    : TnTextBox(nullptr, parent)
+{ }
+
+TnTextBox::TnTextBox(const Rect &frame)
+    : TnTextBox(nullptr, nullptr)
 {
     setFrame(frame);
+}
+
+TnTextBox::TnTextBox(const Rect &frame, QTextDocument &textContainer)
+    : TnTextBox(&textContainer, nullptr)
+{
+    setFrame(frame);
+}
+
+TnTextBox::TnTextBox(const Rect &frame, double fontSize, const QColor &fontColor)
+    : TnTextBox(frame)
+{
+    m_textFontSize = fontSize;
+    m_textFontColor = fontColor;
     customizeTextBox();
 }
 
@@ -67,8 +93,14 @@ void TnTextBox::customizeTextBox()
     m_deleteTextButton = platform::makeView<DeleteTextBoxButton>(frame());
     connect(m_deleteTextButton.get(), &QAbstractButton::clicked, this, &TnTextBox::deleteTextBox);
     setAccessibleName(tr("Text box"));
-    connect(this, &TextEditor::writingChanged, this, &TnTextBox::fitToText);
-    connect(this, &TextEditor::endAsked, this, &TnTextBox::endEditing);
+}
+
+platform::PanGestureRecognizer &TnTextBox::panGesture()
+{
+    if (!m_panGesture)
+        m_panGesture = std::make_unique<platform::PanGestureRecognizer>(
+            [this](const auto &gesture) { handleGesture(gesture); });
+    return *m_panGesture;
 }
 
 Point TnTextBox::textContainerOrigin() const
@@ -135,10 +167,10 @@ void TnTextBox::mouseDown(const platform::MouseEvent &event)
 {
     if (event.clickCount == 1 && !isEditable()) {
         m_hasDashedBorder = false;
-        addGestureRecognizer(m_panGesture);
+        addGestureRecognizer(panGesture());
         showPlacedBorder();
     } else if (event.clickCount == 2) {
-        removeGestureRecognizer(m_panGesture);
+        removeGestureRecognizer(panGesture());
         setEditable(true);
         if (platform::Layer *const ownLayer = layer())
             ownLayer->borderWidth = 0.0;
@@ -178,6 +210,8 @@ void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)
     if (gesture.state() == platform::PanGestureRecognizer::State::Began)
         m_mouseDownPoint = location - frame().origin();
     setFrameOrigin(location - m_mouseDownPoint);
+    if (gesture.state() == platform::PanGestureRecognizer::State::Ended && superview())
+        setFrame(frameInReach(frame(), superview()->bounds().size()));
 }
 
 // Keys
@@ -204,9 +238,13 @@ bool TnTextBox::resignFirstResponder()
     setEditable(false);
     showPlacedBorder();
     m_hasDashedBorder = false;
-    addGestureRecognizer(m_panGesture);
-    m_deleteTextButton->setHidden(true);
-    m_deleteTextButton->restoreImage(); // hidden under the pointer, it may not hear that this left
+    addGestureRecognizer(panGesture());
+    if (m_deleteTextButton) {
+        m_deleteTextButton->setHidden(true);
+        m_deleteTextButton->restoreImage(); // hidden, it may not hear that the pointer left
+    }
+    verticalScrollBar()->setValue(0); // what is too long for the canvas is read from its beginning
+    setAccessibleDescription({});
     if (isEmpty()) {
         m_isTextBoxDeleted = true;
         removeAndReport();
@@ -225,7 +263,8 @@ void TnTextBox::viewDidMoveToWindow()
 
 void TnTextBox::deleteTextBox()
 {
-    m_deleteTextButton->restoreImage();
+    if (m_deleteTextButton)
+        m_deleteTextButton->restoreImage();
     removeAndReport();
 }
 
@@ -245,19 +284,44 @@ void TnTextBox::fitToText()
 {
     if (m_isFitting || !superview())
         return;
+    m_isWritten = m_isWritten || !isEmpty() || !compositionIn(*this).isEmpty();
+    if (!m_isWritten)
+        return; // it stands where it was clicked until the first letter
     m_isFitting = true;
-    const double canvasWidth = superview()->bounds().width;
-    const platform::Size needed = layOutText(*document(), frame(), canvasWidth);
-    const Rect fitted = textBoxFrameFor(frame(), needed, canvasWidth);
-    if (!(fitted == frame())) {
-        setFrame(fitted);
-        setNeedsDisplay();
-    }
-    if (needed.height <= fitted.height)
+    const platform::Size canvas = superview()->bounds().size();
+    const platform::Size needed = layOutText(*document(), canvas.width);
+    moveInto(frameInSight(frame(), needed, canvas));
+    if (needed.height <= frame().height)
         verticalScrollBar()->setValue(0);
     else
         ensureCursorVisible();
     m_isFitting = false;
+}
+
+void TnTextBox::moveInto(const Rect &frame)
+{
+    if (frame == this->frame())
+        return;
+    setFrame(frame);
+    setNeedsDisplay(); // and with it the delete button goes along
+}
+
+void TnTextBox::superviewDidResize(platform::Size former)
+{
+    const platform::Size canvas = superview()->bounds().size();
+    if (!isEditable() || (canvas.width >= former.width && canvas.height >= former.height))
+        return;
+    if (m_isWritten)
+        fitToText();
+    else
+        moveInto(frameInSight(frame(), frame().size(), canvas));
+}
+
+void TnTextBox::sayRefused(int count)
+{
+    sayAt(*this,
+        count == 1 ? tr("One character did not fit into this text box.")
+                   : tr("%L1 characters did not fit into this text box.").arg(count));
 }
 
 } // namespace penwick

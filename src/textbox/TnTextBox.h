@@ -33,6 +33,11 @@ public:
     static std::shared_ptr<TnTextBox> create(
         const platform::Rect &frame, double fontSize, const QColor &fontColor);
 
+    // The other constructors leave the setting up to customizeTextBox(): a scene's, one for a
+    // frame, and one that shows `textContainer`, which must outlive the box.
+    explicit TnTextBox(QWidget *parent = nullptr);
+    explicit TnTextBox(const platform::Rect &frame);
+    TnTextBox(const platform::Rect &frame, QTextDocument &textContainer);
     TnTextBox(const platform::Rect &frame, double fontSize, const QColor &fontColor);
     ~TnTextBox() override;
 
@@ -43,8 +48,21 @@ public:
     [[nodiscard]] platform::Point mouseDownPoint() const { return m_mouseDownPoint; }
     /// Whether the box looks edited: dashed border and delete button.
     [[nodiscard]] bool hasDashedBorder() const { return m_hasDashedBorder; }
+    /// The area in which pointer moves are to be followed. Reserved: a widget hears of all of them.
+    [[nodiscard]] const std::optional<platform::Rect> &trackingArea() const
+    {
+        return m_trackingArea;
+    }
+    void setTrackingArea(const std::optional<platform::Rect> &area) { m_trackingArea = area; }
+    /// The canvas that holds the box. Reserved: superview() tells it. Weak.
+    [[nodiscard]] platform::View *textParentView() const { return m_textParentView.get(); }
+    void setTextParentView(platform::View *view) { m_textParentView = view; }
+    // Taken by customizeTextBox(); later changes are for the next call of it.
     [[nodiscard]] double textFontSize() const { return m_textFontSize; } ///< points
+    void setTextFontSize(double size) { m_textFontSize = size; }
     [[nodiscard]] const QColor &textFontColor() const { return m_textFontColor; }
+    void setTextFontColor(const QColor &color) { m_textFontColor = color; }
+    /// Null before customizeTextBox().
     [[nodiscard]] DeleteTextBoxButton *deleteTextButton() const { return m_deleteTextButton.get(); }
     /// The hint that an empty box shows.
     [[nodiscard]] const platform::AttributedString &placeholderAttributedString() const
@@ -53,7 +71,12 @@ public:
     }
     /// Whether the box has deleted itself; not any more once it is back on a canvas.
     [[nodiscard]] bool isTextBoxDeleted() const { return m_isTextBoxDeleted; }
-    [[nodiscard]] platform::PanGestureRecognizer &panGesture() { return m_panGesture; }
+    /// What drags the placed box; made when it is first asked for.
+    [[nodiscard]] platform::PanGestureRecognizer &panGesture();
+
+    /// Makes the box ready to be edited, in its font size and colour. Without the component's
+    /// bundle the process stops.
+    void customizeTextBox();
 
     /// Where the text begins, from the box's top left corner: smaller fonts stand lower.
     [[nodiscard]] platform::Point textContainerOrigin() const;
@@ -70,6 +93,7 @@ public:
     void mouseMoved(const platform::MouseEvent &event) override;
     void keyUp(const platform::KeyEvent &event) override;
     void viewDidMoveToWindow() override;
+    void superviewDidResize(platform::Size former) override;
     bool resignFirstResponder() override;
 
     /// The box follows the pointer.
@@ -78,25 +102,30 @@ public:
     void deleteTextBox();
 
 private:
-    void customizeTextBox();
+    TnTextBox(QTextDocument *textContainer, QWidget *parent);
     void showPlacedBorder();
     void showDeleteTextButton();
     void removeAndReport();
     void endEditing();
+    void sayRefused(int count);
     void fitToText();
+    void moveInto(const platform::Rect &frame);
     void drawPlaceholder();
 
     platform::Point m_mouseDownPoint; // of the grab, from the box's origin
     bool m_hasDashedBorder = true;
-    double m_textFontSize;
+    std::optional<platform::Rect> m_trackingArea;
+    platform::WeakReference<platform::View> m_textParentView;
+    double m_textFontSize = 14.0;
     QColor m_textFontColor;
     std::shared_ptr<DeleteTextBoxButton> m_deleteTextButton;
     platform::WeakReference<TextBoxDelegate> m_textBoxDelegate;
     platform::AttributedString m_placeholderAttributedString;
     bool m_isTextBoxDeleted = false;
-    platform::PanGestureRecognizer m_panGesture;
+    std::unique_ptr<platform::PanGestureRecognizer> m_panGesture;
     std::optional<platform::Cursor> m_pointer; // for the mode that m_pointerIsForText says
     bool m_pointerIsForText = false;
+    bool m_isWritten = false; // something was in it once
     bool m_isFitting = false;
 };
 

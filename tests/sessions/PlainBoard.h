@@ -42,6 +42,8 @@ public:
     void copyElsewhere(const std::string &text) { m_clipboard = text; }
     /// What the step has left to the editor is taken over, where it may be that.
     void adopt(const std::string &box, const std::string &now, const std::string &composed);
+    void adoptFrame(const std::string &box, Spot corner, Spot boxSize, Spot canvasSize);
+    void adoptSize(Spot canvasSize) { m_canvas.adoptSize(canvasSize); } ///< after the frames
     void adoptClipboard(const std::string &now);
 
     // The menu of a box; it may stay open while other things happen

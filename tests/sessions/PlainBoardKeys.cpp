@@ -18,9 +18,12 @@ void PlainBoard::key(const std::string &name)
 void PlainBoard::boxKey(const std::string &box, const std::string &name)
 {
     const bool isEditable = m_canvas.allBoxes.at(box).isEditable;
-    if (name == "Return" || name == "Tab" || name == "Escape") {
+    PlainText &text = m_canvas.allBoxes.at(box).text;
+    if (name == "Escape" && !text.composed().empty()) {
+        text.commit();
+    } else if (name == "Return" || name == "Tab" || name == "Escape") {
         m_canvas.endEditing();
-    } else if (name == "BackSpace") {
+    } else if (name == "BackSpace" || name == "Delete") {
         if (!isEditable)
             windowKey(name);
         m_canvas.backspace();
@@ -81,6 +84,11 @@ void PlainBoard::editIn(const std::string &box, const std::string &key)
 void PlainBoard::adopt(const std::string &box, const std::string &now, const std::string &composed)
 {
     m_canvas.allBoxes.at(box).text.adopt(now, composed);
+}
+
+void PlainBoard::adoptFrame(const std::string &box, Spot corner, Spot boxSize, Spot canvasSize)
+{
+    m_canvas.adoptFrame(box, corner, boxSize, canvasSize);
 }
 
 // What was selected is the editor's to know: a copy is some part of the text, and what is cut the

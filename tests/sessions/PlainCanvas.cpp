@@ -128,11 +128,36 @@ void PlainCanvas::dragBox(const std::string &name, Spot spot)
 
 void PlainCanvas::releaseBox(const std::string &name, Spot spot)
 {
-    if (m_isPanning)
+    if (m_isPanning) {
         dragBox(name, spot);
+        bringIntoReach(allBoxes.at(name));
+    }
     m_canPan = false;
     m_isPanning = false;
     makeFirstResponder(name);
+}
+
+void PlainCanvas::bringIntoReach(PlainBox &box) const
+{
+    const auto reaching = [](double place, double length, double end) {
+        return std::max(20 - length, std::min(place, end - 20));
+    };
+    box.x = reaching(box.x, box.size.x, m_size.x);
+    box.top = reaching(box.top - box.size.y, box.size.y, m_size.y) + box.size.y;
+}
+
+void PlainCanvas::adoptFrame(const std::string &name, Spot corner, Spot boxSize, Spot canvasSize)
+{
+    PlainBox &box = allBoxes.at(name);
+    const bool isResized = !(canvasSize == m_size);
+    const bool mayMove = box.text.wasTouched() || (isResized && box.isEditable);
+    box.size = boxSize;
+    const bool isInSight = corner.x >= 0 && corner.y <= canvasSize.y
+        && corner.x + boxSize.x <= canvasSize.x && corner.y - boxSize.y >= 0;
+    if (mayMove && isInSight) {
+        box.x = corner.x;
+        box.top = corner.y;
+    }
 }
 
 // Keys

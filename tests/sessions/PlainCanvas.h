@@ -23,6 +23,7 @@ struct PlainBox
     PlainText text;
     double x = 0.0;
     double top = 0.0;
+    Spot size { 200, 30 }; ///< its fonts' business: taken over
 };
 
 /// The canvas view, its controller and the text boxes, as one plain machine.
@@ -49,6 +50,11 @@ public:
     void backspace(); ///< pressed and let go, at the end of the text
     void releaseBackspace(); ///< let go; the press was the editor's
     void endEditing() { makeFirstResponder("canvas"); }
+
+    /// Where a box really stands, on a canvas of that size. Its own size is taken over; its place
+    /// if what was written in it, or a window that was resized, may have moved it there.
+    void adoptFrame(const std::string &name, Spot corner, Spot boxSize, Spot canvasSize);
+    void adoptSize(Spot canvasSize) { m_size = canvasSize; } ///< after the frames
 
     // What the tool bar asks for; "state" is not the canvas's
     void chooseTool(const std::string &tool);
@@ -89,6 +95,7 @@ private:
     void eraseUpTo(Spot spot);
     void clear();
     [[nodiscard]] bool isOnCanvas(const std::string &view) const;
+    void bringIntoReach(PlainBox &box) const;
 
     PlainDrawing &m_drawing;
     std::string m_responder; // empty: the window itself
@@ -101,6 +108,7 @@ private:
     bool m_canPan = false; // of the box that is held down
     bool m_isPanning = false;
     Spot m_pressed;
+    Spot m_size; // of the canvas
     Spot m_grabbed; // the box's place when it was pressed
 };
 

@@ -21,6 +21,7 @@ bool isReplaced(const std::string &before, const std::string &put, const std::st
 void PlainText::append(const std::string &put)
 {
     m_now += put;
+    m_isTouched = true;
     m_stood.insert(m_now);
 }
 
@@ -28,18 +29,21 @@ void PlainText::backspace()
 {
     if (!m_now.empty())
         m_now.pop_back();
+    m_isTouched = true;
     m_stood.insert(m_now);
 }
 
 // Whatever is typed, pasted, dropped, cut or deleted takes the place of what is selected.
 void PlainText::replace(const std::string &put)
 {
+    m_isTouched = true;
     m_may = [before = m_now, put](const auto &now) { return isReplaced(before, put, now); };
 }
 
 // How many letters go back together is the editor's choice; that they stood there is not.
 void PlainText::goBack()
 {
+    m_isTouched = true;
     m_may = [this](const auto &now) { return m_stood.count(now) > 0; };
 }
 

@@ -5,6 +5,7 @@
 #include <functional>
 #include <set>
 #include <string>
+#include <utility>
 
 namespace penwick::sessions {
 
@@ -37,6 +38,9 @@ public:
     void commit(const std::string &whole); ///< in the place of what was composed
     void commit() { commit(std::string(m_composed)); } ///< what was composed
 
+    /// Whether anything was done to the text since this was asked last.
+    [[nodiscard]] bool wasTouched() { return std::exchange(m_isTouched, false); }
+
     /// Whether the last step left something to the editor.
     [[nodiscard]] bool isOpen() const { return static_cast<bool>(m_may); }
     /// Takes the editor's text over, if it may be this one; once after each step that left it open.
@@ -47,6 +51,7 @@ private:
     std::string m_composed;
     std::set<std::string> m_stood = { "" }; // since the edit began
     std::function<bool(const std::string &now)> m_may;
+    bool m_isTouched = false;
 };
 
 } // namespace penwick::sessions

@@ -56,6 +56,10 @@ public:
     [[nodiscard]] std::string targetAt(Spot spot) const;
     [[nodiscard]] Spot size() const; ///< of the canvas
     [[nodiscard]] QPointF onDesktop(Spot spot) const;
+    /// A box's top left corner and its size.
+    [[nodiscard]] bool isOnCanvas(const std::string &box) const;
+    [[nodiscard]] Spot cornerOf(const std::string &box) const;
+    [[nodiscard]] Spot sizeOf(const std::string &box) const;
     /// The middle of what can be seen of a box or a delete button; the canvas's if nothing can.
     [[nodiscard]] Spot middleOf(const std::string &view) const;
 

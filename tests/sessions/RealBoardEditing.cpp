@@ -58,6 +58,23 @@ const TnTextBox *RealBoard::boxCalled(const std::string &name) const
     return nullptr;
 }
 
+bool RealBoard::isOnCanvas(const std::string &box) const
+{
+    return boxCalled(box);
+}
+
+Spot RealBoard::cornerOf(const std::string &box) const
+{
+    const platform::Rect frame = boxCalled(box)->frame();
+    return { frame.x, frame.maxY() };
+}
+
+Spot RealBoard::sizeOf(const std::string &box) const
+{
+    const platform::Size size = boxCalled(box)->frame().size();
+    return { size.width, size.height };
+}
+
 std::string RealBoard::textOf(const std::string &box) const
 {
     const TnTextBox *const found = boxCalled(box);

@@ -54,7 +54,10 @@ void Session::adopt()
         const auto box = m_plain->canvas().allBoxes.find(view);
         if (box != m_plain->canvas().allBoxes.end() && box->second.text.isOpen())
             m_plain->adopt(view, m_real.textOf(view), m_real.composedIn(view));
+        if (box != m_plain->canvas().allBoxes.end() && m_real.isOnCanvas(view))
+            m_plain->adoptFrame(view, m_real.cornerOf(view), m_real.sizeOf(view), m_real.size());
     }
+    m_plain->adoptSize(m_real.size());
     m_plain->adoptClipboard(RealBoard::clipboard());
 }
 

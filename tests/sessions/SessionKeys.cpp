@@ -20,8 +20,10 @@ void Session::key(const Step &step)
 {
     static const std::vector<std::string> names { "b", "t", "e", "c", "BackSpace", "BackSpace",
         "Return", "Tab", "Escape", "1", "2", "4", "9", "C-z", "C-z", "C-y", "C-Delete", "C-w" };
-    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
+    std::string name = names[static_cast<std::size_t>(step.a) % names.size()];
     const bool isEditing = !m_plain->canvas().editedBox().empty();
+    if (!isEditing && name == "BackSpace" && step.b % 2)
+        name = "Delete";
     const bool isTyped = isEditing && (name.size() == 1 || name == "BackSpace");
     if (isTyped && isComposing())
         return; // the input method takes it

@@ -85,6 +85,49 @@ TEST_F(DeleteTextBoxButtonTest, showsTheHoverImageWhileThePointerIsOverItAndTheA
     EXPECT_EQ(shown(m_button->image()), artwork(m_normal));
 }
 
+TEST_F(DeleteTextBoxButtonTest, enteredTwiceWithoutALeaveItGoesBackToTheNormalImage)
+{
+    enter();
+    enter();
+    EXPECT_EQ(shown(m_button->image()), artwork(m_hover));
+    EXPECT_EQ(shown(m_button->tempImage()), artwork(m_normal));
+
+    exit();
+    EXPECT_EQ(shown(m_button->image()), artwork(m_normal));
+}
+
+TEST_F(DeleteTextBoxButtonTest, imageThatIsGivenBetweenTwoHoversIsTheNormalOneFromThenOn)
+{
+    enter();
+    exit();
+    m_button->setImage(penwickBundle()->imageForResource(QStringLiteral("tool_text")));
+
+    enter();
+    exit();
+
+    EXPECT_EQ(shown(m_button->image()), artwork(QStringLiteral("tool_text")));
+}
+
+TEST_F(DeleteTextBoxButtonTest, ofASceneHasNoImages)
+{
+    const DeleteTextBoxButton button;
+
+    EXPECT_TRUE(button.tempImage().isNull());
+    EXPECT_TRUE(button.image().isNull());
+    EXPECT_FALSE(button.isHidden());
+}
+
+TEST_F(DeleteTextBoxButtonTest, cursorUpdateSetsTheArrow)
+{
+    const platform::Cursor brush(m_button->image(), { 0, 0 });
+    brush.set(*m_button);
+
+    m_button->cursorUpdate({});
+
+    EXPECT_EQ(m_button->cursor().shape(), Qt::ArrowCursor);
+    EXPECT_EQ(platform::Cursor::currentCursor(), platform::Cursor::arrow());
+}
+
 TEST_F(DeleteTextBoxButtonTest, keepsTheArrowWhileThePointerMovesOverIt)
 {
     const platform::Cursor brush(m_button->image(), { 0, 0 });

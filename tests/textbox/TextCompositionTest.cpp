@@ -63,6 +63,39 @@ TEST_F(TextCompositionTest, isPartOfTheTextOnceTheBoxIsLeft)
     EXPECT_EQ(box->superview(), canvas);
 }
 
+TEST_F(TextCompositionTest, isEndedByEscapeFirstAndTheEditingOnlyThen)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+
+    QTest::keyClick(box.get(), Qt::Key_Escape);
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), m_half); // the input method has let the key through
+    EXPECT_TRUE(box->isEditable());
+    EXPECT_EQ(window.firstResponder(), box.get());
+
+    QTest::keyClick(box.get(), Qt::Key_Escape);
+    EXPECT_FALSE(box->isEditable());
+}
+
+TEST_F(TextCompositionTest, thatIsCutShortKeepsItsLook)
+{
+    using Attribute = QInputMethodEvent::Attribute;
+    const QList<Attribute> whole { { QInputMethodEvent::TextFormat, 1, 4, {} },
+        { QInputMethodEvent::TextFormat, 5, 2, {} }, { QInputMethodEvent::Cursor, 6, 1, {} },
+        { QInputMethodEvent::Selection, 9, 2, {} } };
+
+    const QList<Attribute> cut = attributesWithin(whole, 3);
+
+    ASSERT_EQ(cut.size(), 4);
+    const auto placesOf
+        = [&](int number) { return std::pair(cut[number].start, cut[number].length); };
+    EXPECT_EQ(placesOf(0), std::pair(1, 2));
+    EXPECT_EQ(placesOf(1), std::pair(3, 0));
+    EXPECT_EQ(placesOf(2), std::pair(3, 1)); // shown or not: no stretch
+    EXPECT_EQ(placesOf(3), std::pair(9, 2)); // in the text
+}
+
 TEST_F(TextCompositionTest, keepsABoxThatHasNothingElseFromBeingDeleted)
 {
     const auto box = newBox();

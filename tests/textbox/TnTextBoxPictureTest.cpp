@@ -3,6 +3,7 @@
 #include "textbox/TextBoxFixture.h"
 
 #include <QInputMethodEvent>
+#include <QPainter>
 
 namespace penwick::test {
 namespace {
@@ -125,6 +126,27 @@ TEST_F(TnTextBoxPictureTest, emptyBoxShowsThePlaceholderInHalfTheTextsColour)
     EXPECT_EQ(box->toPlainText(), QString());
 }
 
+TEST_F(TnTextBoxPictureTest, placeholderBeginsWhereTheTextDoes)
+{
+    const auto box = newBox();
+    leave();
+    box->show();
+    QImage expected(box->size(), QImage::Format_RGB32);
+    expected.fill(Qt::white);
+    QPainter painter(&expected);
+    const platform::AttributedString &hint = box->placeholderAttributedString();
+    painter.setFont(hint.font);
+    painter.setPen(hint.foregroundColor);
+    painter.drawText(QRectF(5, 6, 190, 24), Qt::AlignTop | Qt::AlignJustify, hint.string);
+    painter.end();
+
+    QImage shown(box->size(), QImage::Format_RGB32);
+    shown.fill(Qt::white);
+    box->render(&shown, {}, {}, QWidget::DrawChildren);
+
+    EXPECT_EQ(inside(shown), inside(expected));
+}
+
 TEST_F(TnTextBoxPictureTest, placeholderIsGoneOnceThereIsText)
 {
     const auto box = newBox();
@@ -178,6 +200,22 @@ TEST_F(TnTextBoxPictureTest, caretIsInTheTextsColourAndOnlyWhileEditing)
     leave();
     const QPoint end = box->cursorRect().topLeft() + QPoint(0, 4);
     EXPECT_EQ(pictureOf(*box).pixelColor(end), QColor(Qt::white));
+}
+
+TEST_F(TnTextBoxPictureTest, caretIsPaintedOnlyWhereTheKeysGo)
+{
+    canvas->setBrushColor(TnhColors::redColor);
+    const auto box = newBox();
+    const QPoint caret = box->cursorRect().topLeft() + QPoint(0, 4);
+    ASSERT_EQ(pictureOf(*box).pixelColor(caret), TnhColors::redColor);
+
+    box->clearFocus();
+    QFocusEvent in(QEvent::FocusIn, Qt::OtherFocusReason); // said to come, and gone again
+    QCoreApplication::sendEvent(box.get(), &in);
+    ASSERT_FALSE(box->hasFocus());
+    settle();
+
+    EXPECT_NE(pictureOf(*box).pixelColor(caret), TnhColors::redColor);
 }
 
 TEST_F(TnTextBoxPictureTest, shorterDirtyRectangleDrawsNoDashedBorder)

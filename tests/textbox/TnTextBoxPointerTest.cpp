@@ -4,6 +4,9 @@
 
 #include "appearance/ToolCursors.h"
 
+#include <QMenu>
+#include <QScrollBar>
+
 namespace penwick::test {
 namespace {
 
@@ -42,6 +45,58 @@ TEST_F(TnTextBoxPointerTest, dragOfAPlacedBoxKeepsThePointUnderThePointer)
     EXPECT_EQ(box->panGesture().state(), State::Ended);
     EXPECT_EQ(window.firstResponder(), box.get());
     EXPECT_FALSE(box->isEditable());
+}
+
+TEST_F(TnTextBoxPointerTest, releaseMovesTheBoxToo)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 40, 10 });
+
+    releaseOn(*box, { 45, 16 }); // 15 to the right and 6 down of where the box is by now
+
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 25, -6 }));
+}
+
+TEST_F(TnTextBoxPointerTest, grabIsInTheCoordinatesOfTheWindowsContentView)
+{
+    const auto box = placedBox();
+    canvas->setFrame({ 10, 5, width, height });
+    const Rect before = box->frame();
+
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 45, 30 });
+    releaseOn(*box, { 30, 10 });
+
+    EXPECT_EQ(box->mouseDownPoint(), (Point { 30, before.height - 10 }));
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 15, -20 }));
+}
+
+TEST_F(TnTextBoxPointerTest, clickOnAPlacedBoxAddsTheGesture)
+{
+    const auto box = placedBox();
+    const Rect before = box->frame();
+    box->removeGestureRecognizer(box->panGesture());
+
+    pressOn(*box, { 30, 10 });
+    dragOn(*box, { 45, 10 });
+
+    EXPECT_EQ(box->frame().origin(), before.origin() + (Point { 15, 0 }));
+}
+
+TEST_F(TnTextBoxPointerTest, leavingABoxAddsTheGesture)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("Hello"));
+    const Rect before = box->frame();
+    pressOn(*box, { 30, 10 }); // into what is edited: this adds none
+
+    leave();
+    box->panGesture().pressed(before.origin());
+    dragOn(*box, { 45, 10 });
+
+    EXPECT_EQ(box->panGesture().state(), State::Changed);
 }
 
 TEST_F(TnTextBoxPointerTest, secondDragStartsWhereTheFirstEnded)
@@ -172,6 +227,101 @@ TEST_F(TnTextBoxPointerTest, pointerIsTheTextCursorAgainAfterADoubleClick)
     moveOver(*box, { 31, 10 });
 
     EXPECT_EQ(lookOver(*box), lookOf(QStringLiteral("Text_Cursor")));
+}
+
+TEST_F(TnTextBoxPointerTest, cursorIsNotSetAgainWhileThePointerMoves)
+{
+    class Counter final : public QObject
+    {
+    public:
+        bool eventFilter(QObject *, QEvent *event) override
+        {
+            count += event->type() == QEvent::CursorChange;
+            return false;
+        }
+        int count = 0;
+    } changes;
+    const auto box = placedBox();
+    box->viewport()->installEventFilter(&changes);
+
+    for (int x = 20; x < 60; ++x)
+        moveOver(*box, QPointF(x, 10));
+
+    EXPECT_EQ(changes.count, 1);
+}
+
+// What is selected in a placed box
+
+TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxIsGoneOnceSomethingElseIsPressed)
+{
+    const auto box = placedBox();
+    const auto other = placedBox({ 20, 60 });
+    const QImage before = pictureOf(*box);
+    const std::vector<std::pair<const char *, platform::View *>> places { { "canvas", canvas },
+        { "box", other.get() } };
+    for (const auto &[name, view] : places) {
+        for (const Qt::MouseButton button : { Qt::LeftButton, Qt::RightButton }) {
+            box->selectAll();
+            ASSERT_TRUE(box->textCursor().hasSelection());
+
+            pressOn(*view, { 250, 10 }, QEvent::MouseButtonPress, button);
+            releaseOn(*view, { 250, 10 }, button);
+            settle();
+
+            EXPECT_FALSE(box->textCursor().hasSelection()) << name << button;
+            EXPECT_EQ(pictureOf(*box), before) << name << button;
+        }
+    }
+}
+
+TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxIsGoneOnceAnotherWindowIsPressed)
+{
+    const auto box = placedBox();
+    platform::Window panel;
+    box->selectAll();
+
+    QTest::mouseClick(&panel, Qt::LeftButton);
+
+    EXPECT_FALSE(box->textCursor().hasSelection());
+}
+
+TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxStaysForItsOwnMenu)
+{
+    const auto box = placedBox();
+    box->selectAll();
+    const std::unique_ptr<QMenu> menu(box->createStandardContextMenu());
+
+    clickOn(*box, { 50, 15 }, Qt::RightButton);
+    QMouseEvent press(QEvent::MouseButtonPress, QPointF(1, 1), QPointF(1, 1), Qt::LeftButton,
+        Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(menu.get(), &press);
+
+    EXPECT_EQ(box->textCursor().selectedText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TnTextBoxPointerTest, whatIsDroppedOfASelectionScrollsNothing)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("1\n2\n3\n4\n5\n6\n7\n8\n9"));
+    leave();
+    box->selectAll();
+
+    press({ 280, 190 });
+
+    EXPECT_FALSE(box->textCursor().hasSelection());
+    EXPECT_EQ(box->verticalScrollBar()->value(), 0);
+}
+
+TEST_F(TnTextBoxPointerTest, selectionInABoxThatIsEditedStaysWhateverIsPressedThatDoesNotEndTheEdit)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("Hello"));
+    box->selectAll();
+    platform::Window panel;
+
+    QTest::mouseClick(&panel, Qt::LeftButton);
+
+    EXPECT_EQ(box->textCursor().selectedText(), QStringLiteral("Hello"));
 }
 
 // Other buttons

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: MIT
+#include "textbox/PlacedSelection.h"
+
+#include "textbox/TextEditing.h"
+
+#include <QCoreApplication>
+#include <QEvent>
+#include <QScrollBar>
+#include <QTextEdit>
+
+namespace penwick {
+
+namespace {
+
+/// Its menu included, which is a window of its own.
+bool belongsTo(const QTextEdit &editor, const QObject *object)
+{
+    while (object && object != &editor)
+        object = object->parent();
+    return object;
+}
+
+} // namespace
+
+PlacedSelection::PlacedSelection(QTextEdit &editor)
+    : m_editor(editor)
+{
+    connect(&editor, &QTextEdit::selectionChanged, this, &PlacedSelection::listenIfNeeded);
+}
+
+void PlacedSelection::listenIfNeeded()
+{
+    if (m_editor.isReadOnly() && m_editor.textCursor().hasSelection())
+        QCoreApplication::instance()->installEventFilter(this);
+    else
+        QCoreApplication::instance()->removeEventFilter(this);
+}
+
+bool PlacedSelection::eventFilter(QObject *watched, QEvent *event)
+{
+    const bool isPress = event->type() == QEvent::MouseButtonPress && watched->isWidgetType();
+    if (!isPress || belongsTo(m_editor, watched))
+        return false;
+    QScrollBar &scroll = *m_editor.verticalScrollBar();
+    const int seen = scroll.value();
+    clearSelectionIn(m_editor);
+    scroll.setValue(seen); // where the caret would be is of no interest
+    return false;
+}
+
+} // namespace penwick
