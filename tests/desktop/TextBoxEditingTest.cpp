@@ -159,7 +159,7 @@ INSTANTIATE_TEST_SUITE_P(Buttons, TextBoxOtherButton,
     testing::Values(MouseButton::Middle, MouseButton::Right),
     [](const auto &button) { return button.param == MouseButton::Middle ? "middle" : "right"; });
 
-TEST_F(TextBoxEditing, tenThousandCharactersInOneWordLeaveTheBoardUsable)
+TEST_F(TextBoxEditing, longestWordThatABoxTakesLeavesTheBoardUsable)
 {
     openForText();
     const QPoint corner = makeBox(place);
@@ -172,15 +172,36 @@ TEST_F(TextBoxEditing, tenThousandCharactersInOneWordLeaveTheBoardUsable)
         keyboard.pressWith("Control_L", "v");
     }
 
-    click({ 400, 100 }); // above the box, which reaches down to the board's end
+    keyboard.press("Return");
+    drag({ { 700, 100 }, { 700, 300 } }); // the box, which has covered all of the board
 
-    // Its scrolled text runs below the top border: the left one is looked at.
-    const QRect leftBorder(corner + QPoint(0, 50), QSize(3, 50));
-    EXPECT_TRUE(waitUntil([&] { return extentOf(placedBorder, leftBorder) == leftBorder; }));
+    const QRect topBorder(QPoint(600, 200), QSize(50, 3));
+    EXPECT_TRUE(waitUntil(
+        [&] { return extentOf(placedBorder, topBorder.adjusted(0, -10, 0, 2)) == topBorder; }));
     host().selectTool(QStringLiteral("brush"));
     drag({ { 300, 60 }, { 500, 60 } });
     waitForLevel({ 498, 60 }, inkOnWhite);
     EXPECT_EQ(host().errorOutput(), QString());
+}
+
+TEST_F(TextBoxEditing, boxClickedInACornerIsSeenWholeFromTheFirstLetterOn)
+{
+    openForText();
+    const QSize board = canvas().size();
+    const QPoint clicked(board.width() - 30, board.height() - 10);
+    click(clicked);
+    ASSERT_TRUE(comesToBeEdited(boxOf(clicked)));
+
+    desktop().keyboard().type("a");
+
+    // As high as its line, at the bottom, with room for the delete button beside it.
+    const int left = board.width() - newBoxSize.width() - 21;
+    const QRect area(QPoint(left - 5, board.height() - 60), QSize(240, 60));
+    EXPECT_TRUE(waitUntil([&] { return extentOf(editBorder, area).left() == left + 1; }));
+    const QRect border = extentOf(editBorder, area);
+    EXPECT_EQ(border.right(), left + newBoxSize.width() - 1);
+    const QPoint corner(left, border.top() - 1);
+    EXPECT_TRUE(deleteButtonComesToBe(corner, deleteMark));
 }
 
 } // namespace penwick::desktop

@@ -70,6 +70,30 @@ TEST_F(TextBoxPlaced, backspaceDeletesItAndUndoBringsItBack)
     }));
 }
 
+TEST_F(TextBoxPlaced, deleteKeyDeletesIt)
+{
+    openForText();
+    const QPoint corner = placeBox(place, "Hi");
+
+    click(corner + QPoint(100, 15));
+    desktop().keyboard().press("Delete");
+
+    EXPECT_TRUE(vanishes(corner));
+}
+
+TEST_F(TextBoxPlaced, dragOutOfReachEndsWithTwentyPointsOnTheBoard)
+{
+    openForText();
+    const QPoint corner = placeBox(place, "Hi");
+    const QSize board = canvas().size();
+
+    drag({ corner + QPoint(100, 15), { board.width() + 190, corner.y() + 15 } });
+
+    const QPoint reached(board.width() - 20, corner.y());
+    EXPECT_TRUE(comesToBePlaced(reached));
+    EXPECT_TRUE(vanishes(corner));
+}
+
 TEST_F(TextBoxPlaced, deleteButtonsHoverImageComesAndGoesAndAClickDeletesTheBox)
 {
     openForText();
