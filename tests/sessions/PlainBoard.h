@@ -44,6 +44,7 @@ public:
     void adopt(const std::string &box, const std::string &now, const std::string &composed);
     void adoptFrame(const std::string &box, Spot corner, Spot boxSize, Spot canvasSize);
     void adoptSize(Spot canvasSize) { m_canvas.adoptSize(canvasSize); } ///< after the frames
+    void adoptShown(std::size_t strokes) { m_canvas.adoptShown(strokes); }
     void adoptClipboard(const std::string &now);
 
     // The menu of a box; it may stay open while other things happen

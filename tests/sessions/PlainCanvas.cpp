@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace penwick::sessions {
 
@@ -273,6 +274,7 @@ void PlainCanvas::showButton(const std::string &name)
 
 void PlainCanvas::paint()
 {
+    m_isPainted = true;
     turn(); // what is painted is never without an earlier stroke
     for (const std::string &name : boxes)
         putOn(name);
@@ -280,6 +282,13 @@ void PlainCanvas::paint()
         if (allBoxes.count(view) && allBoxes.at(view).hasDashedBorder)
             showButton(view);
     }
+}
+
+// What lies below a box is painted with it where the box has moved, and takes the content anew.
+void PlainCanvas::adoptShown(std::size_t count)
+{
+    if (std::exchange(m_isPainted, false) && m_hasDropped && count == m_drawing.strokes().size())
+        copyContent();
 }
 
 void PlainCanvas::turn()

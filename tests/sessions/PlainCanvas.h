@@ -68,6 +68,8 @@ public:
     void paint();
     /// The event loop has come round.
     void turn();
+    /// How many strokes are shown: what was painted may have been a box alone, or all of it.
+    void adoptShown(std::size_t count);
     void restoreTool() { currentTool = lastTool; }
 
     std::string currentTool = "brush";
@@ -105,6 +107,7 @@ private:
     bool m_isFar = false; // from where the canvas was pressed; a click before
     bool m_isDragged = false;
     bool m_hasDropped = false;
+    bool m_isPainted = false; // some of it, since this was asked last
     bool m_canPan = false; // of the box that is held down
     bool m_isPanning = false;
     Spot m_pressed;

@@ -127,6 +127,11 @@ Spot RealBoard::size() const
     return { canvas().bounds().width, canvas().bounds().height };
 }
 
+std::size_t RealBoard::shownStrokes() const
+{
+    return static_cast<std::size_t>(canvas().pathArray().size());
+}
+
 std::string RealBoard::targetAt(Spot spot) const
 {
     for (QWidget *widget = window().childAt(inWindow(spot).toPoint()); widget;

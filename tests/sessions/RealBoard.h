@@ -55,6 +55,7 @@ public:
     /// What a pointer at `spot` points at: canvas, b1, x1.
     [[nodiscard]] std::string targetAt(Spot spot) const;
     [[nodiscard]] Spot size() const; ///< of the canvas
+    [[nodiscard]] std::size_t shownStrokes() const;
     [[nodiscard]] QPointF onDesktop(Spot spot) const;
     /// A box's top left corner and its size.
     [[nodiscard]] bool isOnCanvas(const std::string &box) const;

@@ -58,6 +58,7 @@ void Session::adopt()
             m_plain->adoptFrame(view, m_real.cornerOf(view), m_real.sizeOf(view), m_real.size());
     }
     m_plain->adoptSize(m_real.size());
+    m_plain->adoptShown(m_real.shownStrokes());
     m_plain->adoptClipboard(RealBoard::clipboard());
 }
 
