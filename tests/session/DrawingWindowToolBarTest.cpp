@@ -135,6 +135,17 @@ TEST_F(DrawingWindowToolBar, movesWithTheCornerWhenTheLeftEdgeIsDragged)
     EXPECT_EQ(m_controller->drawingWindowOrigin(), (Point { 220, 180 }));
 }
 
+TEST_F(DrawingWindowToolBar, movesOnceWhenTheSameStepIsToldTwice)
+{
+    show();
+    drawing().setFrame({ 220, 180, 1380, 720 });
+
+    m_controller->windowDidResize();
+    m_controller->windowDidResize();
+
+    EXPECT_EQ(panel().frame(), (Rect { 240, 364, 52, 352 }));
+}
+
 TEST_F(DrawingWindowToolBar, staysWhenTheRightEdgeIsDragged)
 {
     show();
