@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "CommandLine.h"
 
+#include <QLocale>
+
 #include <array>
 #include <functional>
 
@@ -42,6 +44,31 @@ Complaint applyScreen(Options &options, const QString &value)
     return {};
 }
 
+// The component passes over what it does not know, and would leave it at that without a word. What
+// is no NAME#VALUE at all it says itself.
+Complaint complaintAboutOption(const QString &option)
+{
+    static const QStringList colors { QStringLiteral("black"), QStringLiteral("white"),
+        QStringLiteral("dark_grey"), QStringLiteral("dark_blue"), QStringLiteral("red"),
+        QStringLiteral("green"), QStringLiteral("yellow"), QStringLiteral("light_grey"),
+        QStringLiteral("light_blue") };
+    const QStringList parts = option.split(QLatin1Char('#'));
+    if (parts.size() != 2)
+        return {};
+    const QString &name = parts.at(0);
+    const QString &value = parts.at(1);
+    if (name == QLatin1String("color"))
+        return colors.contains(value) ? Complaint()
+                                      : QStringLiteral("there is no colour '%1'").arg(value);
+    if (name != QLatin1String("brush") && name != QLatin1String("text"))
+        return QStringLiteral("there is no option '%1'").arg(name);
+    bool isNumber = false;
+    QLocale locale; // as the component reads them
+    locale.setNumberOptions(QLocale::RejectGroupSeparator);
+    static_cast<void>(locale.toDouble(value, &isNumber));
+    return isNumber ? Complaint() : QStringLiteral("'%1' is no number").arg(value);
+}
+
 Complaint addStartCall(Options &options, StartCall::Operation operation, const QString &argument)
 {
     options.startCalls.push_back({ operation, argument });
@@ -68,8 +95,12 @@ const std::vector<Option> &knownOptions()
             } },
         { "--option", "NAME#VALUE",
             [](Options &o, const QString &v) {
-                return addStartCall(o, Operation::ToolOptionSelection, v);
+                const Complaint complaint = complaintAboutOption(v);
+                return complaint.isEmpty() ? addStartCall(o, Operation::ToolOptionSelection, v)
+                                           : complaint;
             } },
+        { "--picture", "FILE",
+            [](Options &o, const QString &v) { return o.pictureFile = v, Complaint(); } },
         { "--help", nullptr,
             [](Options &o, const QString &) {
                 return o.action = Options::Action::ShowHelp, Complaint();
@@ -142,11 +173,13 @@ QString helpText()
         "  --log                write what happens to standard output, one JSON object a line\n"
         "  --tool NAME          choose a tool at start, for example eraser\n"
         "  --option NAME#VALUE  choose an option at start, for example color#red\n"
+        "  --picture FILE       write what was drawn to FILE when the session ends\n"
         "  --help               show this text\n"
         "  --version            show the version\n"
         "\n"
         "--tool and --option may be given several times and are called in their order.\n"
-        "Exit status: 0 when the session has ended, 2 when the options cannot be used.\n");
+        "Exit status: 0 when the session has ended, 1 when its picture could not be written,\n"
+        "2 when the options cannot be used.\n");
 }
 
 } // namespace penwick::host

@@ -48,6 +48,7 @@ struct Options
     bool announcesSharing = false;
     bool logsEvents = false;
     std::vector<StartCall> startCalls; ///< in the order given
+    std::optional<QString> pictureFile; ///< where what was drawn is written at the end
 };
 
 /// Why a command line makes no sense: one line without the program's name.

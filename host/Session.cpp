@@ -8,6 +8,7 @@
 #include <QScreen>
 #include <QWindow>
 
+#include <cstdio>
 #include <utility>
 
 namespace penwick::host {
@@ -20,6 +21,7 @@ Session::Session()
     // Later, not now: the window is still closing and would be destroyed under its own feet.
     NotificationCenter::defaultCenter().addObserver(
         this, penwickSessionEndNotificationKey(), [this](const platform::Notification &) {
+            writePicture();
             QMetaObject::invokeMethod(
                 this, [this] { end(); }, Qt::QueuedConnection);
         });
@@ -37,6 +39,7 @@ bool Session::open(const Options &options, QScreen &screen, const std::optional<
     if (!m_controller)
         return false;
     m_announcesSharing = options.announcesSharing;
+    m_pictureFile = options.pictureFile;
     m_controller->showWindow(this);
     if (QWindow *const window = m_controller->drawingWindow()->windowHandle()) {
         window->installEventFilter(this);
@@ -99,10 +102,20 @@ platform::Window *Session::window() const
     return m_controller ? m_controller->drawingWindow() : nullptr;
 }
 
+// While the window is there: it goes with the session.
+void Session::writePicture()
+{
+    if (!m_pictureFile || !window() || window()->contentImage().save(*m_pictureFile))
+        return;
+    std::fprintf(stderr, "penwick-host: cannot write the picture '%s'\n",
+        m_pictureFile->toLocal8Bit().constData());
+    m_status = EXIT_FAILURE;
+}
+
 void Session::end()
 {
     letGo();
-    QCoreApplication::quit();
+    QCoreApplication::exit(m_status);
 }
 
 } // namespace penwick::host

@@ -9,6 +9,7 @@
 #include <QImage>
 #include <QObject>
 
+#include <cstdlib>
 #include <memory>
 #include <optional>
 
@@ -17,7 +18,8 @@ class QScreen;
 namespace penwick::host {
 
 /// Holds the component from the opening of its window to the end that it announces, then drops it
-/// and ends the application's event loop with status 0. GUI thread only.
+/// and ends the application's event loop with status 0, or with 1 where the picture that was asked
+/// for could not be written. GUI thread only.
 class Session final : public QObject
 {
 public:
@@ -46,11 +48,14 @@ public:
 
 private:
     void announceOnceSeen();
+    void writePicture();
     void end();
 
     std::unique_ptr<Penwick> m_penwick;
     std::shared_ptr<DrawingWindowController> m_controller;
     bool m_announcesSharing = false;
+    std::optional<QString> m_pictureFile;
+    int m_status = EXIT_SUCCESS; // of the program
 };
 
 } // namespace penwick::host

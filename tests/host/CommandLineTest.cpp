@@ -4,7 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include <QColor>
 #include <QFile>
+#include <QImage>
 #include <QProcess>
 #include <QProcessEnvironment>
 #include <QTemporaryDir>
@@ -96,6 +98,9 @@ INSTANTIATE_TEST_SUITE_P(Arguments, CommandLineRefusal,
             "imageAnnotation needs an image: use --image FILE" },
         Refusal { "absentImage", words("--image /no/such/picture.png"),
             "cannot read the image '/no/such/picture.png': No such file or directory" },
+        Refusal { "colour", words("--option color#pink"), "there is no colour 'pink'" },
+        Refusal { "thickness", words("--option brush#fat"), "'fat' is no number" },
+        Refusal { "kindOfOption", words("--option paint#5"), "there is no option 'paint'" },
         Refusal { "screenName", words("--screen first"), "there is no screen 'first'" },
         Refusal { "negativeScreen", words("--screen -1"), "there is no screen '-1'" }),
     refusalName);
@@ -141,7 +146,7 @@ TEST(CommandLine, helpNamesEveryOption)
     EXPECT_EQ(result->status, 0);
     EXPECT_EQ(result->errors, QString());
     for (const char *option : { "--window", "--image", "--title", "--screen", "--announce", "--log",
-             "--tool", "--option", "--help", "--version" })
+             "--tool", "--option", "--picture", "--help", "--version" })
         EXPECT_TRUE(result->output.contains(QLatin1String(option))) << option;
 }
 
@@ -165,6 +170,35 @@ TEST(CommandLine, toolThatEndsTheSessionEndsTheHostWithStatusZero)
     EXPECT_TRUE(
         result->output.contains(QLatin1String(".penwick.session.end\",\"object\":false}\n")))
         << result->output.toStdString();
+}
+
+TEST(CommandLine, pictureOfWhatWasDrawnIsWrittenAtTheEnd)
+{
+    const QTemporaryDir folder;
+    const QString file = folder.filePath(QStringLiteral("board.png"));
+
+    const std::optional<Result> result
+        = run({ QStringLiteral("--picture"), file, QStringLiteral("--tool=state") },
+            QStringLiteral("offscreen"));
+
+    ASSERT_TRUE(result);
+    EXPECT_EQ(result->status, 0);
+    const QImage picture(file);
+    ASSERT_FALSE(picture.isNull());
+    EXPECT_GT(picture.width(), 100);
+    EXPECT_EQ(picture.pixelColor(0, 0), QColor(Qt::white)) << "paper, and no border";
+}
+
+TEST(CommandLine, pictureThatCannotBeWrittenIsToldAndGivesStatusOne)
+{
+    const std::optional<Result> result
+        = run(words("--picture /nowhere/board.png --tool=state"), QStringLiteral("offscreen"));
+
+    ASSERT_TRUE(result);
+    EXPECT_EQ(result->status, 1);
+    EXPECT_TRUE(result->errors.endsWith(
+        QLatin1String("penwick-host: cannot write the picture '/nowhere/board.png'\n")))
+        << result->errors.toStdString();
 }
 
 TEST(CommandLine, startCallsComeInTheirOrder)

@@ -72,6 +72,14 @@ int main(int argc, char **argv)
             QStringLiteral("FILE"), QStringLiteral(PENWICK_MONKEY_HOST) },
     });
     parser.process(application);
+    for (const QString &option : { QStringLiteral("seed"), QStringLiteral("events") }) {
+        bool isNumber = false;
+        static_cast<void>(parser.value(option).toULongLong(&isNumber));
+        if (parser.isSet(option) && !isNumber) {
+            std::fprintf(stderr, "penwick-monkey: --%s wants a whole number\n", qPrintable(option));
+            return 2;
+        }
+    }
     const qulonglong seed = parser.isSet(QStringLiteral("seed"))
         ? parser.value(QStringLiteral("seed")).toULongLong()
         : std::random_device()();

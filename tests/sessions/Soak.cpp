@@ -30,6 +30,15 @@ int main(int argc, char **argv)
     parser.addOptions({ seedOption, stepsOption, sessionsOption });
     parser.process(application);
 
+    for (const QCommandLineOption &option : { seedOption, stepsOption, sessionsOption }) {
+        bool isNumber = false;
+        static_cast<void>(parser.value(option).toULongLong(&isNumber));
+        if (parser.isSet(option) && !isNumber) {
+            std::fprintf(stderr, "penwick-soak: --%s wants a whole number\n",
+                qPrintable(option.names().constFirst()));
+            return 2;
+        }
+    }
     const qulonglong first
         = parser.isSet(seedOption) ? parser.value(seedOption).toULongLong() : freshSeed();
     const int steps = parser.value(stepsOption).toInt();
