@@ -7,6 +7,7 @@
 #include "canvas/DrawingCanvasView.h"
 #include "textbox/TnTextBox.h"
 
+#include <QScrollBar>
 #include <QTest>
 
 namespace penwick {
@@ -228,6 +229,9 @@ TEST_F(ContentImage, textThatIsScrolledShowsWhatItsBoxShows)
         lines += QStringLiteral("line\n");
     box.insertPlainText(lines + QStringLiteral("a last and longer line"));
     leave();
+
+    box.verticalScrollBar()->setValue(100);
+    ASSERT_EQ(box.verticalScrollBar()->value(), 100);
 
     const QImage image = window().contentImage();
 
