@@ -216,6 +216,9 @@ class SourceFile:
             other = b'max' if name.group(1) == b'min' else b'min'
             self._add(cursor, f'{name.group(1).decode()} -> {other.decode()}',
                       b'std::' + other + text[8:])
+        # A key with its modifiers: compilers differ in what else may stand there.
+        if cursor.type.spelling == 'QKeyCombination':
+            return
         # An overloaded operator: its first child is the left side, its last one the right side.
         if len(children) == 3 and cursor.spelling.startswith('operator'):
             self._operator(cursor, text, children[0], children[2])
