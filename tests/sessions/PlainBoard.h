@@ -26,6 +26,7 @@ public:
     void press(const std::string &target, Spot spot, int clickCount);
     void drag(Spot spot);
     void release(Spot spot);
+    void pressWheelOn(const std::string &box) { m_canvas.pressWheelOn(box); }
     [[nodiscard]] bool isHeld() const { return !m_held.empty(); }
 
     void click(const std::string &tool); ///< its button, by whatever means

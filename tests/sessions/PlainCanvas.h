@@ -41,6 +41,7 @@ public:
     void pressBox(const std::string &name, Spot spot, int clickCount);
     void dragBox(const std::string &name, Spot spot);
     void releaseBox(const std::string &name, Spot spot);
+    void pressWheelOn(const std::string &name) { allBoxes.at(name).text.commit(); }
     void pressDeleteButton(const std::string &name) { removeAndReport(name); }
 
     // Keys

@@ -183,6 +183,8 @@ void Session::otherButton(const Step &step)
     }
     if (target.front() == 'b' && button == Qt::RightButton)
         m_plain->openMenu(target);
+    if (target.front() == 'b' && button == Qt::MiddleButton)
+        m_plain->pressWheelOn(target);
     m_real.release(spot, button);
 }
 
