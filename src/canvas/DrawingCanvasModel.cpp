@@ -97,11 +97,10 @@ bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLo
     return true;
 }
 
-std::vector<platform::Point> DrawingCanvasModel::strokesMetBetween(
-    platform::Point from, platform::Point to)
+Meetings DrawingCanvasModel::strokesMetOn(const Way &way)
 {
     m_strokeIndex.follow(pathArray());
-    return m_strokeIndex.meetingPoints({ from, to });
+    return m_strokeIndex.meetingsOn(way);
 }
 
 void DrawingCanvasModel::createTextBox(

@@ -9,7 +9,6 @@
 
 #include <cstdint>
 #include <memory>
-#include <vector>
 
 class QColor;
 class QObject;
@@ -49,11 +48,8 @@ public:
     /// Erases the oldest stroke that the point lies on; false if there is none.
     bool performEraseOperationAtLocation(platform::Point eraseLocation);
 
-    /// Where an eraser that goes straight from `from` to `to` comes upon strokes on its way: a
-    /// point on each, in the order in which it meets them, the oldest first of those that it meets
-    /// at once. Without what it meets only at the end.
-    [[nodiscard]] std::vector<platform::Point> strokesMetBetween(
-        platform::Point from, platform::Point to);
+    /// Where an eraser that goes straight on comes upon strokes on its way.
+    [[nodiscard]] Meetings strokesMetOn(const Way &way);
 
     /// Adds a text box, but to no view. What could be redone stays so, unlike after a stroke.
     /// `delegate` must be a TextBoxDelegate (else the process stops); the box borrows it.

@@ -156,33 +156,40 @@ bool DrawingCanvasView::isOver(Point point) const
 void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
 {
     const Point point = convertFrom(event.locationInWindow, this);
-    if (m_currentSelectedTool == Tools::eraser)
-        dragEraserAcross(point);
-    dragTo(point);
+    if (m_currentSelectedTool == Tools::eraser && !dragEraserTo(point))
+        takePointer(point);
+    else
+        dragTo(point);
 }
 
-// However fast the eraser is, each stroke on its way gets an event of its own. Strokes that the
-// events took are not there to be met again; what is left was nearer to the edge than can be told.
-void DrawingCanvasView::dragEraserAcross(Point point)
+// However fast the eraser is, each stroke on its way gets an event of its own. Those that the
+// events took are not there to be met again. Answers whether something lies at the end, which then
+// is for the pointer's own event; so an eraser that meets nothing asks but once.
+bool DrawingCanvasView::dragEraserTo(Point point)
 {
-    const Point from = std::exchange(m_eraserPlace, point).value_or(point);
+    const Way way { std::exchange(m_eraserPlace, point).value_or(point), point };
     int strokesLeft = -1;
     for (;;) {
-        const std::vector<Point> met = model().strokesMetBetween(from, point);
-        if (met.empty() || model().pathArray().size() == strokesLeft)
-            return;
+        const Meetings met = model().strokesMetOn(way);
+        if (met.places.empty() || model().pathArray().size() == strokesLeft)
+            return met.isAtEnd;
         strokesLeft = model().pathArray().size();
-        for (const Point &place : met)
+        for (const Point &place : met.places)
             dragTo(place);
     }
 }
 
-void DrawingCanvasView::dragTo(Point point)
+void DrawingCanvasView::takePointer(Point point)
 {
     if (window())
         window()->makeFirstResponder(this);
     if (isOver(point) && !(platform::Cursor::currentCursor() == m_cursorType))
         m_cursorType.set(*this);
+}
+
+void DrawingCanvasView::dragTo(Point point)
+{
+    takePointer(point);
     if (m_currentSelectedTool == Tools::brush) {
         m_lastPoint = point;
         m_isDragged = true;
@@ -210,8 +217,8 @@ void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
     if (m_currentSelectedTool == Tools::brush) {
         endStroke(point);
     } else if (m_currentSelectedTool == Tools::eraser) {
-        dragEraserAcross(point);
-        eraseAt(point);
+        if (dragEraserTo(point))
+            eraseAt(point);
         setNeedsDisplay();
     } else if (m_currentSelectedTool == Tools::text) {
         placeTextBox(point);

@@ -103,7 +103,8 @@ private:
     void endStroke(platform::Point point);
     [[nodiscard]] bool isOver(platform::Point point) const;
     void dragTo(platform::Point point);
-    void dragEraserAcross(platform::Point point);
+    void takePointer(platform::Point point);
+    [[nodiscard]] bool dragEraserTo(platform::Point point);
     void eraseAt(platform::Point point);
     void placeTextBox(platform::Point point);
     [[nodiscard]] DrawingCanvasDelegate &controller() const;

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <utility>
 #include <vector>
 
 namespace penwick {
@@ -102,6 +103,22 @@ bool isApart(const Rect &area, const StrokeLine &line)
         || std::min(line.from.y, line.to.y) > area.maxY();
 }
 
+/// The beginning of the first span on which the stroke surely lies.
+std::optional<double> firstOn(
+    const Way &way, const platform::BezierPath &path, std::vector<Span> spans)
+{
+    std::ranges::sort(spans, {}, &Span::begin);
+    for (const Span &span : spans) {
+        const double middle = (span.begin + span.end) / 2;
+        const double behindEdge = span.begin + surelyOnIt / way.length();
+        for (const double part : { std::min(behindEdge, middle), middle }) {
+            if (strokeContains(path, way.at(part)))
+                return part;
+        }
+    }
+    return std::nullopt;
+}
+
 } // namespace
 
 double Way::length() const
@@ -114,29 +131,27 @@ Point Way::at(double part) const
     return { from.x + (to.x - from.x) * part, from.y + (to.y - from.y) * part };
 }
 
-std::optional<double> partThatMeets(const Way &way, const platform::BezierPath &path)
+Meeting meetingOn(const Way &way, const platform::BezierPath &path)
 {
+    if (path.lineWidth() <= 0.0)
+        return {};
     const double length = way.length();
-    if (length == 0.0 || path.lineWidth() <= 0.0)
-        return std::nullopt;
     const double radius = path.lineWidth() / 2;
-    const Rect area = Rect::spanning(way.from, way.to).grownBy(radius);
+    // A little wider than need be: only a short cut, it must not decide at the very edge.
+    const Rect area = Rect::spanning(way.from, way.to).grownBy(radius + surelyOnIt);
+    Meeting meeting;
     std::vector<Span> spans;
     visitLines(path, [&](const StrokeLine &line) {
-        const Span span = isApart(area, line) ? Span() : spanOnLine(way, line, radius);
+        if (isApart(area, line))
+            return false;
+        meeting.isAtEnd = meeting.isAtEnd || lineContains(line, radius, way.to);
+        const Span span = length > 0.0 ? spanOnLine(way, line, radius) : Span();
         if (span.begin < span.end && (1.0 - span.begin) * length > surelyOnIt)
             spans.push_back(span);
         return false;
     });
-    std::ranges::sort(spans, {}, &Span::begin);
-    for (const Span &span : spans) {
-        const double middle = (span.begin + span.end) / 2;
-        for (const double part : { std::min(span.begin + surelyOnIt / length, middle), middle }) {
-            if (strokeContains(path, way.at(part)))
-                return part;
-        }
-    }
-    return std::nullopt;
+    meeting.part = firstOn(way, path, std::move(spans));
+    return meeting;
 }
 
 } // namespace penwick

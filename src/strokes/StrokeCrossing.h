@@ -23,9 +23,17 @@ struct Way
     [[nodiscard]] platform::Point at(double part) const;
 };
 
-/// How far along `way` strokeContains() first holds for its points, or did at its beginning; a
-/// millionth of a point is added, so that it surely holds there. Nothing where the stroke is not
-/// met, where it is met only at the end or for less than can be told, and for a way without length.
-[[nodiscard]] std::optional<double> partThatMeets(const Way &way, const platform::BezierPath &path);
+/// How a pointer meets a stroke on its way.
+struct Meeting
+{
+    /// How far along the way strokeContains() first holds for its points, or did at its beginning;
+    /// a millionth of a point is added, so that it surely holds there. Nothing where the stroke is
+    /// not met, where it is met only at the end or for less than can be told, and for a way
+    /// without length.
+    std::optional<double> part;
+    bool isAtEnd = false; ///< whether strokeContains() holds at the end
+};
+
+[[nodiscard]] Meeting meetingOn(const Way &way, const platform::BezierPath &path);
 
 } // namespace penwick

@@ -38,9 +38,13 @@ bool strokeContains(const platform::BezierPath &path, Point point)
     // One point wider than need be: only a short cut, it must not decide at the very edge.
     if (!path.controlPointBounds().grownBy(radius + 1).contains(point))
         return false;
-    return visitLines(path, [point, radius](const StrokeLine &line) {
-        return squaredDistance(point, line) <= radius * radius;
-    });
+    return visitLines(path,
+        [point, radius](const StrokeLine &line) { return lineContains(line, radius, point); });
+}
+
+bool lineContains(const StrokeLine &line, double radius, Point point)
+{
+    return squaredDistance(point, line) <= radius * radius;
 }
 
 } // namespace penwick

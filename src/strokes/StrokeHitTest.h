@@ -10,10 +10,15 @@ class BezierPath;
 
 namespace penwick {
 
+struct StrokeLine;
+
 /// Whether `point` is at most half the path's line width away from its centre line, round ends and
 /// joins included; exactly half is a hit. A line to where it began is a dot and has ends; a path
 /// without lines and curves is hit nowhere.
 /// Cheap enough to be asked of every stroke on every pointer event.
 [[nodiscard]] bool strokeContains(const platform::BezierPath &path, platform::Point point);
+
+/// The same for one line of a stroke that is twice `radius` thick.
+[[nodiscard]] bool lineContains(const StrokeLine &line, double radius, platform::Point point);
 
 } // namespace penwick

@@ -162,18 +162,20 @@ std::vector<int> StrokeIndex::near(const Way &way) const
     return found;
 }
 
-std::vector<Point> StrokeIndex::meetingPoints(const Way &way) const
+Meetings StrokeIndex::meetingsOn(const Way &way) const
 {
+    Meetings meetings;
     std::vector<std::pair<double, int>> met; // part of the way, index
     for (const int index : near(way)) {
-        if (const auto part = partThatMeets(way, *m_strokes[index].bPath))
-            met.emplace_back(*part, index);
+        const Meeting meeting = meetingOn(way, *m_strokes[index].bPath);
+        meetings.isAtEnd = meetings.isAtEnd || meeting.isAtEnd;
+        if (meeting.part)
+            met.emplace_back(*meeting.part, index);
     }
     std::ranges::sort(met);
-    std::vector<Point> points;
     for (const auto &[part, index] : met)
-        points.push_back(way.at(part));
-    return points;
+        meetings.places.push_back(way.at(part));
+    return meetings;
 }
 
 std::vector<int> StrokeIndex::touching(const Rect &area) const

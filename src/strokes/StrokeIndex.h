@@ -16,6 +16,15 @@
 
 namespace penwick {
 
+/// Where a pointer meets strokes on its way.
+struct Meetings
+{
+    /// Where each is met first, in the order of the way; of strokes that are met at once the oldest
+    /// comes first. Without what is met only at the end.
+    std::vector<platform::Point> places;
+    bool isAtEnd = false; ///< whether a stroke lies at the end
+};
+
 /// Finds the strokes of a list by place, without asking each of them.
 ///
 /// Follows a list: it has to be told of every change but the growth of the newest stroke, which is
@@ -33,9 +42,8 @@ public:
 
     /// The index of the oldest stroke that `point` lies on.
     [[nodiscard]] std::optional<int> oldestAt(platform::Point point) const;
-    /// Where each stroke that is met on `way` is met first, in the order of the way; of strokes
-    /// that are met at once the oldest comes first. What is met only at the end is left out.
-    [[nodiscard]] std::vector<platform::Point> meetingPoints(const Way &way) const;
+    /// Where the strokes are met on `way`.
+    [[nodiscard]] Meetings meetingsOn(const Way &way) const;
     /// The indices, oldest first, of the strokes whose bounds, thickness included, touch `area`.
     [[nodiscard]] std::vector<int> touching(const platform::Rect &area) const;
 

@@ -21,7 +21,7 @@ constexpr double tolerance = 2e-6; // points: what is added, and what is rounded
 /// The place on the way where the stroke is met; nothing where it is not.
 std::optional<Point> meeting(Way way, const BezierPath &path)
 {
-    const auto part = partThatMeets(way, path);
+    const auto part = meetingOn(way, path).part;
     if (!part)
         return std::nullopt;
     EXPECT_TRUE(strokeContains(path, way.at(*part)));
@@ -66,6 +66,19 @@ TEST(StrokeCrossing, strokeThatIsMetOnlyAtTheEndOrNotAtAllIsNotMet)
     EXPECT_FALSE(meeting({ { 30, 22 }, { 30, 90 } }, *line.bPath)); // it is left at once
     EXPECT_FALSE(meeting({ { 30, 20 }, { 30, 20 } }, *line.bPath)); // no way
     EXPECT_TRUE(meeting({ { 30, 0 }, { 30, 18.1 } }, *line.bPath));
+}
+
+TEST(StrokeCrossing, whatLiesAtTheEndIsToldWhetherOrNotItIsMetBefore)
+{
+    const StrokeEntry line = lineAt(20);
+    const auto isAtEnd = [&line](Way way) { return meetingOn(way, *line.bPath).isAtEnd; };
+
+    EXPECT_TRUE(isAtEnd({ { 30, 0 }, { 30, 18 } })); // exactly half the thickness away
+    EXPECT_TRUE(isAtEnd({ { 30, 0 }, { 30, 22 } }));
+    EXPECT_TRUE(isAtEnd({ { 30, 20 }, { 30, 20 } }));
+    EXPECT_FALSE(isAtEnd({ { 30, 0 }, { 30, 17.9999999 } }));
+    EXPECT_FALSE(isAtEnd({ { 30, 0 }, { 30, 90 } }));
+    EXPECT_FALSE(isAtEnd({ { 30, 23 }, { 30, 23 } }));
 }
 
 TEST(StrokeCrossing, lineThatRunsBesideTheWayAtHalfItsWidthIsMet)
@@ -119,9 +132,10 @@ RC_GTEST_PROP(StrokeCrossingProperties, meetsWhatManyPointsOnTheWayMeetAndNoLate
     const Way way { anyPoint(), anyPoint() };
     constexpr int points = 2000;
 
-    const auto part = partThatMeets(way, *stroke.bPath);
+    const auto part = meetingOn(way, *stroke.bPath).part;
     const auto asked = firstAskedPoint(way, *stroke.bPath, points);
 
+    RC_ASSERT(meetingOn(way, *stroke.bPath).isAtEnd == strokeContains(*stroke.bPath, way.to));
     if (part)
         RC_ASSERT(strokeContains(*stroke.bPath, way.at(*part)));
     if (!asked)

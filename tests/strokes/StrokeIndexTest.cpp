@@ -78,7 +78,7 @@ TEST(StrokeIndex, meetingPointsAreInTheOrderOfTheWayAndOldestFirstWhereStrokesAr
     StrokeIndex index;
     index.follow(strokes);
 
-    const std::vector<Point> up = index.meetingPoints({ { 20, 0 }, { 20, 93 } });
+    const std::vector<Point> up = index.meetingsOn({ { 20, 0 }, { 20, 93 } }).places;
 
     ASSERT_EQ(up.size(), 4U); // the one that ends the way is not on it
     EXPECT_NEAR(up[0].y, 28, 1e-5);
@@ -86,7 +86,7 @@ TEST(StrokeIndex, meetingPointsAreInTheOrderOfTheWayAndOldestFirstWhereStrokesAr
     EXPECT_NEAR(up[2].y, 48, 1e-5);
     EXPECT_NEAR(up[3].y, 68, 1e-5);
     EXPECT_EQ(index.oldestAt(up[0]), 1);
-    const std::vector<Point> down = index.meetingPoints({ { 20, 94 }, { 20, 49 } });
+    const std::vector<Point> down = index.meetingsOn({ { 20, 94 }, { 20, 49 } }).places;
     ASSERT_EQ(down.size(), 3U);
     EXPECT_NEAR(down[0].y, 94, 1e-5); // there from the beginning
     EXPECT_NEAR(down[1].y, 72, 1e-5);
@@ -101,9 +101,9 @@ TEST(StrokeIndex, wayAcrossEverythingMeetsEachStrokeOnce)
     StrokeIndex index;
     index.follow(strokes);
 
-    EXPECT_EQ(index.meetingPoints({ { 11, -100 }, { 49, 1e4 } }).size(), 200U);
-    EXPECT_EQ(index.meetingPoints({ { 30, -1e9 }, { 30, 1e9 } }).size(), 200U);
-    EXPECT_TRUE(index.meetingPoints({ { 60, -100 }, { 60, 1e4 } }).empty());
+    EXPECT_EQ(index.meetingsOn({ { 11, -100 }, { 49, 1e4 } }).places.size(), 200U);
+    EXPECT_EQ(index.meetingsOn({ { 30, -1e9 }, { 30, 1e9 } }).places.size(), 200U);
+    EXPECT_TRUE(index.meetingsOn({ { 60, -100 }, { 60, 1e4 } }).places.empty());
 }
 
 RC_GTEST_PROP(StrokeIndexProperties, meetsOnAWayWhatAskingEveryStrokeMeets, ())
@@ -117,15 +117,19 @@ RC_GTEST_PROP(StrokeIndexProperties, meetsOnAWayWhatAskingEveryStrokeMeets, ())
 
         const Way way { anyPoint(), anyPoint() };
         std::vector<std::pair<double, int>> met;
+        bool isAtEnd = false;
         for (int stroke = 0; stroke < drawing.strokes().size(); ++stroke) {
-            if (const auto part = partThatMeets(way, *drawing.strokes()[stroke].bPath))
-                met.emplace_back(*part, stroke);
+            const Meeting meeting = meetingOn(way, *drawing.strokes()[stroke].bPath);
+            isAtEnd = isAtEnd || meeting.isAtEnd;
+            if (meeting.part)
+                met.emplace_back(*meeting.part, stroke);
         }
         std::ranges::sort(met);
         std::vector<Point> points;
         for (const auto &[part, stroke] : met)
             points.push_back(way.at(part));
-        RC_ASSERT(index.meetingPoints(way) == points);
+        RC_ASSERT(index.meetingsOn(way).places == points);
+        RC_ASSERT(index.meetingsOn(way).isAtEnd == isAtEnd);
     }
 }
 
