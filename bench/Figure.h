@@ -50,5 +50,6 @@ using Figures = std::vector<Figure>;
 [[nodiscard]] Figures memoryFigures();
 [[nodiscard]] Figures idleFigures();
 [[nodiscard]] Figures openingFigures();
+[[nodiscard]] Figures textFigures();
 
 } // namespace penwick::bench

@@ -27,6 +27,7 @@ constexpr std::pair<const char *, Figures (*)()> sections[] {
     { "memory", memoryFigures },
     { "idle", idleFigures },
     { "opening", openingFigures },
+    { "text", textFigures },
 };
 
 /// The next application has one screen, of 1920 by 1080 points, that is not there. The file that
@@ -110,7 +111,7 @@ int main(int argc, char **argv)
         QStringLiteral("pixels"));
     const QCommandLineOption onlyOption(QStringLiteral("only"),
         QStringLiteral("Measure one part: drag, longstroke, eraser, history, window, memory, "
-                       "idle or opening."),
+                       "idle, opening or text."),
         QStringLiteral("part"));
     const QCommandLineOption growthOption(QStringLiteral("growth"),
         QStringLiteral("Print, as CSV, how costs grow up to 100,000 strokes."));

@@ -10,8 +10,8 @@ namespace penwick {
 
 // Nobody who writes on a board comes near these. They are there for a clipboard that holds a whole
 // document: every key lays the text out anew, and must be done within a frame of the host's.
-constexpr int mostCharacters = 5000; ///< of a box
-constexpr int mostLines = 500; ///< of a box, wrapped ones not counted
+constexpr int mostCharacters = 2500; ///< of a box
+constexpr int mostLines = 250; ///< of a box, wrapped ones not counted
 constexpr int mostMarks = 64; ///< accents and the like on one letter
 
 /// What may still go in at some place.

@@ -30,28 +30,28 @@ TextRoom roomBehind(const QString &text)
 
 } // namespace
 
-TEST(TextRoom, emptyTextTakesFiveThousandCharactersAndFiveHundredLines)
+TEST(TextRoom, emptyTextTakesTwoThousandFiveHundredCharactersAndTwoHundredFiftyLines)
 {
-    EXPECT_EQ(roomBehind(QString()), (TextRoom { 5000, 499, 64 }));
+    EXPECT_EQ(roomBehind(QString()), (TextRoom { 2500, 249, 64 }));
 }
 
 TEST(TextRoom, whatIsThereTakesItsPlace)
 {
-    EXPECT_EQ(roomBehind(QStringLiteral("ab\ncd")), (TextRoom { 4995, 498, 64 }));
-    EXPECT_EQ(roomBehind(times(5000, QStringLiteral("m"))), (TextRoom { 0, 499, 64 }));
-    EXPECT_EQ(roomBehind(times(499, QStringLiteral("\n"))), (TextRoom { 4501, 0, 64 }));
+    EXPECT_EQ(roomBehind(QStringLiteral("ab\ncd")), (TextRoom { 2495, 248, 64 }));
+    EXPECT_EQ(roomBehind(times(2500, QStringLiteral("m"))), (TextRoom { 0, 249, 64 }));
+    EXPECT_EQ(roomBehind(times(249, QStringLiteral("\n"))), (TextRoom { 2251, 0, 64 }));
 }
 
 TEST(TextRoom, lineThatIsNoParagraphCounts)
 {
     EXPECT_EQ(roomBehind(QStringLiteral("a") + QChar(QChar::LineSeparator)),
-        (TextRoom { 4998, 498, 64 }));
+        (TextRoom { 2498, 248, 64 }));
 }
 
 TEST(TextRoom, textThatIsTooLongAlreadyHasNoRoom)
 {
     EXPECT_EQ(roomBehind(times(6000, QStringLiteral("\n"))), (TextRoom { 0, 0, 64 }));
-    EXPECT_EQ(roomBehind(QStringLiteral("e") + times(70, accent)), (TextRoom { 4929, 499, 0 }));
+    EXPECT_EQ(roomBehind(QStringLiteral("e") + times(70, accent)), (TextRoom { 2429, 249, 0 }));
 }
 
 TEST(TextRoom, whatIsSelectedMakesRoom)
@@ -62,7 +62,7 @@ TEST(TextRoom, whatIsSelectedMakesRoom)
     cursor.setPosition(1);
     cursor.setPosition(4, QTextCursor::KeepAnchor);
 
-    EXPECT_EQ(roomAt(cursor), (TextRoom { 4998, 499, 64 }));
+    EXPECT_EQ(roomAt(cursor), (TextRoom { 2498, 249, 64 }));
 }
 
 TEST(TextRoom, marksOnBothSidesAreOnOneLetter)

@@ -64,7 +64,7 @@ TEST_F(TnTextBoxLimitTest, pasteOfManyLinesPutsTheFirstOnesIn)
     paste(*box, QStringLiteral("a\n").repeated(600));
 
     EXPECT_EQ(box->document()->blockCount(), mostLines);
-    expectSaid(*box, QStringLiteral("201 characters did not fit into this text box."));
+    expectSaid(*box, QStringLiteral("701 characters did not fit into this text box."));
 }
 
 TEST_F(TnTextBoxLimitTest, pasteThatFitsSaysNothing)
