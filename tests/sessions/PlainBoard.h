@@ -56,7 +56,11 @@ public:
 
     // The user moves or pulls at the drawing window, and lets it rest
     void moveTo(const PlainFrame &frame);
-    void resizeTo(const PlainFrame &frame) { m_frames.resizeTo(frame); }
+    void resizeTo(const PlainFrame &frame)
+    {
+        m_frames.resizeTo(frame);
+        m_canvas.hearResize();
+    }
     /// It has come to rest, and the desktop has granted `frame` for the one that was asked for.
     void rest(const PlainFrame &frame);
     /// Where its windows came up.

@@ -150,7 +150,7 @@ void PlainCanvas::bringIntoReach(PlainBox &box) const
 void PlainCanvas::adoptFrame(const std::string &name, Spot corner, Spot boxSize, Spot canvasSize)
 {
     PlainBox &box = allBoxes.at(name);
-    const bool isResized = !(canvasSize == m_size);
+    const bool isResized = m_wasResized || !(canvasSize == m_size);
     const bool mayMove = box.text.wasTouched() || (isResized && box.isEditable);
     box.size = boxSize;
     const bool isInSight = corner.x >= 0 && corner.y <= canvasSize.y

@@ -55,7 +55,12 @@ public:
     /// Where a box really stands, on a canvas of that size. Its own size is taken over; its place
     /// if what was written in it, or a window that was resized, may have moved it there.
     void adoptFrame(const std::string &name, Spot corner, Spot boxSize, Spot canvasSize);
-    void adoptSize(Spot canvasSize) { m_size = canvasSize; } ///< after the frames
+    void hearResize() { m_wasResized = true; } ///< though it may have its size again
+    void adoptSize(Spot canvasSize) ///< after the frames
+    {
+        m_size = canvasSize;
+        m_wasResized = false;
+    }
 
     // What the tool bar asks for; "state" is not the canvas's
     void chooseTool(const std::string &tool);
@@ -113,6 +118,7 @@ private:
     bool m_isPanning = false;
     Spot m_pressed;
     Spot m_size; // of the canvas
+    bool m_wasResized = false; // since then
     Spot m_grabbed; // the box's place when it was pressed
 };
 
