@@ -215,6 +215,8 @@ void FrameTracker::check()
     if (wasPending)
         Q_EMIT confirmed();
     announce();
+    if (!m_isPending)
+        Q_EMIT settled();
 }
 
 // On a screen of another scale the same window and the same title bar measure other points. What

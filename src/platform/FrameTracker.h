@@ -60,6 +60,8 @@ Q_SIGNALS:
     void confirmed();
     /// The window's top left corner is somewhere else, on the desktop or from the primary screen.
     void moved();
+    /// Nothing is open: the frame is what stands on the screen. Sent after all others.
+    void settled();
     /// The window has come to a screen with another number of device pixels a point. Sent before
     /// all others, of which shifted() and moved() come before resized() then.
     void rescaled();

@@ -41,6 +41,10 @@ Window::Window(QWidget *parent)
     tell(&FrameTracker::moveBegan, &WindowDelegate::windowWillMove);
     tell(&FrameTracker::moved, &WindowDelegate::windowDidMove);
     tell(&FrameTracker::resized, &WindowDelegate::windowDidResize);
+    connect(tracker, &FrameTracker::settled, this, [this] {
+        if (!d->glide->target())
+            Q_EMIT frameSettled();
+    });
     applyAttributes();
 }
 

@@ -4,10 +4,12 @@
 #include <penwick/platform/Window.h>
 
 #include "platform/FrameTracker.h"
+#include "platform/KeptShape.h"
 #include "platform/ScreenCoordinates.h"
 #include "platform/native/NativeDesktop.h"
 
 #include <cmath>
+#include <utility>
 
 namespace penwick::platform {
 
@@ -30,9 +32,10 @@ WindowShape::WindowShape(Window &window, FrameTracker &tracker)
 {
     m_rest.setSingleShot(true);
     m_rest.setInterval(restTime);
-    connect(&m_rest, &QTimer::timeout, this, &WindowShape::correct);
+    connect(&m_rest, &QTimer::timeout, this, &WindowShape::rest);
     connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::resizedByUser, this, [this] { m_rest.start(); });
+    connect(&tracker, &FrameTracker::settled, this, &WindowShape::rememberFrame);
 }
 
 bool WindowShape::isKept() const
@@ -56,17 +59,43 @@ void WindowShape::update()
         *m_window.windowHandle(), hasRatio ? content : QSize());
 }
 
+// Where the desktop says what size the window has. What it had before comes back afterwards.
+bool WindowShape::isArranged() const
+{
+    return m_window.isMaximized() || m_window.isFullScreen();
+}
+
+void WindowShape::rememberFrame()
+{
+    if (std::exchange(m_isAnswering, false))
+        m_rest.stop(); // what it granted instead is no pull by the user
+    if (!m_rest.isActive() && !isArranged())
+        m_before = m_tracker.frame();
+}
+
+// A window that changed under the hand would be pulled from another size than its user sees.
+void WindowShape::rest()
+{
+    if (NativeDesktop::instance().isPointerHeld())
+        return m_rest.start();
+    correct();
+    if (!m_isAnswering)
+        rememberFrame();
+}
+
 void WindowShape::correct()
 {
-    if (!isKept() || m_window.isMaximized() || m_window.isFullScreen())
+    if (!isKept() || isArranged())
         return;
-    Rect frame = m_window.frame();
-    const double height = heightFor(frame.width, *m_window.attributes().aspectRatio);
-    if (std::abs(height - frame.height) <= tolerance)
+    const Rect pulled = m_window.frame();
+    const Size ratio = *m_window.attributes().aspectRatio;
+    const bool hasShape = std::abs(heightFor(pulled.width, ratio) - pulled.height) <= tolerance;
+    if (hasShape || m_before == Rect() || m_before.size() == pulled.size())
         return;
-    frame.y = frame.maxY() - height; // the top left corner stays
-    frame.height = height;
-    m_window.setFrame(frame);
+    // The hint is that of another content, and some desktops hold what is asked for against it.
+    NativeDesktop::instance().keepContentRatio(*m_window.windowHandle(), QSize());
+    m_window.setFrame(shapedAfterPull(m_before, pulled, ratio));
+    m_isAnswering = true;
 }
 
 } // namespace penwick::platform

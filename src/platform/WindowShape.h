@@ -2,6 +2,8 @@
 // Keeps a window's shape while the user resizes it.
 #pragma once
 
+#include <penwick/platform/Geometry.h>
+
 #include <QObject>
 #include <QTimer>
 
@@ -11,7 +13,7 @@ class FrameTracker;
 class Window;
 
 /// Has the desktop keep the aspect ratio of a window's attributes, where the window's frame has
-/// it, and brings a frame that the user gave another one back to it, where the desktop did not.
+/// it, and brings a frame that the user gave another one to it, where the desktop did not.
 /// A window that the user cannot resize is left alone.
 class WindowShape final : public QObject
 {
@@ -25,11 +27,16 @@ public:
     void update();
 
 private:
+    void rest();
     void correct();
+    void rememberFrame();
     [[nodiscard]] bool isKept() const;
+    [[nodiscard]] bool isArranged() const;
 
     Window &m_window;
     FrameTracker &m_tracker;
+    Rect m_before; // the frame that the user began to pull; empty before the first one
+    bool m_isAnswering = false; // the desktop, to the frame that a pull was corrected to
     QTimer m_rest { this }; // runs while the user may still be pulling
 };
 

@@ -45,6 +45,85 @@ protected:
     }
 };
 
+/// A part of an image window's frame that is pulled outward or inward.
+struct Pull
+{
+    const char *name;
+    int x; ///< -1: the left edge; 1: the right one
+    int y; ///< -1: the top edge, 1: the bottom one
+};
+
+class PulledImage : public BoardTest,
+                    public testing::WithParamInterface<std::tuple<WindowManager, Pull>>
+{
+protected:
+    static constexpr int rounding = 2; // pixels, by the window manager
+    static constexpr int wherever = 1000;
+
+    PulledImage()
+        : BoardTest(std::get<WindowManager>(GetParam()))
+    { }
+
+    void startOn(QSize size)
+    {
+        const std::string file = desktop().file("picture.png");
+        QImage image(size, QImage::Format_RGB32);
+        image.fill(Qt::yellow);
+        ASSERT_TRUE(image.save(QString::fromStdString(file)));
+        start({ "--window", "imageAnnotation", "--image", file });
+        m_window = window(); // which is looked for where the log says that it stands
+        ASSERT_EQ(frameOnScreen().size(), size);
+    }
+
+    [[nodiscard]] static const Pull &pull() { return std::get<Pull>(GetParam()); }
+    [[nodiscard]] QRect frameOnScreen() { return desktop().windows().outerFrame(m_window); }
+
+    /// Where the mouse takes hold of the frame.
+    [[nodiscard]] QPoint grip()
+    {
+        const QRect frame = frameOnScreen();
+        QPoint place = frame.center() + QPoint(60, 0); // clear of what stands in the middle
+        if (pull().x)
+            place.setX(pull().x < 0 ? frame.left() : frame.right() - (pull().y ? 1 : 0));
+        if (pull().y)
+            place.setY(pull().y < 0 ? frame.top() : frame.bottom() - 1);
+        return place;
+    }
+
+    [[nodiscard]] static QPoint way(int length) { return { pull().x * length, pull().y * length }; }
+
+    /// Whether the window comes to rest 16:9.
+    [[nodiscard]] bool comesToRest()
+    {
+        return waitUntil([this] {
+            const QSize size = frameOnScreen().size();
+            return std::abs(size.width() * 9.0 / 16 - size.height()) <= rounding
+                && host().window(QStringLiteral("drawing")).frame == frameOnScreen();
+        });
+    }
+
+    /// The edges that were not pulled.
+    void expectOtherEdgesKept(const QRect &before)
+    {
+        const QRect after = frameOnScreen();
+        const int sideways
+            = pull().x < 0 ? after.right() - before.right() : after.left() - before.left();
+        const int upright
+            = pull().y < 0 ? after.bottom() - before.bottom() : after.top() - before.top();
+        EXPECT_LE(std::abs(sideways), pull().x ? rounding : wherever);
+        EXPECT_LE(std::abs(upright), pull().y ? rounding : wherever);
+    }
+
+private:
+    WindowId m_window = 0;
+};
+
+std::string pullName(const testing::TestParamInfo<PulledImage::ParamType> &parameters)
+{
+    const auto &[manager, pull] = parameters.param;
+    return managerName({ manager, 0 }) + '_' + pull.name;
+}
+
 class MovedBoard : public BoardUnderEachManager
 {
 protected:
@@ -125,6 +204,86 @@ INSTANTIATE_TEST_SUITE_P(Grips, Resizing,
     testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
         testing::Values(rightEdge, leftEdge, bottomEdge, topEdge, corner, inwards)),
     gripName);
+
+TEST_P(PulledImage, outwardIsNeverSmallerAndHoldsWhatWasPulled)
+{
+    constexpr int length = 12;
+    startOn({ 560, 420 });
+    const QRect before = frameOnScreen();
+
+    desktop().pointer().drag({ grip(), grip() + way(length) });
+
+    require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
+    EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
+    const QRect after = frameOnScreen();
+    EXPECT_GE(after.width(), before.width() + std::abs(pull().x) * (length - rounding));
+    EXPECT_GE(after.height(), before.height() + std::abs(pull().y) * (length - rounding));
+    expectOtherEdgesKept(before);
+}
+
+// There the window manager keeps the shape under the hand, and says which of the two ways of a
+// corner counts.
+TEST_P(PulledImage, outwardIsNeverSmallerWhereItHasTheShapeAlready)
+{
+    startOn({ 640, 360 });
+    const QRect before = frameOnScreen();
+
+    desktop().pointer().drag({ grip(), grip() + way(12) });
+
+    require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
+    EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
+    EXPECT_GE(frameOnScreen().width(), before.width());
+    EXPECT_GE(frameOnScreen().height(), before.height());
+}
+
+TEST_P(PulledImage, inwardFitsIntoWhatWasPulled)
+{
+    constexpr int length = 60;
+    startOn({ 560, 420 });
+    const QRect before = frameOnScreen();
+
+    desktop().pointer().drag({ grip(), grip() - way(length) });
+
+    require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
+    EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
+    const QRect after = frameOnScreen();
+    EXPECT_LE(after.width(), before.width() - std::abs(pull().x) * (length - rounding));
+    EXPECT_LE(after.height(), before.height() - std::abs(pull().y) * (length - rounding));
+    expectOtherEdgesKept(before);
+}
+
+TEST_P(PulledImage, staysUnderTheHandThatRestsAndCountsFromWhereItTookHold)
+{
+    constexpr std::chrono::milliseconds longerThanARest { 500 };
+    startOn({ 560, 420 });
+    const QRect before = frameOnScreen();
+    Pointer &pointer = desktop().pointer();
+    const QPoint place = grip();
+    pointer.moveTo(place);
+    pointer.press();
+    pointer.glideTo(place + way(24));
+    require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
+    const QRect pulled = frameOnScreen();
+
+    EXPECT_FALSE(waitUntil(
+        [&] {
+            return std::abs(frameOnScreen().width() - pulled.width()) > 24
+                || std::abs(frameOnScreen().height() - pulled.height()) > 24;
+        },
+        longerThanARest));
+    pointer.glideTo(place + way(12));
+    pointer.release();
+
+    EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
+    EXPECT_GE(frameOnScreen().width(), before.width());
+    EXPECT_GE(frameOnScreen().height(), before.height());
+}
+
+INSTANTIATE_TEST_SUITE_P(Edges, PulledImage,
+    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+        testing::Values(Pull { "right", 1, 0 }, Pull { "left", -1, 0 }, Pull { "top", 0, -1 },
+            Pull { "bottom", 0, 1 }, Pull { "bottomRight", 1, 1 }, Pull { "bottomLeft", -1, 1 })),
+    pullName);
 
 TEST_P(MovedBoard, takesItsToolBarAlongWhileItIsDragged)
 {

@@ -10,6 +10,7 @@ namespace {
 
 constexpr double screenWidth = 720; // points
 constexpr double screenHeight = 540;
+constexpr double border = 2.5; // points, that a desktop draws, and rounding
 
 } // namespace
 
@@ -21,13 +22,17 @@ void PlainFrames::shiftPanel(double x, double y)
 
 void PlainFrames::moveTo(const PlainFrame &frame)
 {
-    shiftPanel(frame.x - board.x, frame.y - board.y);
+    // Windows stand on whole pixels, and go along by as many.
+    shiftPanel(std::round(frame.x) - std::round(board.x),
+        std::round(screenHeight - board.top()) - std::round(screenHeight - frame.top()));
     board = frame;
     bringPanelUp();
 }
 
 void PlainFrames::resizeTo(const PlainFrame &frame)
 {
+    if (!m_unpulled)
+        m_unpulled = board;
     shiftPanel(frame.x - board.x, frame.y - board.y);
     board = frame;
     pullPanelIn();
@@ -35,17 +40,39 @@ void PlainFrames::resizeTo(const PlainFrame &frame)
 
 void PlainFrames::restAt(const PlainFrame &frame)
 {
-    const double height = board.width * 9 / 16;
-    const bool isReshaped = std::abs(height - board.height) > 2;
-    PlainFrame kept = board;
-    if (isReshaped)
-        kept = { board.x, board.top() - height, board.width, height };
+    PlainFrame kept = reshaped();
+    const bool isReshaped = kept.width != board.width || kept.height != board.height;
+    // Windows stand on whole pixels; where they were asked to is what counts.
+    const bool isGranted = frame.x == std::round(kept.x)
+        && screenHeight - frame.top() == std::round(screenHeight - kept.top());
     // A desktop may be out by the width of the border that it draws.
-    if (std::abs(frame.x - kept.x) <= 2 && std::abs(frame.y - kept.y) <= 2) {
-        kept.x = frame.x;
-        kept.y = frame.y;
+    if (!isGranted && std::abs(frame.x - kept.x) < border && std::abs(frame.y - kept.y) < border) {
+        kept = { frame.x, frame.y, std::round(kept.width), std::round(kept.height) };
     }
     isReshaped ? resizeTo(kept) : moveTo(kept);
+    m_unpulled.reset();
+}
+
+PlainFrame PlainFrames::reshaped() const
+{
+    const bool isInShape = std::abs(board.width * 9 / 16 - board.height) <= 2;
+    if (isInShape || !m_unpulled
+        || (m_unpulled->width == board.width && m_unpulled->height == board.height))
+        return board;
+    const bool isOutward = board.width > m_unpulled->width || board.height > m_unpulled->height;
+    const bool followsWidth = (board.width * 9 > board.height * 16) == isOutward;
+    PlainFrame frame = board;
+    if (followsWidth)
+        frame.height = board.width * 9 / 16;
+    else
+        frame.width = board.height * 16 / 9;
+    const auto isSame = [](double one, double other) { return std::abs(one - other) < border; };
+    const double right = board.x + board.width;
+    if (!isSame(board.x, m_unpulled->x) && isSame(right, m_unpulled->x + m_unpulled->width))
+        frame.x = right - frame.width;
+    if (!isSame(board.y, m_unpulled->y) || isSame(board.top(), m_unpulled->top()))
+        frame.y = board.top() - frame.height;
+    return frame;
 }
 
 void PlainFrames::pullPanelIn()

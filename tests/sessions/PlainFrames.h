@@ -2,6 +2,7 @@
 // Where the second model's windows stand.
 #pragma once
 
+#include <optional>
 #include <string>
 
 namespace penwick::sessions {
@@ -26,7 +27,8 @@ public:
 
     void moveTo(const PlainFrame &frame); ///< of the same size; the panel goes along
     void resizeTo(const PlainFrame &frame);
-    /// The desktop has granted `frame` for what was asked: 16:9, from the top left corner on.
+    /// The desktop has granted `frame` for what was asked: 16:9 after its edges were pulled, so
+    /// that no pull outward makes it smaller.
     void restAt(const PlainFrame &frame);
     void pullPanelIn(); ///< into the drawing window
 
@@ -35,6 +37,9 @@ public:
 private:
     void shiftPanel(double x, double y);
     void bringPanelUp(); ///< of a board that has no room for it
+    [[nodiscard]] PlainFrame reshaped() const;
+
+    std::optional<PlainFrame> m_unpulled; // the drawing window before the user took hold of an edge
 };
 
 } // namespace penwick::sessions

@@ -200,6 +200,9 @@ Q_SIGNALS:
     /// windowsToLeaveOutOfCaptures() is another list than when it was last asked for, or told of.
     /// The list may be asked for from the slot. Not sent for windows that go with their session.
     void windowsToLeaveOutOfCapturesChanged();
+    /// The desktop has answered, and nothing glides: frame() and the size of the content are what
+    /// is on the screen. Sent after the delegate was told, also where nothing has changed.
+    void frameSettled();
 
 protected:
     void changeEvent(QEvent *event) override;

@@ -35,6 +35,11 @@ bool NativeDesktop::keepsWindowsOutOfCaptures() const
     return false;
 }
 
+bool NativeDesktop::isPointerHeld() const
+{
+    return false;
+}
+
 bool NativeDesktop::isCompositing() const
 {
     return true;

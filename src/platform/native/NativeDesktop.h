@@ -43,6 +43,9 @@ public:
 
     /// Whether a window that is to be left out of captures of the screen is, once it is shown.
     [[nodiscard]] virtual bool keepsWindowsOutOfCaptures() const;
+    /// Whether a button of the pointer is held down, over whatever program's window; false where
+    /// the desktop does not tell. Asks the desktop: not for the path of a pointer event.
+    [[nodiscard]] virtual bool isPointerHeld() const;
     /// Whether transparent pixels of a window show what is below it.
     [[nodiscard]] virtual bool isCompositing() const;
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that

@@ -76,6 +76,15 @@ public:
         return reply && reply->owner != XCB_NONE;
     }
 
+    [[nodiscard]] bool isPointerHeld() const override
+    {
+        constexpr std::uint16_t buttons
+            = XCB_BUTTON_MASK_1 | XCB_BUTTON_MASK_2 | XCB_BUTTON_MASK_3; // the others are wheels
+        const auto cookie = xcb_query_pointer(m_connection, m_root);
+        const auto reply = owned(xcb_query_pointer_reply(m_connection, cookie, nullptr));
+        return reply && (reply->mask & buttons) != 0;
+    }
+
     void keepContentRatio(QWindow &window, const QSize &content) override
     {
         m_frames.keepContentRatio(static_cast<xcb_window_t>(window.winId()), content);

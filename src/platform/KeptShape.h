@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: MIT
+// Frames and pictures that keep a shape: how large they become and where they stand.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+namespace penwick::platform {
+
+/// `frame` inside `area`: scaled down in its own shape where it is larger, then moved by as little
+/// as brings it in.
+[[nodiscard]] Rect broughtInsideInShape(const Rect &frame, const Rect &area);
+
+/// The largest size in the shape of `picture` that `room` can hold, in whole points, at least one
+/// each way; never larger than `picture`.
+[[nodiscard]] Size scaledDownInto(const Size &picture, const Size &room);
+
+/// The frame in the shape of `ratio` for one that the user has pulled from `before` to `pulled`:
+/// where an edge was pulled outward, the smallest that holds what was pulled, so that no such pull
+/// makes a window smaller; otherwise the largest that fits into it. The edges that were not pulled
+/// stay, the top and left ones where none was.
+[[nodiscard]] Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio);
+
+} // namespace penwick::platform
