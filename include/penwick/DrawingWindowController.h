@@ -66,8 +66,10 @@ public:
     /// Two thirds of the screen's height, in points.
     [[nodiscard]] double minWindowHeight() const;
 
-    /// Sets the window up as `win_type` and places it on `screen`. A drawing window that is gone
-    /// stops the process.
+    /// Sets the window up as `win_type` and places it on `screen`. The frame of a window over an
+    /// image is as large as the image; when it is shown it is brought inside the screen's work
+    /// area, in its own shape, and the image scaled down once to what the content can hold. A
+    /// drawing window that is gone stops the process.
     void createWindowForApplication(WindowType win_type, QScreen &screen,
         const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle);
 
@@ -88,7 +90,8 @@ public:
     void hideThePopover();
 
     void windowDidLoad() override;
-    /// Brings the tool bar back that went when the window was closed.
+    /// Brings a window over an image inside its screen's work area, in its own shape, and the
+    /// tool bar back that went when the window was closed.
     void windowWillAppear() override;
     /// Hides the popover, as does another window's taking over.
     void windowWillMove() override;
@@ -111,7 +114,9 @@ private:
     void loadBanner();
     void attachToolBar();
     void placeToolBar();
+    void takeToolBarAlong(platform::Point way);
     void reopenToolBar();
+    void bringPictureInside();
     void centreBanner();
 
     std::optional<platform::Point> m_drawingWindowOrigin;
@@ -121,7 +126,7 @@ private:
     double m_minWindowHeight;
     std::shared_ptr<ToolPanelWindowController> m_tPanelWindowController;
     std::shared_ptr<platform::Window> m_sharingNotificationWindow;
-    bool m_isToolBarPlaced = false; // a window that has nothing to draw on shows none
+    bool m_isPlaced = false; // a window that has nothing to draw on is not, and has no tool bar
 };
 
 } // namespace penwick

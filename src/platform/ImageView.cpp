@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ImageView.h"
 
+#include "platform/KeptShape.h"
+
 namespace penwick::platform {
 
 namespace {
@@ -16,6 +18,7 @@ ImageView::ImageView(QWidget *parent)
 void ImageView::setImage(const QImage &image)
 {
     m_image = image;
+    m_scaled = QImage();
     setNeedsDisplay();
 }
 
@@ -27,8 +30,17 @@ void ImageView::setImageFrameStyle(ImageFrameStyle style)
 
 QRectF ImageView::imagePlace() const
 {
-    const QSizeF size = m_image.deviceIndependentSize();
-    return { QPointF(0.0, height() - size.height()), size };
+    const QSizeF own = m_image.deviceIndependentSize();
+    const Size size = scaledDownInto({ own.width(), own.height() }, bounds().size());
+    return { 0.0, height() - size.height, size.width, size.height };
+}
+
+// Strokes over the image have it painted again and again, and a painter scales less well.
+const QImage &ImageView::scaledTo(QSize pixels)
+{
+    if (m_scaled.size() != pixels)
+        m_scaled = m_image.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    return m_scaled;
 }
 
 void ImageView::draw(const Rect &)
@@ -45,8 +57,14 @@ void ImageView::draw(const Rect &)
 
 void ImageView::drawContent(QPainter &painter)
 {
-    if (!m_image.isNull())
-        painter.drawImage(imagePlace(), m_image);
+    if (m_image.isNull())
+        return;
+    const QRectF place = imagePlace();
+    if (place.size() == m_image.deviceIndependentSize())
+        painter.drawImage(place, m_image);
+    else
+        painter.drawImage(
+            place, scaledTo((place.size() * painter.device()->devicePixelRatio()).toSize()));
 }
 
 } // namespace penwick::platform

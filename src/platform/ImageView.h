@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Shows a still image at its own size.
+// Shows a still image.
 #pragma once
 
 #include "platform/ViewOf.h"
@@ -15,7 +15,8 @@ enum class ImageFrameStyle
     Photo = 1
 };
 
-/// An image in the bottom left corner of its view.
+/// An image in the bottom left corner of its view, at its own size; scaled down in its own shape
+/// where the view is smaller than that.
 class ImageView final : public ViewOf<QWidget>
 {
     Q_OBJECT
@@ -34,8 +35,10 @@ public:
 
 private:
     [[nodiscard]] QRectF imagePlace() const; // as Qt counts
+    [[nodiscard]] const QImage &scaledTo(QSize pixels);
 
     QImage m_image;
+    QImage m_scaled; // as last shown where it is smaller; null until then
     ImageFrameStyle m_imageFrameStyle = ImageFrameStyle::None;
 };
 

@@ -11,6 +11,7 @@
 #include "platform/WindowFlags.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
+#include "session/PictureFit.h"
 #include "session/ToolPanelWindowController.h"
 
 #include <QCoreApplication>
@@ -198,7 +199,7 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     const Rect screenFrame = platform::frameOfScreen(screen);
     m_minWindowWidth = screenFrame.width * 2 / 3;
     m_minWindowHeight = screenFrame.height * 2 / 3;
-    require(m_drawingWindow.data(), "the drawing window is gone");
+    require(m_drawingWindow.data(), "the drawing window is gone")->setScreen(&screen);
     if (auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView()))
         canvas->setCoversWindow(win_type == WindowType::whiteboard);
     switch (win_type) {
@@ -221,7 +222,10 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     }
     }
     m_drawingWindowOrigin = m_drawingWindow->frame().origin();
+    m_isPlaced = true;
     placeToolBar();
+    if (m_drawingWindow->isVisible())
+        bringPictureInside();
     if (win_type == WindowType::whiteboard && m_sharingNotificationWindow) {
         centreBanner();
         platform::WindowAttributes attributes = m_sharingNotificationWindow->attributes();
@@ -267,7 +271,9 @@ void DrawingWindowController::setAnnotationImage(
     if (title)
         m_drawingWindow->setWindowTitle(*title);
     content().configureAnnotatingImageView(image);
-    content().annotatedImageView()->setImageFrameStyle(platform::ImageFrameStyle::Photo);
+    platform::ImageView &view = *content().annotatedImageView();
+    view.setImageFrameStyle(platform::ImageFrameStyle::Photo);
+    new PictureFit(*m_drawingWindow, view); // the view's
 }
 
 DrawViewController &DrawingWindowController::content() const

@@ -4,7 +4,9 @@
 #include <penwick/DrawingWindowController.h>
 
 #include "canvas/DrawingCanvasView.h"
+#include "platform/KeptShape.h"
 #include "platform/OneShotTimer.h"
+#include "platform/WorkArea.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
 #include "platform/foundation/StandardOutput.h"
@@ -15,10 +17,13 @@
 #include <penwick/Penwick.h>
 #include <penwick/platform/NotificationCenter.h>
 
+#include <QScreen>
+
 namespace penwick {
 
 namespace {
 
+using platform::Rect;
 using platform::require;
 
 constexpr int bannerTime = 1500; // ms
@@ -45,7 +50,14 @@ void DrawingWindowController::placeToolBar()
     panel->setAttributes(attributes);
     m_tPanelWindowController->keepEndInReach();
     m_tPanelWindowController->showWindow(this);
-    m_isToolBarPlaced = true;
+}
+
+void DrawingWindowController::takeToolBarAlong(platform::Point way)
+{
+    platform::Window *const panel
+        = m_tPanelWindowController ? m_tPanelWindowController->window() : nullptr;
+    if (panel)
+        panel->setFrameOrigin(panel->frame().origin() + way);
 }
 
 // Undo and redo are what they were, though a tool bar that appears has neither: the drawing is
@@ -116,10 +128,33 @@ void DrawingWindowController::closeSharingNotificationWindow()
 
 // Appearing, moving, resizing, closing
 
+// The desktop's own rule for a window that is shown. What stands above it goes along; a tool bar
+// that was placed beside a larger window is placed anew.
+void DrawingWindowController::bringPictureInside()
+{
+    if (m_windowType != WindowType::imageAnnotation || !m_isPlaced || !m_drawingWindow)
+        return;
+    const Rect frame = m_drawingWindow->frame();
+    const Rect screen = platform::frameOfScreen(*m_drawingWindow->screen());
+    const Rect inside = platform::broughtInsideInShape(frame, platform::workAreaFor(screen));
+    if (inside == frame)
+        return;
+    hideThePopover();
+    m_drawingWindow->setFrame(inside);
+    m_drawingWindowOrigin = inside.origin();
+    if (inside.size() == frame.size())
+        takeToolBarAlong(inside.origin() - frame.origin());
+    else
+        placeToolBar();
+    if (m_sharingNotificationWindow && m_sharingNotificationWindow->parentWindow())
+        centreBanner();
+}
+
 void DrawingWindowController::windowWillAppear()
 {
     platform::requireGuiThread();
-    if (m_isToolBarPlaced && m_tPanelWindowController && m_tPanelWindowController->window())
+    bringPictureInside();
+    if (m_isPlaced && m_tPanelWindowController && m_tPanelWindowController->toolPanelWindow())
         reopenToolBar();
 }
 
@@ -144,7 +179,7 @@ void DrawingWindowController::windowDidResize()
     if (!m_drawingWindowOrigin || !m_drawingWindow)
         return;
     const platform::Point origin = m_drawingWindow->frame().origin();
-    panel->setFrameOrigin(panel->frame().origin() + (origin - *m_drawingWindowOrigin));
+    takeToolBarAlong(origin - *m_drawingWindowOrigin);
     m_tPanelWindowController->adjustPosition();
     m_drawingWindowOrigin = origin;
 }

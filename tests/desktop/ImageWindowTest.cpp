@@ -2,6 +2,7 @@
 // The layer over a still image: how large its window is, and where the image lies in it.
 #include "desktop/support/BoardFixture.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace penwick::desktop {
@@ -36,8 +37,18 @@ protected:
         static_cast<void>(toolBar());
     }
 
-    /// Where on the screen the image's top left corner must lie: its bottom left one is the
-    /// canvas's.
+    /// `image` as the window shows it: all of it, never larger than it is.
+    [[nodiscard]] QImage shown(const QImage &image)
+    {
+        const QSize room = canvas().size();
+        const double scale = std::min(
+            { 1.0, double(room.width()) / image.width(), double(room.height()) / image.height() });
+        return image.scaled((QSizeF(image.size()) * scale).toSize(), Qt::IgnoreAspectRatio,
+            Qt::SmoothTransformation);
+    }
+
+    /// Where on the screen the top left corner of what is shown must lie: its bottom left one is
+    /// the canvas's.
     [[nodiscard]] QPoint cornerOf(const QImage &image)
     {
         return canvas().bottomLeft() - QPoint(0, image.height() - 1);
@@ -53,7 +64,8 @@ protected:
 
     [[nodiscard]] bool comesToShow(const QImage &image)
     {
-        const QRect area = clearArea() & QRect(cornerOf(image), image.size());
+        const QRect area
+            = clearArea() & QRect(cornerOf(image), image.size()).adjusted(1, 1, -1, -1);
         return waitUntil([&] {
             return desktop().screen().picture(area)
                 == image.copy(area.translated(-cornerOf(image)))
@@ -73,12 +85,34 @@ TEST_P(ImageWindow, outerFrameIsAsLargeAsTheImage)
     EXPECT_EQ(host().window(QStringLiteral("drawing")).frame, QRect(213, 267, 600, 400));
 }
 
-TEST_P(ImageWindow, imageLiesInTheCanvassBottomLeftCornerAtItsOwnSize)
+TEST_P(ImageWindow, wholeImageLiesInTheCanvassBottomLeftCorner)
 {
     const QImage image = pictureOf({ 600, 400 });
     startOn(image);
+    ASSERT_EQ(shown(image).height(), canvas().height()) << "the title bar leaves no more room";
 
-    EXPECT_TRUE(comesToShow(image));
+    EXPECT_TRUE(comesToShow(shown(image)));
+}
+
+TEST_P(ImageWindow, largerThanTheScreenIsBroughtInsideWithItsTitleBarAndTheWholeImage)
+{
+    const QRect screen(0, 0, 1280, 800);
+    for (const QSize size : { QSize(3000, 2000), QSize(1280, 800), QSize(1281, 801),
+             QSize(300, 2400), QSize(3000, 300) }) {
+        const QImage image = pictureOf(size);
+        startOn(image);
+        const QRect frame = desktop().windows().outerFrame(window());
+
+        EXPECT_TRUE(screen.contains(frame)) << testing::PrintToString(frame);
+        const QSize wanted = size.boundedTo(screen.size()) == size
+            ? size
+            : size.scaled(1280, 800, Qt::KeepAspectRatio);
+        EXPECT_LE(std::abs(frame.width() - wanted.width()), 1) << testing::PrintToString(frame);
+        EXPECT_LE(std::abs(frame.height() - wanted.height()), 1) << testing::PrintToString(frame);
+        EXPECT_GT(canvas().top(), frame.top()) << "its title bar is within reach";
+        EXPECT_TRUE(screen.contains(toolBar().frame));
+        EXPECT_TRUE(comesToShow(shown(image))) << testing::PrintToString(size);
+    }
 }
 
 TEST_P(ImageWindow, hasTheTitleThatTheHostGave)
@@ -98,7 +132,7 @@ TEST_P(ImageWindow, strokeLiesOverTheImage)
     QImage image(600, 400, QImage::Format_RGB32);
     image.fill(QColor(200, 100, 0));
     startOn(image);
-    ASSERT_TRUE(comesToShow(image));
+    ASSERT_TRUE(comesToShow(shown(image)));
 
     drag({ { 200, 150 }, { 400, 150 } });
 
@@ -113,8 +147,9 @@ TEST_P(ImageWindow, strokeLiesOverTheImage)
 
 TEST_P(ImageWindow, keepsTheImageInItsCornerWhenTheUserMakesItLargerAndShowsThePhotosFrame)
 {
-    const QImage image = pictureOf({ 480, 270 });
-    startOn(image);
+    const QImage whole = pictureOf({ 480, 270 });
+    startOn(whole);
+    const QImage image = shown(whole);
     const QRect before = desktop().windows().outerFrame(window());
 
     desktop().pointer().drag(
@@ -123,9 +158,9 @@ TEST_P(ImageWindow, keepsTheImageInItsCornerWhenTheUserMakesItLargerAndShowsTheP
     ASSERT_TRUE(waitUntil([&] { return canvas().width() > 600; }));
     const auto frame
         = [&](QPoint fromCorner) { return desktop().screen().pixel(cornerOf(image) + fromCorner); };
-    EXPECT_TRUE(waitUntil([&] { return frame({ 479, 150 }) == photoFrame; }));
+    EXPECT_TRUE(waitUntil([&] { return frame({ image.width() - 1, 150 }) == photoFrame; }));
     EXPECT_EQ(frame({ 300, 0 }), photoFrame);
-    EXPECT_EQ(frame({ 480, 150 }), QColor(Qt::white));
+    EXPECT_EQ(frame({ image.width(), 150 }), QColor(Qt::white));
     EXPECT_EQ(frame({ 300, -1 }), QColor(Qt::white));
     const QRect inside = clearArea() & QRect(cornerOf(image), image.size()).adjusted(1, 1, -1, -1);
     EXPECT_EQ(desktop().screen().picture(inside), image.copy(inside.translated(-cornerOf(image))));

@@ -2,7 +2,12 @@
 // A still image in the corner from which drawings count.
 #include "platform/ImageView.h"
 
+#include <QPainter>
+
 #include <gtest/gtest.h>
+
+#include <utility>
+#include <vector>
 
 namespace penwick::platform {
 
@@ -63,14 +68,42 @@ TEST(ImageView, imageOfTwoPixelsAPointIsHalfAsLarge)
     EXPECT_EQ(shown(view), QRect(0, 25, 10, 5));
 }
 
-TEST(ImageView, imageThatIsLargerIsCutAtTheTopAndRight)
+TEST(ImageView, imageThatIsLargerIsScaledDownInItsOwnShape)
 {
     ImageView view;
     view.setFrame({ 0.0, 0.0, 40.0, 30.0 });
 
     view.setImage(plain(100, 100));
+    EXPECT_EQ(shown(view), QRect(0, 0, 30, 30));
+    view.setImage(plain(200, 50));
+    EXPECT_EQ(shown(view), QRect(0, 20, 40, 10));
+    view.setFrame({ 0.0, 0.0, 20.0, 30.0 });
+    EXPECT_EQ(shown(view), QRect(0, 25, 20, 5));
+    view.setFrame({ 0.0, 0.0, 300.0, 60.0 });
+    EXPECT_EQ(shown(view), QRect(0, 10, 200, 50)) << "at its own size again";
+}
 
-    EXPECT_EQ(shown(view), QRect(0, 0, 40, 30));
+TEST(ImageView, imageThatIsScaledDownIsSeenWhole)
+{
+    QImage image(80, 40, QImage::Format_RGB32);
+    image.fill(Qt::white);
+    const std::vector<std::pair<QPoint, QColor>> corners { { { 0, 0 }, Qt::red },
+        { { 40, 0 }, Qt::green }, { { 0, 20 }, Qt::blue }, { { 40, 20 }, Qt::black } };
+    QPainter painter(&image);
+    for (const auto &[place, color] : corners)
+        painter.fillRect(QRect(place, QSize(40, 20)), color);
+    painter.end();
+    ImageView view;
+    view.setFrame({ 0.0, 0.0, 20.0, 10.0 });
+    view.setImage(image);
+
+    QImage picture(20, 10, QImage::Format_RGB32);
+    view.render(&picture, QPoint(), QRegion(), QWidget::RenderFlags());
+
+    for (const auto &[place, color] : corners) {
+        EXPECT_EQ(picture.pixelColor(place / 4), color);
+        EXPECT_EQ(picture.pixelColor(place / 4 + QPoint(8, 3)), color);
+    }
 }
 
 } // namespace penwick::platform

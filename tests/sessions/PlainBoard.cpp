@@ -202,6 +202,12 @@ void PlainBoard::moveTo(const PlainFrame &frame)
     m_frames.moveTo(frame);
 }
 
+void PlainBoard::comeUpAt(const PlainFrame &frame)
+{
+    orderPopoverOut();
+    m_frames.moveTo(frame);
+}
+
 void PlainBoard::rest(const PlainFrame &frame)
 {
     m_isMoving = false;

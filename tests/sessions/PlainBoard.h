@@ -67,6 +67,8 @@ public:
     void setFrames(const PlainFrames &frames) { m_frames = frames; }
     [[nodiscard]] const PlainFrames &frames() const { return m_frames; }
 
+    void comeUpAt(const PlainFrame &frame);
+
     void activate(bool isActive);
     void minimise(bool isMinimised);
     void hide();

@@ -158,7 +158,11 @@ void Session::hideOrShow()
     if (shows) {
         m_real.show();
         m_plain->show();
-        hearPlace();
+        // One over an image is brought inside the screen, and its popover closed.
+        const PlainFrame place = plainFrame(m_real.outerFrame());
+        const PlainFrame &known = m_plain->frames().board;
+        if (place.x != known.x || place.y != known.y)
+            m_plain->comeUpAt(place);
     } else {
         m_real.hide();
         m_plain->hide();

@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+#include "session/PictureFit.h"
+
+#include "platform/ImageView.h"
+#include "platform/KeptShape.h"
+
+#include <penwick/platform/Window.h>
+
+#include <QEvent>
+
+#include <utility>
+
+namespace penwick {
+
+namespace {
+
+platform::Size sizeOf(const QSizeF &size)
+{
+    return { size.width(), size.height() };
+}
+
+} // namespace
+
+PictureFit::PictureFit(platform::Window &window, platform::ImageView &view)
+    : m_window(window)
+    , m_view(view)
+{
+    delete view.findChild<PictureFit *>(QString(), Qt::FindDirectChildrenOnly); // of another image
+    setParent(&view);
+    window.installEventFilter(this);
+    connect(&window, &platform::Window::frameSettled, this, &PictureFit::onSettled);
+}
+
+bool PictureFit::eventFilter(QObject *watched, QEvent *event)
+{
+    // Before the first paint, where the desktop tells the borders beforehand.
+    if (event->type() == QEvent::Resize)
+        fit();
+    return QObject::eventFilter(watched, event);
+}
+
+void PictureFit::fit()
+{
+    const platform::Size size = platform::scaledDownInto(
+        sizeOf(m_view.image().deviceIndependentSize()), sizeOf(m_window.size()));
+    m_view.setFrame({ 0.0, 0.0, size.width, size.height });
+}
+
+void PictureFit::onSettled()
+{
+    const bool hasFrame = m_window.frameGeometry() != m_window.geometry();
+    const auto former = std::exchange(m_settled, m_window.size());
+    // A desktop that tells nothing beforehand may still put a frame around the content, inside the
+    // frame that was asked for; one that never does leaves the content to the user's next pull.
+    const bool isPulled = former && *former != m_settled;
+    if (!isPulled)
+        fit();
+    if (!hasFrame && !isPulled)
+        return;
+    m_window.removeEventFilter(this);
+    disconnect(&m_window, nullptr, this, nullptr);
+    deleteLater();
+}
+
+} // namespace penwick
