@@ -6,9 +6,21 @@
 
 #include <QColor>
 #include <QHash>
+#include <QLatin1String>
 #include <QString>
 
 namespace penwick {
+
+// Constants of the compiler throughout: the library makes none of them as it is loaded, and none
+// is ever made twice.
+
+namespace ColorParts {
+inline constexpr ushort full = 0xFFFF;
+/// Alphas as QColor counts them when it is given a fraction.
+inline constexpr ushort alpha030 = 19661;
+inline constexpr ushort alpha040 = 26214;
+inline constexpr ushort alpha080 = 52428;
+} // namespace ColorParts
 
 /// The theme's colours. Several are equal by design and stay separate: they mean different things.
 namespace TnhColors {
@@ -21,7 +33,8 @@ inline constexpr QColor blackColor { 41, 41, 41 };
 inline constexpr QColor yellowColor { 255, 196, 61 };
 inline constexpr QColor lightBlueColor { 0, 167, 244 };
 inline constexpr QColor lightGreyColor { 203, 210, 218 };
-inline const QColor borderGreenColor = QColor::fromRgbF(0.0F, 1.0F, 0.0F, 0.3F);
+inline constexpr QColor borderGreenColor { QColor::Rgb, ColorParts::alpha030, 0, ColorParts::full,
+    0 };
 inline constexpr QColor endButtonColor { 239, 71, 111 };
 inline constexpr QColor endButtonColorHover { 255, 80, 134 };
 inline constexpr QColor endButtonColorContrast { 190, 41, 76 };
@@ -30,8 +43,10 @@ inline constexpr QColor toolPanelHandleColor { 203, 210, 218 };
 inline constexpr QColor toolPanelButtonColor { 246, 248, 250 };
 inline constexpr QColor toolPanelButtonHoverColor { 18, 168, 241 };
 inline constexpr QColor toolPanelButtonHoverColorContrast { 7, 69, 149 };
-inline const QColor textBoxEditBorderColor = QColor::fromRgbF(0.0F, 0.0F, 1.0F, 0.8F);
-inline const QColor textBoxNormalBorderColor = QColor::fromRgbF(0.0F, 0.0F, 1.0F, 0.4F);
+inline constexpr QColor textBoxEditBorderColor { QColor::Rgb, ColorParts::alpha080, 0, 0,
+    ColorParts::full };
+inline constexpr QColor textBoxNormalBorderColor { QColor::Rgb, ColorParts::alpha040, 0, 0,
+    ColorParts::full };
 inline constexpr QColor toolOptionButtonColor { 246, 248, 250 };
 inline constexpr QColor toolOptionButtonHoverColor { 203, 210, 218 };
 } // namespace TnhColors
@@ -54,15 +69,15 @@ inline constexpr QColor defaultTextFontColor { 0, 0, 0 };
 /// The identifiers of the tools: what the tool bar's buttons are called and what is handed on when
 /// one is chosen. Only the first three change what the pointer does.
 namespace Tools {
-inline const QString text = QStringLiteral("text");
-inline const QString brush = QStringLiteral("brush");
-inline const QString eraser = QStringLiteral("eraser");
-inline const QString color = QStringLiteral("color");
-inline const QString clear = QStringLiteral("clear");
-inline const QString state = QStringLiteral("state"); ///< ends the session
-inline const QString undo = QStringLiteral("undo");
-inline const QString redo = QStringLiteral("redo");
-inline const QString defaultSelectedTool = text;
+inline constexpr QLatin1String text { "text" };
+inline constexpr QLatin1String brush { "brush" };
+inline constexpr QLatin1String eraser { "eraser" };
+inline constexpr QLatin1String color { "color" };
+inline constexpr QLatin1String clear { "clear" };
+inline constexpr QLatin1String state { "state" }; ///< ends the session
+inline constexpr QLatin1String undo { "undo" };
+inline constexpr QLatin1String redo { "redo" };
+inline constexpr QLatin1String defaultSelectedTool = text;
 } // namespace Tools
 
 /// Hot spots in points from the top left corner of the cursor's image.

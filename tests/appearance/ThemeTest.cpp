@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <array>
 #include <ostream>
 #include <string>
 #include <vector>
@@ -102,6 +103,22 @@ INSTANTIATE_TEST_SUITE_P(Interface, ThemeColor,
 TEST(Theme, toolPanelHasRoundCornersOfFourPoints)
 {
     EXPECT_EQ(ToolPanelUI::toolPanelBorderRadius, 4.0);
+}
+
+// What the compiler knows is not made while the library is loaded.
+[[maybe_unused]] constexpr std::array known { TnhColors::borderGreenColor,
+    TnhColors::textBoxEditBorderColor, TnhColors::textBoxNormalBorderColor, TnhColors::redColor,
+    ToolPanelUI::toolPanelColor, TextBoxParams::defaultTextFontColor };
+static_assert(Tools::text.size() == 4 && Tools::brush.size() == 5 && Tools::eraser.size() == 6
+    && Tools::color.size() == 5 && Tools::clear.size() == 5 && Tools::state.size() == 5
+    && Tools::undo.size() == 4 && Tools::redo.size() == 4
+    && Tools::defaultSelectedTool.size() == 4);
+
+TEST(Theme, coloursThatShineThroughAreWhatTheirFractionsGive)
+{
+    EXPECT_EQ(TnhColors::borderGreenColor, QColor::fromRgbF(0.0F, 1.0F, 0.0F, 0.3F));
+    EXPECT_EQ(TnhColors::textBoxEditBorderColor, QColor::fromRgbF(0.0F, 0.0F, 1.0F, 0.8F));
+    EXPECT_EQ(TnhColors::textBoxNormalBorderColor, QColor::fromRgbF(0.0F, 0.0F, 1.0F, 0.4F));
 }
 
 TEST(Theme, toolAtTheStartIsText)
