@@ -6,6 +6,12 @@
 
 namespace penwick::platform {
 
+namespace {
+
+constexpr double titleInset = 2.0; // points, from the left and right edges
+
+} // namespace
+
 Button::Button(QWidget *parent)
     : ViewOf(parent)
 {
@@ -51,6 +57,8 @@ void Button::setAttributedTitle(const AttributedString &title)
 {
     m_attributedTitle = title;
     setText(title.string); // what accessibility reads out
+    if (!fittedTitle().isWhole)
+        setToolTip(title.string);
     setNeedsDisplay();
 }
 
@@ -71,11 +79,23 @@ void Button::draw(const Rect &)
         shown.paint(
             &painter, place, Qt::AlignCenter, isEnabled() ? QIcon::Normal : QIcon::Disabled);
     } else if (!m_attributedTitle.string.isEmpty()) {
-        painter.setFont(m_attributedTitle.font);
+        const FittedText title = fittedTitle();
+        painter.setFont(title.font);
         painter.setPen(m_attributedTitle.foregroundColor);
-        painter.drawText(rect(), static_cast<int>(m_attributedTitle.alignment | Qt::AlignVCenter),
-            m_attributedTitle.string);
+        painter.drawText(
+            rect(), static_cast<int>(m_attributedTitle.alignment | Qt::AlignVCenter), title.string);
     }
+}
+
+FittedText Button::fittedTitle() const
+{
+    return fittedText(
+        m_attributedTitle.string, m_attributedTitle.font, frame().width - 2 * titleInset);
+}
+
+bool Button::hitButton(const QPoint &position) const
+{
+    return rect().contains(position);
 }
 
 QSize Button::sizeHint() const

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "platform/AttributedString.h"
+#include "platform/FittedText.h"
 #include "platform/ViewOf.h"
 
 #include <QIcon>
@@ -62,13 +63,19 @@ public:
     [[nodiscard]] const QColor &backgroundColor() const { return m_backgroundColor; }
     void setBackgroundColor(const QColor &color);
     [[nodiscard]] const AttributedString &attributedTitle() const { return m_attributedTitle; }
+    /// One that is too long for the button is shown smaller, or shortened, and whole as tool tip.
     void setAttributedTitle(const AttributedString &title);
 
     void draw(const Rect &dirtyRect) override;
     [[nodiscard]] QSize sizeHint() const override;
 
+protected:
+    /// The whole of it, whatever the style thinks a button's middle is.
+    [[nodiscard]] bool hitButton(const QPoint &position) const override;
+
 private:
     void press();
+    [[nodiscard]] FittedText fittedTitle() const;
 
     QString m_identifier;
     QString m_imageName;

@@ -3,6 +3,8 @@
 
 #include <penwick/platform/Window.h>
 
+#include "platform/ViewController.h"
+#include "platform/ViewInput.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/ObjectIdentifier.h"
 
@@ -38,6 +40,31 @@ View::~View()
         if (subview.strong)
             subview.view->m_widget.setParent(nullptr);
     }
+}
+
+ViewController *View::viewController() const
+{
+    return m_viewController;
+}
+
+void View::setViewController(ViewController *controller)
+{
+    m_viewController = controller;
+}
+
+bool View::resignFirstResponder()
+{
+    return !m_viewController || m_viewController->resignFirstResponder();
+}
+
+void View::pressIsComing()
+{
+    Q_EMIT ViewInput::shared().pressed(*this);
+}
+
+void View::keyIsComing()
+{
+    Q_EMIT ViewInput::shared().keyPressed(*this);
 }
 
 // Geometry

@@ -9,6 +9,8 @@
 #include "platform/Cursor.h"
 #include "platform/Layer.h"
 
+#include <QPointer>
+
 #include <cstdint>
 #include <memory>
 #include <optional>
@@ -20,6 +22,7 @@ class QWidget;
 namespace penwick::platform {
 
 class PanGestureRecognizer;
+class ViewController;
 class Window;
 
 /// Which end of a pen a pointer is; none of a mouse or a finger.
@@ -64,6 +67,10 @@ public:
     [[nodiscard]] QWidget &widget() const { return m_widget; }
     /// The widget that shows the view's content: itself, or the viewport of a scrolling widget.
     [[nodiscard]] virtual QWidget &surface() const = 0;
+
+    /// The controller that answers for the view; null without one. Weak.
+    [[nodiscard]] ViewController *viewController() const;
+    void setViewController(ViewController *controller);
 
     /// Identity: unique in the process, the same for the view's whole life.
     [[nodiscard]] std::int64_t hash() const { return m_hash; }
@@ -156,8 +163,9 @@ public:
     virtual void viewDidMoveToWindow() { }
     /// The superview has another size than `former`, its size before.
     virtual void superviewDidResize(Size /*former*/) { }
-    /// Answers whether the view gives the first responder up.
-    virtual bool resignFirstResponder() { return true; }
+    /// Answers whether the view gives the first responder up; its controller's answer where the
+    /// view has one.
+    virtual bool resignFirstResponder();
 
     /// Paints the view as content, and above it its subviews, the lowest first, each in its place;
     /// `painter` counts in points from the top left corner of what is around the view. A view that
@@ -177,6 +185,8 @@ protected:
     explicit View(QWidget &widget);
 
     void widgetResized(Size former);
+    void pressIsComing();
+    void keyIsComing();
     void pointerEntered();
     /// The recognizers that follow the pointer now; a copy, because an action may change them.
     [[nodiscard]] std::vector<PanGestureRecognizer *> gestureRecognizers() const;
@@ -204,6 +214,7 @@ private:
     const std::int64_t m_hash;
     Rect m_frame;
     View *m_superview = nullptr;
+    QPointer<ViewController> m_viewController;
     std::vector<Subview> m_subviews;
     bool m_isHidden = false;
     bool m_isAboveSiblings = false;

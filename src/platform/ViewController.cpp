@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ViewController.h"
 
+#include "platform/View.h"
+
 namespace penwick::platform {
 
 ViewController::ViewController() = default;
@@ -9,6 +11,7 @@ ViewController::~ViewController() = default;
 void ViewController::setView(View &view)
 {
     m_view = &view;
+    view.setViewController(this);
     viewDidLoad();
 }
 

@@ -28,6 +28,8 @@ public:
     /// The window whose content the view is was asked to come to the screen; not again when it
     /// only comes back together with the window that it belongs to.
     virtual void viewWillAppear() { }
+    /// Answers whether the view, which has the keys and knows nothing better, gives them up.
+    virtual bool resignFirstResponder() { return true; }
 
 private:
     View *m_view = nullptr;

@@ -2,6 +2,7 @@
 // Makes a view of any widget class: Qt's events go in, the view's operations come out.
 #pragma once
 
+#include "platform/OwnLook.h"
 #include "platform/PanGestureRecognizer.h"
 #include "platform/PointerContact.h"
 #include "platform/PointerPress.h"
@@ -44,7 +45,7 @@ public:
 
     [[nodiscard]] QWidget &surface() const final
     {
-        if constexpr (std::is_base_of_v<QAbstractScrollArea, Base>)
+        if constexpr (scrolls)
             return *this->viewport();
         else
             return this->View::widget();
@@ -78,6 +79,35 @@ protected:
             }
         }
     };
+
+    bool event(QEvent *event) override
+    {
+        // What surrounds the content of a scrolling widget is the style's to paint: its frame.
+        if (scrolls && event->type() == QEvent::Paint)
+            return true;
+        if (event->type() == QEvent::KeyPress)
+            keyIsComing();
+        const bool changesLook = isAboutLook(*event);
+        const bool isHandled = Base::event(event);
+        if (!changesLook) // other events may have been the view's last
+            return isHandled;
+        if (keepOwnLook(this->View::widget()))
+            place();
+        if constexpr (scrolls)
+            fillWithSurface();
+        return isHandled;
+    }
+
+    // Overrides the operation of a `Base` that scrolls.
+    bool viewportEvent(QEvent *event)
+    {
+        if constexpr (scrolls) {
+            if (isAboutLook(*event) && keepOwnLook(surface()))
+                fillWithSurface();
+            return Base::viewportEvent(event);
+        }
+        return false;
+    }
 
     void paintEvent(QPaintEvent *event) override
     {
@@ -205,6 +235,20 @@ private:
         return event.modifiers() & ~Qt::KeypadModifier;
     }
 
+    static constexpr bool scrolls = std::is_base_of_v<QAbstractScrollArea, Base>;
+
+    // The frame and the padding that a style wants around it are not ours: margins that take them
+    // back stand every layout that follows.
+    void fillWithSurface()
+    {
+        const QRect whole = this->View::widget().rect();
+        const QRect inside = this->contentsRect();
+        const QMargins margins(-inside.left(), -inside.top(), inside.right() - whole.right(),
+            inside.bottom() - whole.bottom());
+        if (this->viewportMargins() != margins)
+            this->setViewportMargins(margins);
+    }
+
     void press(QMouseEvent *event, int clickCount)
     {
         event->accept();
@@ -241,6 +285,7 @@ private:
     void beginContact(const QPointerEvent &event, const MouseEvent &press)
     {
         m_contact.begin(event, press.locationInWindow, press.clickCount);
+        pressIsComing();
         pointerWasPressed();
         mouseDown(press);
         for (PanGestureRecognizer *const recognizer : gestureRecognizers())

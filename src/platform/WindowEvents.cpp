@@ -2,6 +2,7 @@
 // What a window makes of the toolkit's events, and of those that no view has taken.
 #include <penwick/platform/Window.h>
 
+#include "platform/OwnLook.h"
 #include "platform/View.h"
 #include "platform/WindowPrivate.h"
 #include "platform/foundation/GuiThread.h"
@@ -13,6 +14,15 @@
 #include <utility>
 
 namespace penwick::platform {
+
+bool Window::event(QEvent *event)
+{
+    const bool changesLook = isAboutLook(*event);
+    const bool isHandled = QWidget::event(event);
+    if (changesLook && keepOwnLook(*this)) // other events may have been the window's last
+        setFrame(frame());
+    return isHandled;
+}
 
 void Window::changeEvent(QEvent *event)
 {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "session/BannerLabel.h"
 
+#include "platform/OwnLook.h"
+
 #include <QFontMetricsF>
 #include <QPainterPath>
 
@@ -11,17 +13,15 @@ namespace {
 constexpr QColor ink { 255, 255, 255 };
 constexpr QColor outline { 41, 41, 41 };
 constexpr double outlineWidth = 4.0; // points; half of it shows
-constexpr int fontSize = 16; // points
+constexpr double fontSize = 16; // points
 
 } // namespace
 
 BannerLabel::BannerLabel(QWidget *parent)
     : ViewOf(parent)
+    , m_font(platform::ownFont(fontSize))
 {
-    QFont ownFont = font();
-    ownFont.setPixelSize(fontSize);
-    ownFont.setWeight(QFont::DemiBold);
-    setFont(ownFont);
+    m_font.setWeight(QFont::DemiBold);
 }
 
 void BannerLabel::setText(const QString &text)
@@ -31,13 +31,19 @@ void BannerLabel::setText(const QString &text)
     setNeedsDisplay();
 }
 
+double BannerLabel::widthOfText() const
+{
+    return QFontMetricsF(m_font).horizontalAdvance(m_text) + outlineWidth;
+}
+
 void BannerLabel::draw(const platform::Rect &)
 {
-    const QFontMetricsF metrics(font());
-    const double x = (width() - metrics.horizontalAdvance(m_text)) / 2;
+    const QFontMetricsF metrics(m_font);
+    const QString shown = metrics.elidedText(m_text, Qt::ElideRight, width() - outlineWidth);
+    const double x = (width() - metrics.horizontalAdvance(shown)) / 2;
     const double baseline = (height() + metrics.ascent() - metrics.descent()) / 2;
     QPainterPath letters;
-    letters.addText(x, baseline, font(), m_text);
+    letters.addText(x, baseline, m_font, shown);
     Painter painter(*this);
     painter.strokePath(
         letters, QPen(outline, outlineWidth, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));

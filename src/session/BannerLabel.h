@@ -4,6 +4,7 @@
 
 #include "platform/ViewOf.h"
 
+#include <QFont>
 #include <QString>
 #include <QWidget>
 
@@ -24,9 +25,13 @@ public:
     [[nodiscard]] const QString &text() const { return m_text; }
     void setText(const QString &text);
 
+    /// What the text needs, in points, its outline included.
+    [[nodiscard]] double widthOfText() const;
+
     void draw(const platform::Rect &dirtyRect) override;
 
 private:
+    QFont m_font;
     QString m_text;
 };
 

@@ -2,6 +2,7 @@
 #include "session/SharingNotificationScene.h"
 
 #include "platform/PlainView.h"
+#include "platform/WorkArea.h"
 #include "session/BannerLabel.h"
 #include "session/SharingNotificationViewController.h"
 
@@ -9,7 +10,30 @@
 
 #include "ui_SharingNotification.h"
 
+#include <algorithm>
+#include <cmath>
+
 namespace penwick {
+
+namespace {
+
+constexpr double screenMargin = 20.0; // points, beside a banner as wide as the screen
+
+// Other languages have longer words for it. What not even the screen is wide enough for, the label
+// shortens.
+void growFor(const Ui::SharingNotification &scene, QWidget &window)
+{
+    const double room = platform::workAreaFor({}).width - 2 * screenMargin - window.width();
+    const double missing = scene.bannerLabel->widthOfText() - scene.bannerLabel->width();
+    const int more = static_cast<int>(std::ceil(std::min(missing, room)));
+    if (more <= 0)
+        return;
+    for (QWidget *const widget : { &window, static_cast<QWidget *>(scene.bannerView),
+             static_cast<QWidget *>(scene.bannerLabel) })
+        widget->resize(widget->width() + more, widget->height());
+}
+
+} // namespace
 
 std::unique_ptr<QObject> makeSharingNotificationScene()
 {
@@ -19,6 +43,7 @@ std::unique_ptr<QObject> makeSharingNotificationScene()
     window->setAttributes(attributes);
     Ui::SharingNotification scene;
     scene.setupUi(window.get());
+    growFor(scene, *window);
     window->adoptScene();
 
     auto content = std::make_unique<SharingNotificationViewController>();

@@ -1,20 +1,16 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/TextBoxFont.h"
 
+#include "platform/OwnLook.h"
+
 #include <QFontDatabase>
 #include <QStringList>
-
-#include <algorithm>
-#include <cmath>
 
 namespace penwick {
 
 namespace {
 
 constexpr char16_t beforeStyle = u'-'; // in the name of a face
-
-constexpr double smallestFont = 1.0; // points
-constexpr double largestFont = 1000.0; // points; beyond it no line would fit a screen
 
 bool isSameWithoutSpaces(const QString &name, QStringView wanted)
 {
@@ -29,17 +25,11 @@ bool isSameWithoutSpaces(const QString &name, QStringView wanted)
     return next == wanted.end();
 }
 
-QFont sized(QFont font, double size)
-{
-    font.setPixelSize(static_cast<int>(std::lround(std::clamp(size, smallestFont, largestFont))));
-    return font;
-}
-
 } // namespace
 
 QFont systemFontOf(double size)
 {
-    return sized(QFontDatabase::systemFont(QFontDatabase::GeneralFont), size);
+    return platform::ownFont(size);
 }
 
 std::optional<QFont> fontNamed(const QString &face, double size)
@@ -53,7 +43,7 @@ std::optional<QFont> fontNamed(const QString &face, double size)
             continue;
         for (const QString &style : QFontDatabase::styles(family)) {
             if (isSameWithoutSpaces(style, all.sliced(hyphen + 1)))
-                return sized(QFontDatabase::font(family, style, 1), size);
+                return platform::ownFont(size, QFontDatabase::font(family, style, 1));
         }
     }
     return std::nullopt;

@@ -44,7 +44,9 @@ TextEditor::~TextEditor() = default;
 
 void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point origin)
 {
+    m_look.reset(); // what follows is to be heard
     setFont(font);
+    document()->setDefaultFont(font); // a style sheet's would be the widget's
     QTextCharFormat ink;
     ink.setForeground(color);
     textCursor().setBlockCharFormat(ink); // lasts when all of the text is deleted
@@ -52,6 +54,7 @@ void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point 
     QPalette colors = palette();
     colors.setColor(QPalette::Text, color);
     setPalette(colors);
+    m_look.emplace(*this);
     m_caret.setColor(color);
 
     document()->setDocumentMargin(0.0);

@@ -2,6 +2,7 @@
 // The editor under a text box: plain text in one font and colour, with the caret of its own.
 #pragma once
 
+#include "platform/OwnLook.h"
 #include "platform/ViewOf.h"
 #include "textbox/EditorHiding.h"
 #include "textbox/PlacedSelection.h"
@@ -9,6 +10,8 @@
 #include "textbox/TextRoom.h"
 
 #include <QTextEdit>
+
+#include <optional>
 
 namespace penwick {
 
@@ -63,6 +66,7 @@ private:
     TextCaret m_caret;
     EditorHiding m_hiding;
     PlacedSelection m_selection;
+    std::optional<platform::OwnEditorLook> m_look;
 };
 
 } // namespace penwick
