@@ -277,6 +277,19 @@ void DrawingCanvasView::resetCursorRects()
     addCursorRect(bounds(), m_cursorType);
 }
 
+bool DrawingCanvasView::isTextEdited() const
+{
+    const auto *const box
+        = dynamic_cast<TnTextBox *>(window() ? window()->firstResponder() : nullptr);
+    return box && box->superview() == this && box->isEditable();
+}
+
+bool DrawingCanvasView::hasPlacedTextBox(const platform::View &view) const
+{
+    const auto *const box = dynamic_cast<const TnTextBox *>(&view);
+    return box && box->superview() == this && !box->isEditable();
+}
+
 void DrawingCanvasView::setCoversWindow(bool covers)
 {
     m_coversWindow = covers;

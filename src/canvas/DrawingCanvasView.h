@@ -76,6 +76,11 @@ public:
     /// background itself, together with the strokes.
     void setCoversWindow(bool covers);
 
+    /// Whether a text box here has the keys and takes what is typed.
+    [[nodiscard]] bool isTextEdited() const;
+    /// Whether `view` is a text box here that is not being edited.
+    [[nodiscard]] bool hasPlacedTextBox(const platform::View &view) const;
+
     /// The window in which the tool bar shows its options; null where there is none. Weak.
     [[nodiscard]] platform::Window *popoverWindow() const { return m_popoverWindow; }
     void setPopoverWindow(platform::Window *window) { m_popoverWindow = window; }

@@ -17,6 +17,12 @@ PopoverView::PopoverView(QWidget *parent)
     : ViewOf(parent)
 { }
 
+PopoverView::PopoverView(const platform::Rect &frame)
+    : PopoverView(nullptr)
+{
+    setFrame(frame);
+}
+
 void PopoverView::viewDidMoveToWindow()
 {
     setWantsLayer(true);

@@ -16,6 +16,7 @@ class PopoverView final : public platform::ViewOf<QWidget>
 
 public:
     explicit PopoverView(QWidget *parent = nullptr);
+    explicit PopoverView(const platform::Rect &frame);
 
     void setUpLayer();
     void viewDidMoveToWindow() override;

@@ -28,6 +28,10 @@ void PopoverViewController::setPopoverViews(std::unique_ptr<PopoverView> text,
     m_textPopoverView = std::move(text);
     m_colorPopoverView = std::move(color);
     m_brushPopoverView = std::move(brush);
+    for (PopoverView *const view : { textPopoverView(), colorPopoverView(), brushPopoverView() }) {
+        if (view)
+            view->setViewController(this);
+    }
 }
 
 platform::Window *PopoverViewController::currentPopoverWindow() const
@@ -94,7 +98,7 @@ void PopoverViewController::OnToolOptionSelection(platform::Button &sender)
 bool PopoverViewController::resignFirstResponder()
 {
     closePopover();
-    return true;
+    return ViewController::resignFirstResponder();
 }
 
 void PopoverViewController::closePopover()

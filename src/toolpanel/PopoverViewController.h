@@ -36,6 +36,8 @@ public:
     [[nodiscard]] PopoverView *textPopoverView() const { return m_textPopoverView.get(); }
     [[nodiscard]] PopoverView *colorPopoverView() const { return m_colorPopoverView.get(); }
     [[nodiscard]] PopoverView *brushPopoverView() const { return m_brushPopoverView.get(); }
+    /// Takes all three, each of which may be missing. Whichever of them gives the keys up closes
+    /// the popover.
     void setPopoverViews(std::unique_ptr<PopoverView> text, std::unique_ptr<PopoverView> color,
         std::unique_ptr<PopoverView> brush);
 
@@ -53,7 +55,7 @@ public:
     /// process; an unknown kind of option is ignored.
     void OnToolOptionSelection(platform::Button &sender); // NOLINT: the name is fixed
     /// Closes the popover and gives the keys up.
-    bool resignFirstResponder();
+    bool resignFirstResponder() override;
 
 private:
     void closePopover();

@@ -44,6 +44,13 @@ QString toolForKey(const QKeyEvent &event)
     return event.modifiers() & noLetter ? QString() : drawingToolForKey(event.key());
 }
 
+bool isTyped(const QKeyEvent &event)
+{
+    const bool isLetter = event.key() >= Qt::Key_A && event.key() <= Qt::Key_Z;
+    const bool isDigit = event.key() >= Qt::Key_0 && event.key() <= Qt::Key_9;
+    return (isLetter || isDigit) && !(event.modifiers() & noLetter);
+}
+
 int optionForKey(const QKeyEvent &event)
 {
     const bool isDigit = event.key() >= Qt::Key_1 && event.key() <= Qt::Key_9;

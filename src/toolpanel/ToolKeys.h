@@ -15,6 +15,9 @@ namespace penwick {
 /// the editor has all of them first.
 [[nodiscard]] QString toolForKey(const QKeyEvent &event);
 
+/// Whether the key types a letter or a digit, so that it may be meant for a text.
+[[nodiscard]] bool isTyped(const QKeyEvent &event);
+
 /// Which option of an open popover the key stands for: 0 for "1" up to 8 for "9"; -1 for any other
 /// key.
 [[nodiscard]] int optionForKey(const QKeyEvent &event);

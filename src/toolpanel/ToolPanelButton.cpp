@@ -22,6 +22,9 @@ bool isContrastIncreased()
 
 ToolPanelButton::ToolPanelButton(QWidget *parent)
     : Button(parent)
+    , m_hoverBackgroundColor(TnhColors::toolPanelButtonHoverColor)
+    , m_hoverBackgroundColorContrast(TnhColors::toolPanelButtonHoverColorContrast)
+    , m_originalBackgroundColor(TnhColors::toolPanelButtonColor)
 {
     ToolPanelButton::awakeFromScene(); // by name: nothing that derives is there yet
 }
@@ -30,13 +33,15 @@ ToolPanelButton::ToolPanelButton(const platform::Rect &frame)
     : ToolPanelButton(nullptr)
 {
     setFrame(frame);
+    ToolPanelButton::awakeFromScene();
 }
 
 ToolPanelButton::~ToolPanelButton() = default;
 
-// Again after a scene gave the button its images.
+// Again after a scene gave the button its place and its images.
 void ToolPanelButton::awakeFromScene()
 {
+    m_trackingArea = platform::TrackingArea { bounds() };
     m_buttonImage = image();
     m_buttonAltImage = alternateImage();
 }
@@ -44,21 +49,6 @@ void ToolPanelButton::awakeFromScene()
 void ToolPanelButton::assignArrowColor(const QColor &color)
 {
     m_setArrowColor = color;
-}
-
-QColor ToolPanelButton::hoverBackgroundColor() const
-{
-    return TnhColors::toolPanelButtonHoverColor;
-}
-
-QColor ToolPanelButton::hoverBackgroundColorContrast() const
-{
-    return TnhColors::toolPanelButtonHoverColorContrast;
-}
-
-QColor ToolPanelButton::originalBackgroundColor() const
-{
-    return TnhColors::toolPanelButtonColor;
 }
 
 bool ToolPanelButton::hasFixedImage() const

@@ -3,6 +3,9 @@
 #pragma once
 
 #include "platform/Button.h"
+#include "platform/TrackingArea.h"
+
+#include <optional>
 
 namespace penwick {
 
@@ -40,12 +43,43 @@ public:
     [[nodiscard]] const QIcon &buttonAltImage() const { return m_buttonAltImage; }
     void setButtonAltImage(const QIcon &image) { m_buttonAltImage = image; }
 
-    /// Background under the pointer and when selected.
-    [[nodiscard]] virtual QColor hoverBackgroundColor() const;
+    /// Where the pointer's coming and going is told: the bounds as they were when the button was
+    /// made.
+    [[nodiscard]] const std::optional<platform::TrackingArea> &trackingArea() const
+    {
+        return m_trackingArea;
+    }
+    void setTrackingArea(const std::optional<platform::TrackingArea> &area)
+    {
+        m_trackingArea = area;
+    }
+
+    // The backgrounds. They are read through these operations, so that a class that derives has
+    // others by overriding two of them; what is assigned is then kept and not shown.
+
+    /// Under the pointer and when selected.
+    [[nodiscard]] virtual QColor hoverBackgroundColor() const { return m_hoverBackgroundColor; }
+    void setHoverBackgroundColor(const QColor &color) { m_hoverBackgroundColor = color; }
     /// The same while the desktop asks for more contrast.
-    [[nodiscard]] QColor hoverBackgroundColorContrast() const;
-    /// Background of the normal state.
-    [[nodiscard]] virtual QColor originalBackgroundColor() const;
+    [[nodiscard]] QColor hoverBackgroundColorContrast() const
+    {
+        return m_hoverBackgroundColorContrast;
+    }
+    void setHoverBackgroundColorContrast(const QColor &color)
+    {
+        m_hoverBackgroundColorContrast = color;
+    }
+    /// In the normal state.
+    [[nodiscard]] virtual QColor originalBackgroundColor() const
+    {
+        return m_originalBackgroundColor;
+    }
+    void setOriginalBackgroundColor(const QColor &color) { m_originalBackgroundColor = color; }
+
+    /// Nothing here; for a class that derives.
+    virtual void setViewImages() { }
+    /// Nothing here; for a class that derives.
+    virtual void defineTrackingAreaForTextBox() { }
 
     /// Shows isSelected().
     virtual void toggleToolState();
@@ -67,6 +101,10 @@ private:
     QColor m_setArrowColor = m_arrowNormalColor;
     QIcon m_buttonImage;
     QIcon m_buttonAltImage;
+    std::optional<platform::TrackingArea> m_trackingArea;
+    QColor m_hoverBackgroundColor;
+    QColor m_hoverBackgroundColorContrast;
+    QColor m_originalBackgroundColor;
 };
 
 } // namespace penwick

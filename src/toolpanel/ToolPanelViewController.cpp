@@ -7,6 +7,7 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
 #include "history/NotificationNames.h"
+#include "platform/OwnLook.h"
 #include "platform/PlainView.h"
 #include "platform/WindowFlags.h"
 #include "platform/WorkArea.h"
@@ -15,13 +16,10 @@
 #include "platform/foundation/StandardOutput.h"
 #include "toolpanel/PopoverView.h"
 #include "toolpanel/PopoverViewController.h"
-#include "toolpanel/ToolKeys.h"
 #include "toolpanel/ToolPanelButton.h"
 
 #include <penwick/platform/Window.h>
 #include <penwick/platform/WindowController.h>
-
-#include <QKeyEvent>
 
 namespace penwick {
 
@@ -32,6 +30,7 @@ using platform::require;
 
 constexpr double panelBorderWidth = 0.7; // points
 constexpr double endButtonRadius = 2.0; // points
+constexpr double endFontSize = 12.0; // points
 constexpr double popoverGap = 10.0; // points, between panel and popover
 constexpr int hiddenTitle = 1;
 constexpr int utilityWindowAnimation = 4;
@@ -55,14 +54,9 @@ ToolPanelViewController::~ToolPanelViewController()
     platform::Workspace::shared().notificationCenter().removeObserver(this);
 }
 
-DrawViewController *ToolPanelViewController::toolSelectionDelegate() const
-{
-    return m_toolSelectionDelegate;
-}
-
 ToolPanelButton *ToolPanelViewController::button(const QString &identifier) const
 {
-    return m_buttonMapping.value(identifier);
+    return m_buttonMapping ? m_buttonMapping->value(identifier) : nullptr;
 }
 
 platform::Window &ToolPanelViewController::panelWindow() const
@@ -73,8 +67,9 @@ platform::Window &ToolPanelViewController::panelWindow() const
 
 DrawingCanvasView &ToolPanelViewController::canvas() const
 {
-    const DrawViewController *const drawing
-        = require(m_toolSelectionDelegate.data(), "the tool panel has no drawing to serve");
+    auto *const drawing = dynamic_cast<DrawingCanvasDelegate *>(
+        require(m_toolSelectionDelegate.get(), "the tool panel has no drawing to serve"));
+    require(drawing, "what the tool panel serves is no drawing");
     return *require(drawing->drawingView(), "the tool panel's drawing has no canvas");
 }
 
@@ -83,25 +78,28 @@ DrawingCanvasView &ToolPanelViewController::canvas() const
 void ToolPanelViewController::viewDidLoad()
 {
     const ToolPanelOutlets &out = m_outlets;
-    m_buttonMapping = { { Tools::text, &outlet(out.textButton) },
+    m_buttonMapping = ButtonMapping { { Tools::text, &outlet(out.textButton) },
         { Tools::brush, &outlet(out.brushButton) }, { Tools::eraser, &outlet(out.eraserButton) },
         { Tools::color, &outlet(out.colorButton) }, { Tools::clear, &outlet(out.clearButton) },
         { Tools::state, &outlet(out.stateButton) }, { Tools::redo, &outlet(out.redoButton) },
         { Tools::undo, &outlet(out.undoButton) } };
-    m_buttons = { out.textButton, out.brushButton, out.eraserButton, out.colorButton,
+    m_buttons = Buttons { out.textButton, out.brushButton, out.eraserButton, out.colorButton,
         out.clearButton, out.redoButton, out.undoButton };
     ViewController::viewDidLoad();
     view()->setWantsLayer(true);
     // So that no drawing cursor of the canvas survives over the tool bar.
     view()->addCursorRect(view()->bounds(), platform::Cursor::arrow());
-    m_popoverVc = std::make_unique<PopoverViewController>(QStringLiteral("CommonPopoverView"),
-        *require(penwickBundle(), "the resource bundle is not set"));
-    makePopoverWindow();
+    makePopoverWindow(std::make_unique<PopoverViewController>(QStringLiteral("CommonPopoverView"),
+        *require(penwickBundle(), "the resource bundle is not set")));
     observe();
+    followInput();
 }
 
-void ToolPanelViewController::makePopoverWindow()
+// The window owns the popovers' controller, and keeps it when another of its popovers becomes the
+// content.
+void ToolPanelViewController::makePopoverWindow(std::unique_ptr<PopoverViewController> popovers)
 {
+    m_popoverVc = popovers.get();
     m_popoverW = std::make_unique<platform::Window>();
     m_popoverW->setObjectName(QStringLiteral("popover"));
     platform::WindowAttributes attributes;
@@ -118,6 +116,7 @@ void ToolPanelViewController::makePopoverWindow()
     const platform::Size size
         = require(m_popoverVc->view(), "the popovers have no view")->frame().size();
     m_popoverW->setFrame({ 0.0, 0.0, size.width, size.height });
+    m_popoverW->setContentViewController(std::move(popovers));
 }
 
 void ToolPanelViewController::observe()
@@ -134,7 +133,7 @@ void ToolPanelViewController::observe()
 
 void ToolPanelViewController::viewWillAppear()
 {
-    require(m_popoverVc.get(), "the tool panel has no popovers")
+    require(m_popoverVc.data(), "the tool panel has no popovers")
         ->setCurrentPopoverWindow(m_popoverW.get());
     connectToDrawing();
     paintPanel();
@@ -154,10 +153,11 @@ void ToolPanelViewController::connectToDrawing()
         = require(drawingWindow->windowController(), "the drawing window has no controller");
     platform::Window *const window
         = require(controller->window(), "the drawing window's controller has no window");
-    m_toolSelectionDelegate
+    auto *const drawing
         = require(dynamic_cast<DrawViewController *>(window->contentViewController()),
             "the drawing window's content is no drawing");
-    m_popoverVc->setToolPopoverDelegate(m_toolSelectionDelegate);
+    m_toolSelectionDelegate = drawing;
+    m_popoverVc->setToolPopoverDelegate(drawing);
     m_popoverVc->setToolPanelOptionDelegate(this);
     canvas().setPopoverWindow(m_popoverW.get());
     canvas().setToolChooser(this);
@@ -177,8 +177,9 @@ void ToolPanelViewController::paintPanel()
 
 void ToolPanelViewController::titleEndButton()
 {
-    ToolPanelButton &end = outlet(m_outlets.stateButton);
-    end.setAttributedTitle({ tr("END"), Qt::white, end.font(), Qt::AlignHCenter });
+    outlet(m_outlets.stateButton)
+        .setAttributedTitle(
+            { tr("END"), Qt::white, platform::ownFont(endFontSize), Qt::AlignHCenter });
 }
 
 void ToolPanelViewController::determineEndButtonBackgroundColor()
@@ -188,7 +189,7 @@ void ToolPanelViewController::determineEndButtonBackgroundColor()
     outlet(m_outlets.stateButton)
         .setBackgroundColor(
             isIncreased ? TnhColors::endButtonColorContrast : TnhColors::endButtonColor);
-    for (const auto &each : m_buttons)
+    for (const auto &each : m_buttons.value_or(Buttons {}))
         outlet(each).toggleToolState();
 }
 
@@ -223,8 +224,8 @@ void ToolPanelViewController::OnToolBarItemSelection(platform::Button &sender)
     showSelected(m_currentSelectedButton, true);
     showPopoverFor(m_selectedButtonId, toolBefore);
     // Last: "state" ends the session, and with it this panel.
-    if (m_toolSelectionDelegate)
-        m_toolSelectionDelegate->handleToolSelection(m_selectedButtonId);
+    if (ToolSelectionDelegate *const drawing = m_toolSelectionDelegate.get())
+        drawing->handleToolSelection(m_selectedButtonId);
 }
 
 void ToolPanelViewController::chooseTool(const QString &tool)
@@ -317,35 +318,6 @@ void ToolPanelViewController::placePopover(const ToolPanelButton &anchor)
     // Where there is no room for it beside the panel, what it offers would be out of reach; over
     // the panel it would cover its button, which closes it.
     m_popoverW->setFrame(platform::broughtInsideBeside(place, platform::workAreaFor(panel), panel));
-}
-
-// Keys
-
-bool ToolPanelViewController::performKey(const QKeyEvent &event)
-{
-    if (!m_toolSelectionDelegate) // the panel has not appeared
-        return false;
-    if (m_popoverW->isVisible() && performPopoverKey(event))
-        return true;
-    ToolPanelButton *const pressed = button(toolForKey(event));
-    if (pressed)
-        pressed->click();
-    return pressed;
-}
-
-bool ToolPanelViewController::performPopoverKey(const QKeyEvent &event)
-{
-    if (event.key() == Qt::Key_Escape) {
-        hidePopover();
-        return true;
-    }
-    const platform::View *const popover = m_popoverW->contentView();
-    const std::vector<platform::View *> options = popover->subviews().front()->subviews();
-    const auto index = static_cast<std::size_t>(optionForKey(event));
-    if (index >= options.size())
-        return false;
-    dynamic_cast<platform::Button &>(*options[index]).click();
-    return true;
 }
 
 // What others tell

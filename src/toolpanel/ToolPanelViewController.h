@@ -3,8 +3,11 @@
 #pragma once
 
 #include "canvas/ToolChooser.h"
+#include "canvas/ToolSelectionDelegate.h"
 #include "platform/ViewController.h"
+#include "platform/WeakReference.h"
 #include "toolpanel/PopoverChoice.h"
+#include "toolpanel/ToolKeyRest.h"
 #include "toolpanel/ToolPanelOptionDelegate.h"
 
 #include <penwick/platform/NotificationCenter.h>
@@ -20,7 +23,6 @@ class QKeyEvent;
 
 namespace penwick {
 
-class DrawViewController;
 class DrawingCanvasView;
 class PopoverViewController;
 class ToolPanelButton;
@@ -28,6 +30,7 @@ class ToolPanelButton;
 namespace platform {
 class Button;
 class PlainView;
+class View;
 class Window;
 } // namespace platform
 
@@ -49,6 +52,9 @@ struct ToolPanelOutlets
 
 /// Keeps the button of the canvas's tool selected, hands every press on to the drawing side, shows
 /// the popovers in a window of their own and enables undo and redo as the history says.
+///
+/// Its stored values may be assigned, as whoever builds it from parts does; none of them is owned
+/// but the popovers' window.
 class ToolPanelViewController final : public platform::ViewController,
                                       public ToolPanelOptionDelegate,
                                       public ToolChooser
@@ -60,18 +66,43 @@ public:
     ~ToolPanelViewController() override;
 
     [[nodiscard]] ToolPanelOutlets &outlets() { return m_outlets; }
-    /// Who gets the choice of a tool: the controller of the window that the panel belongs to; null
-    /// before the panel appeared. Weak.
-    [[nodiscard]] DrawViewController *toolSelectionDelegate() const;
-    [[nodiscard]] PopoverViewController *popoverVc() const { return m_popoverVc.get(); }
+    /// Who gets the choice of a tool: when the panel appears, the controller of the window that it
+    /// belongs to; null before. It is a DrawingCanvasDelegate too, or the first press stops the
+    /// process. Weak.
+    [[nodiscard]] ToolSelectionDelegate *toolSelectionDelegate() const;
+    void setToolSelectionDelegate(ToolSelectionDelegate *delegate);
+    /// The popovers' controller; null until the view was loaded. The popovers' window owns it.
+    [[nodiscard]] PopoverViewController *popoverVc() const;
     /// The window that shows the popovers; null until the view was loaded.
     [[nodiscard]] platform::Window *popoverW() const { return m_popoverW.get(); }
     /// The popover that was put into the window last; nothing before the first. Hiding it does not
     /// change this.
     [[nodiscard]] std::optional<PopoverChoice> visiblePopover() const { return m_visiblePopover; }
+    void setVisiblePopover(std::optional<PopoverChoice> choice) { m_visiblePopover = choice; }
+    /// The button pressed last.
     [[nodiscard]] const QString &selectedButtonId() const { return m_selectedButtonId; }
+    void setSelectedButtonId(const QString &identifier) { m_selectedButtonId = identifier; }
     /// The button called `identifier`; null for an unknown one.
     [[nodiscard]] ToolPanelButton *button(const QString &identifier) const;
+
+    using ButtonMapping = QHash<QString, QPointer<ToolPanelButton>>;
+    using Buttons = std::vector<QPointer<ToolPanelButton>>;
+    /// All eight buttons by their identifiers; nothing until the view was loaded.
+    [[nodiscard]] const std::optional<ButtonMapping> &buttonMapping() const;
+    void setButtonMapping(const std::optional<ButtonMapping> &mapping);
+    /// The seven that are painted anew when the contrast changes, all but the end button, in their
+    /// order; nothing until the view was loaded.
+    [[nodiscard]] const std::optional<Buttons> &buttons() const;
+    void setButtons(const std::optional<Buttons> &buttons);
+    /// Kept, and not used by anything here.
+    [[nodiscard]] ToolPanelButton *lastSelectedTool() const;
+    void setLastSelectedTool(ToolPanelButton *button);
+    /// The button of the tool that was the canvas's before the press.
+    [[nodiscard]] ToolPanelButton *lastSelectedButton() const;
+    void setLastSelectedButton(ToolPanelButton *button);
+    /// The button that was just pressed.
+    [[nodiscard]] ToolPanelButton *currentSelectedButton() const;
+    void setCurrentSelectedButton(ToolPanelButton *button);
 
     void viewDidLoad() override;
     /// Finds the drawing side through the windows and takes its state over. A missing link stops
@@ -88,11 +119,19 @@ public:
     void hidePopover();
     /// Presses the button, or the option of the open popover, that the key stands for; Escape
     /// closes the popover. Answers whether there was something to do.
+    ///
+    /// While a text is edited all keys are its editor's; a key that repeats itself works nothing;
+    /// letters and digits rest as ToolKeyRest says.
     bool performKey(const QKeyEvent &event);
+    /// The keyboard has come to the tool bar: letters and digits work it again.
+    void keyboardEntered() { m_keyRest.keyboardEnteredBar(); }
 
 private:
-    void makePopoverWindow();
+    void makePopoverWindow(std::unique_ptr<PopoverViewController> popovers);
     void observe();
+    void followInput();
+    void onPressed(const platform::View &view);
+    void onKeyPressed(const platform::View &view);
     void connectToDrawing();
     void paintPanel();
     void titleEndButton();
@@ -104,20 +143,24 @@ private:
     void showPopoverFor(const QString &identifier, const QString &toolBefore);
     void restoreSelection();
     bool performPopoverKey(const QKeyEvent &event);
+    [[nodiscard]] bool isOwnWindow(const platform::Window *window) const;
     [[nodiscard]] platform::Window &panelWindow() const;
+    [[nodiscard]] DrawingCanvasView *canvasIfAny() const;
     [[nodiscard]] DrawingCanvasView &canvas() const;
     static void showSelected(ToolPanelButton *button, bool isSelected);
 
     ToolPanelOutlets m_outlets;
-    QPointer<DrawViewController> m_toolSelectionDelegate;
-    QHash<QString, QPointer<ToolPanelButton>> m_buttonMapping;
-    std::vector<QPointer<ToolPanelButton>> m_buttons; // repainted on a contrast change
-    std::unique_ptr<PopoverViewController> m_popoverVc;
+    platform::WeakReference<ToolSelectionDelegate> m_toolSelectionDelegate;
+    QPointer<ToolPanelButton> m_lastSelectedTool;
+    std::optional<ButtonMapping> m_buttonMapping;
+    std::optional<Buttons> m_buttons;
+    QPointer<PopoverViewController> m_popoverVc; // in m_popoverW
     std::unique_ptr<platform::Window> m_popoverW;
     QString m_selectedButtonId;
-    QPointer<ToolPanelButton> m_lastSelectedButton; // of the tool before the press
-    QPointer<ToolPanelButton> m_currentSelectedButton; // just pressed
+    QPointer<ToolPanelButton> m_lastSelectedButton;
+    QPointer<ToolPanelButton> m_currentSelectedButton;
     std::optional<PopoverChoice> m_visiblePopover;
+    ToolKeyRest m_keyRest;
 };
 
 } // namespace penwick

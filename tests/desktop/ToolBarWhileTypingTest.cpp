@@ -76,6 +76,32 @@ TEST_F(ToolBarWhileTyping, keysOfUndoAndRedoAreTheEditorsOwn)
     EXPECT_TRUE(waitUntil([&] { return inked().width() <= caret; }));
 }
 
+TEST_F(ToolBarWhileTyping, whoTypesOnAfterTheEndChoosesNoTool)
+{
+    desktop().keyboard().press("Return");
+    desktop().keyboard().type("be");
+    desktop().keyboard().pressWith("Control_L", "z"); // takes the box away, after the letters
+
+    EXPECT_TRUE(waitUntil([&] { return inked().isNull(); }));
+    EXPECT_TRUE(turns("text", selected));
+    EXPECT_TRUE(turns("brush", normal));
+    EXPECT_TRUE(turns("eraser", normal));
+
+    desktop().pointer().click(onScreen({ 600, 300 })); // a box, which is left by its key
+    desktop().keyboard().press("Return");
+    press("brush");
+    desktop().keyboard().type("e");
+    EXPECT_TRUE(turns("eraser", selected));
+}
+
+TEST_F(ToolBarWhileTyping, keyThatClosesWindowsIsTheEditorsOwn)
+{
+    desktop().keyboard().pressWith("Control_L", "w");
+
+    type("mm");
+    EXPECT_TRUE(host().window(QStringLiteral("drawing")).isVisible);
+}
+
 TEST_F(ToolBarWhileTyping, textToolTakesTheKeys)
 {
     press("text");

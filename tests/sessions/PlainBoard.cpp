@@ -57,6 +57,8 @@ void PlainBoard::hear(const std::string &notification)
 void PlainBoard::press(const std::string &target, Spot spot, int clickCount)
 {
     m_held = target;
+    const auto box = m_canvas.allBoxes.find(target);
+    m_doLettersRest = box != m_canvas.allBoxes.end() && !box->second.isEditable;
     if (target == "canvas") {
         if (m_isKey) {
             orderPopoverOut();
@@ -157,6 +159,7 @@ void PlainBoard::showPopoverFor(const std::string &tool, const std::string &tool
 
 void PlainBoard::pressPanel()
 {
+    pressBar();
     hidePopover();
     m_frames.pullPanelIn();
 }

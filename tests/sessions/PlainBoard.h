@@ -30,6 +30,8 @@ public:
     [[nodiscard]] bool isHeld() const { return !m_held.empty(); }
 
     void click(const std::string &tool); ///< its button, by whatever means
+    /// The left button goes down on the tool bar or a popover.
+    void pressBar() { m_doLettersRest = false; }
     void choose(const std::string &option); ///< its button: kind#value
     void pressPanel(); ///< its background
     /// By X-like names: letters, Return, BackSpace, 1 to 9, and C-z, C-y, C-Delete, C-w.
@@ -122,6 +124,7 @@ private:
     bool m_isKey = true;
     bool m_isClosed = false;
     bool m_isBannerShown = false;
+    bool m_doLettersRest = false; // letters and digits, which otherwise work the tool bar
     PlainFrames m_frames;
     bool m_isMoving = false;
 

@@ -19,6 +19,7 @@ void PlainBoard::boxKey(const std::string &box, const std::string &name)
 {
     const bool isEditable = m_canvas.allBoxes.at(box).isEditable;
     PlainText &text = m_canvas.allBoxes.at(box).text;
+    m_doLettersRest |= isEditable;
     if (name == "Escape" && !text.composed().empty()) {
         text.commit();
     } else if (name == "Return" || name == "Tab" || name == "Escape") {
@@ -29,7 +30,7 @@ void PlainBoard::boxKey(const std::string &box, const std::string &name)
         m_canvas.backspace();
     } else if (isEditable && name.size() == 1) {
         m_canvas.type(name);
-    } else {
+    } else if (!isEditable) {
         windowKey(name);
     }
 }
@@ -39,6 +40,8 @@ void PlainBoard::windowKey(const std::string &name)
     static const std::map<std::string, std::string> tools { { "b", "brush" }, { "t", "text" },
         { "e", "eraser" }, { "c", "color" }, { "C-z", "undo" }, { "C-y", "redo" },
         { "C-Delete", "clear" }, { "C-w", "state" } };
+    if (name.size() == 1 && m_doLettersRest)
+        return;
     if (isPopoverVisible()) {
         if (name == "Escape")
             return hidePopover();
@@ -56,6 +59,7 @@ void PlainBoard::windowKey(const std::string &name)
 
 void PlainBoard::edit(const std::string &key)
 {
+    m_doLettersRest = true;
     editIn(m_canvas.editedBox(), key);
 }
 

@@ -27,6 +27,8 @@ void Session::clickTool(const Step &step)
     const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
     say("tool " + name + (byPointer ? " by pointer" : ""));
     m_real.clickTool(name, byPointer);
+    if (byPointer)
+        m_plain->pressBar();
     m_plain->click(name);
 }
 
@@ -40,6 +42,8 @@ void Session::chooseOption(const Step &step)
     const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
     say("option " + name + (byPointer ? " by pointer" : ""));
     m_real.chooseOption(name, byPointer);
+    if (byPointer)
+        m_plain->pressBar();
     m_plain->choose(name);
 }
 
@@ -88,6 +92,7 @@ void Session::takeWindowStep(const Step &step)
     } else if (!m_real.held() && step.kind == Kind::ToolMissed) {
         say("press a tool and let go beside it");
         m_real.pressToolElsewhere(toolNames()[static_cast<std::size_t>(step.a) % 8]);
+        m_plain->pressBar();
     }
 }
 

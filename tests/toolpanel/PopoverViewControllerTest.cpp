@@ -201,6 +201,32 @@ TEST_F(PopoverChoiceTest, resigningClosesThePopover)
     EXPECT_TRUE(bar.popoverVc()->resignFirstResponder());
 }
 
+TEST_F(PopoverChoiceTest, popoverThatGivesTheKeysUpCloses)
+{
+    const std::vector<PopoverView *> views = popoverViews();
+    const std::vector<const char *> tools { "text", "color", "brush" };
+    press("text");
+    for (std::size_t index = 0; index < views.size(); ++index) {
+        if (!isPopoverShown())
+            press(tools[index]);
+        if (!isPopoverShown()) // the first press of a tool only chooses it
+            press(tools[index]);
+        ASSERT_EQ(popover().contentView(), views[index]);
+        ASSERT_TRUE(popover().makeFirstResponder(views[index]));
+        EXPECT_TRUE(isPopoverShown());
+
+        EXPECT_TRUE(popover().makeFirstResponder(nullptr));
+        EXPECT_FALSE(isPopoverShown()) << tools[index];
+    }
+}
+
+TEST_F(PopoverChoiceTest, viewMadeInCodeHasItsFrame)
+{
+    const PopoverView view(platform::Rect { 3, 4, 50, 60 });
+
+    EXPECT_EQ(view.frame(), (platform::Rect { 3, 4, 50, 60 }));
+}
+
 TEST_F(PopoverChoiceTest, popoverTakesItsColoursInTheWindow)
 {
     for (PopoverView *const view : popoverViews()) {

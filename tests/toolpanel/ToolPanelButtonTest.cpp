@@ -44,6 +44,15 @@ protected:
 class ToolPanelButtonTest : public ButtonFixture, public testing::Test
 { };
 
+/// One with colours of its own.
+class Violet final : public ToolPanelButton
+{
+public:
+    using ToolPanelButton::ToolPanelButton;
+    [[nodiscard]] QColor hoverBackgroundColor() const override { return { 90, 0, 160 }; }
+    [[nodiscard]] QColor originalBackgroundColor() const override { return { 240, 230, 250 }; }
+};
+
 class ColorButton : public ButtonFixture, public testing::Test
 {
 protected:
@@ -297,5 +306,57 @@ TEST_P(ButtonWithoutOptions, hasNoTriangle)
 INSTANTIATE_TEST_SUITE_P(Identifiers, ButtonWithoutOptions,
     testing::Values("eraser", "color", "clear", "state", "undo", "redo", "Text", ""),
     identifierName);
+
+TEST_F(ToolPanelButtonTest, backgroundsAreAssigned)
+{
+    m_button.setOriginalBackgroundColor(Qt::green);
+    m_button.setHoverBackgroundColor(Qt::yellow);
+    m_button.setHoverBackgroundColorContrast(Qt::cyan);
+
+    toggle(false);
+    EXPECT_EQ(m_button.backgroundColor(), QColor(Qt::green));
+    enter();
+    EXPECT_EQ(m_button.backgroundColor(), QColor(Qt::yellow));
+    leave();
+    EXPECT_EQ(m_button.backgroundColor(), QColor(Qt::green));
+    m_contrast.setIncreased(true);
+    toggle(true);
+    EXPECT_EQ(m_button.backgroundColor(), QColor(Qt::cyan));
+}
+
+TEST_F(ToolPanelButtonTest, overriddenBackgroundsComeBeforeAssignedOnes)
+{
+    Violet violet(platform::Rect { 0, 0, 32, 32 });
+    violet.setOriginalBackgroundColor(Qt::green);
+    violet.setHoverBackgroundColor(Qt::yellow);
+
+    violet.toggleToolState();
+    EXPECT_EQ(violet.backgroundColor(), QColor(240, 230, 250));
+    violet.mouseEntered();
+    EXPECT_EQ(violet.backgroundColor(), QColor(90, 0, 160));
+}
+
+TEST_F(ToolPanelButtonTest, trackingAreaIsItsBoundsWhenItWasMade)
+{
+    ASSERT_TRUE(m_button.trackingArea());
+    EXPECT_EQ(m_button.trackingArea()->rect, (platform::Rect { 0, 0, 32, 32 }));
+    EXPECT_EQ(m_button.trackingArea()->options, 0x81U);
+
+    m_button.setFrame({ 0, 0, 64, 64 });
+    EXPECT_EQ(m_button.trackingArea()->rect, (platform::Rect { 0, 0, 32, 32 }));
+    m_button.setTrackingArea(std::nullopt);
+    EXPECT_EQ(m_button.trackingArea(), std::nullopt);
+}
+
+TEST_F(ToolPanelButtonTest, operationsForThoseThatDeriveChangeNothing)
+{
+    const ButtonLook before = look();
+
+    m_button.setViewImages();
+    m_button.defineTrackingAreaForTextBox();
+
+    EXPECT_EQ(look(), before);
+    EXPECT_EQ(m_button.trackingArea()->rect, (platform::Rect { 0, 0, 32, 32 }));
+}
 
 } // namespace penwick::test

@@ -91,6 +91,21 @@ TEST_F(ToolPanelDeathTest, pressWithoutADrawingStops)
     });
 }
 
+TEST_F(ToolPanelDeathTest, pressForADelegateThatIsNoDrawingStops)
+{
+    class Listener final : public QObject, public ToolSelectionDelegate
+    {
+    public:
+        void handleToolSelection(const QString &) override { }
+        void handleToolOptionSelection(const QString &) override { }
+    };
+    expectStop("what the tool panel serves is no drawing", [this] {
+        Listener listener;
+        bar.setToolSelectionDelegate(&listener);
+        press("brush");
+    });
+}
+
 TEST_F(ToolPanelDeathTest, pressWithoutACanvasStops)
 {
     expectStop("the tool panel's drawing has no canvas", [this] {

@@ -42,6 +42,118 @@ TEST_F(ToolPanel, newControllerHasNothingButTheDefaultTool)
     EXPECT_EQ(controller.popoverW(), nullptr);
     EXPECT_EQ(controller.visiblePopover(), std::nullopt);
     EXPECT_EQ(controller.button(QStringLiteral("text")), nullptr);
+    EXPECT_EQ(controller.buttonMapping(), std::nullopt);
+    EXPECT_EQ(controller.buttons(), std::nullopt);
+    EXPECT_EQ(controller.lastSelectedTool(), nullptr);
+    EXPECT_EQ(controller.lastSelectedButton(), nullptr);
+    EXPECT_EQ(controller.currentSelectedButton(), nullptr);
+}
+
+TEST_F(ToolPanel, buttonsAreKeptByNameAndSevenInTheirOrder)
+{
+    ASSERT_TRUE(bar.buttonMapping() && bar.buttons());
+    EXPECT_EQ(bar.buttonMapping()->size(), 8);
+    QStringList repainted;
+    for (const auto &each : *bar.buttons())
+        repainted.append(each->identifier());
+
+    EXPECT_EQ(repainted.join(QLatin1Char(' ')),
+        QStringLiteral("text brush eraser color clear redo undo"));
+}
+
+TEST_F(ToolPanel, pressLeavesTheButtonsOfBeforeAndAfter)
+{
+    EXPECT_EQ(bar.lastSelectedButton(), &button("brush"));
+    EXPECT_EQ(bar.currentSelectedButton(), &button("brush"));
+
+    press("eraser");
+
+    EXPECT_EQ(bar.lastSelectedButton(), &button("brush"));
+    EXPECT_EQ(bar.currentSelectedButton(), &button("eraser"));
+    EXPECT_EQ(bar.lastSelectedTool(), nullptr);
+}
+
+TEST_F(ToolPanel, whatIsAssignedIsKept)
+{
+    ToolPanelViewController controller;
+    controller.setSelectedButtonId(QStringLiteral("brush"));
+    controller.setVisiblePopover(PopoverChoice::brushpopover);
+    controller.setLastSelectedTool(&button("text"));
+    controller.setLastSelectedButton(&button("undo"));
+    controller.setCurrentSelectedButton(&button("redo"));
+    controller.setButtons(ToolPanelViewController::Buttons { &button("clear") });
+    controller.setButtonMapping(
+        ToolPanelViewController::ButtonMapping { { QStringLiteral("ruler"), &button("text") } });
+    controller.setToolSelectionDelegate(&drawViewController());
+
+    EXPECT_EQ(controller.selectedButtonId(), QStringLiteral("brush"));
+    EXPECT_EQ(controller.visiblePopover(), PopoverChoice::brushpopover);
+    EXPECT_EQ(controller.lastSelectedTool(), &button("text"));
+    EXPECT_EQ(controller.lastSelectedButton(), &button("undo"));
+    EXPECT_EQ(controller.currentSelectedButton(), &button("redo"));
+    EXPECT_EQ(controller.buttons()->front(), &button("clear"));
+    EXPECT_EQ(controller.button(QStringLiteral("ruler")), &button("text"));
+    EXPECT_EQ(controller.button(QStringLiteral("text")), nullptr);
+    EXPECT_EQ(controller.toolSelectionDelegate(), &drawViewController());
+}
+
+TEST_F(ToolPanel, assignedDelegateHearsOfThePressesAndItsCanvasSaysTheTool)
+{
+    class Other final : public QObject, public ToolSelectionDelegate, public DrawingCanvasDelegate
+    {
+    public:
+        explicit Other(DrawViewController &drawing)
+            : m_drawing(drawing)
+        { }
+        void handleToolSelection(const QString &selectedTool) override { heard += selectedTool; }
+        void handleToolOptionSelection(const QString &) override { }
+        void didBeginDrawing(platform::Point) override { }
+        void drawPathOnCanvas(platform::Point, platform::Point) override { }
+        void createTextBoxOnCanvas(platform::Point) override { }
+        void didClearCanvas() override { }
+        void updateDrawingCanvasElements() override { }
+        void updateDrawingCanvasViewForDisplay() override { }
+        [[nodiscard]] const std::shared_ptr<DrawingCanvasModel> &drawingCanvasModel() const override
+        {
+            return m_drawing.drawingCanvasModel();
+        }
+        [[nodiscard]] DrawingCanvasView *drawingView() const override
+        {
+            return m_drawing.drawingView();
+        }
+
+        QStringList heard;
+
+    private:
+        DrawViewController &m_drawing;
+    };
+    Other other(drawViewController());
+    canvas().setCurrentSelectedTool(QStringLiteral("eraser"));
+
+    bar.setToolSelectionDelegate(&other);
+    press("text");
+
+    EXPECT_EQ(other.heard, only("text"));
+    EXPECT_EQ(bar.lastSelectedButton(), &button("eraser"));
+    EXPECT_EQ(
+        canvas().currentSelectedTool(), QStringLiteral("eraser")); // it was told, and nobody else
+}
+
+TEST_F(ToolPanel, popoverWindowHasItsContentControllerFromTheStart)
+{
+    EXPECT_EQ(popover().contentViewController(), bar.popoverVc());
+    EXPECT_EQ(popover().contentView(), bar.popoverVc()->textPopoverView());
+    EXPECT_FALSE(isPopoverShown());
+
+    press("color");
+    EXPECT_EQ(popover().contentViewController(), bar.popoverVc());
+    EXPECT_EQ(popover().contentView(), bar.popoverVc()->colorPopoverView());
+
+    const QPointer<PopoverViewController> popovers = bar.popoverVc();
+    m_board.reset();
+    m_penwick.reset();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    EXPECT_EQ(popovers, nullptr);
 }
 
 TEST_F(ToolPanel, everyButtonIsFoundByItsIdentifier)
