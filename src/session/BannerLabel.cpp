@@ -22,6 +22,7 @@ BannerLabel::BannerLabel(QWidget *parent)
     , m_font(platform::ownFont(fontSize))
 {
     m_font.setWeight(QFont::DemiBold);
+    setFont(m_font);
 }
 
 void BannerLabel::setText(const QString &text)
