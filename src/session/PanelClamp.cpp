@@ -34,7 +34,9 @@ platform::Rect reachablePanel(
 {
     if (panel.height <= parent.height - titleBar - 2 * margin)
         return panel;
-    return platform::broughtInside(panel, workArea, platform::KeptEdge::Bottom);
+    platform::Rect reachable = panel;
+    reachable.y = platform::broughtInside(panel, workArea, platform::KeptEdge::Bottom).y;
+    return reachable;
 }
 
 } // namespace penwick

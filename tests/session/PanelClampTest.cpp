@@ -86,9 +86,9 @@ TEST_F(ReachablePanel, thatIsHigherThanItsParentHasRoomForComesUp)
     EXPECT_EQ(shown({ 200, -1, 60, 400 }, { 100, 100, 480, 270 }), (Rect { 200, 0, 60, 400 }));
 }
 
-TEST_F(ReachablePanel, comesDownAndSidewaysToo)
+TEST_F(ReachablePanel, comesDownAndStaysBesideItsParent)
 {
-    EXPECT_EQ(shown({ 1260, 500, 60, 400 }, { 900, 600, 480, 270 }), (Rect { 1220, 400, 60, 400 }));
+    EXPECT_EQ(shown({ 1260, 500, 60, 400 }, { 900, 600, 480, 270 }), (Rect { 1260, 400, 60, 400 }));
 }
 
 TEST_F(ReachablePanel, insideTheScreenStaysWhereItIs)
