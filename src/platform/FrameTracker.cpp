@@ -309,9 +309,11 @@ void FrameTracker::lookAgain()
 {
     if (--m_looksLeft <= 0) {
         m_patience.stop();
-        m_isPending = false;
+        if (std::exchange(m_isPending, false))
+            m_givenUp = m_frame;
     }
     check();
+    m_givenUp.reset();
 }
 
 // As many pixels are other points. A move comes before the size here, so that whatever keeps its
@@ -341,7 +343,7 @@ void FrameTracker::announce()
     if (hasResized)
         Q_EMIT resized();
     if (hasResized && isByUser)
-        Q_EMIT resizedByUser();
+        m_givenUp ? Q_EMIT resizedByDesktop(fromDesktop(*m_givenUp)) : Q_EMIT resizedByUser();
     else if (!delta.isNull() && isByUser)
         announceUserMove();
     if (!hasResized && !delta.isNull())

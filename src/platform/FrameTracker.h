@@ -55,6 +55,8 @@ Q_SIGNALS:
     void shifted(QPoint delta);
     /// The same, because the user pulled at its edges. Sent after resized().
     void resizedByUser();
+    /// The same, because the desktop has made another size of `asked`.
+    void resizedByDesktop(const penwick::platform::Rect &asked);
     /// The desktop has granted the frame that was asked for, or put a frame of its own around the
     /// window in the same place.
     void confirmed();
@@ -101,6 +103,7 @@ private:
     int m_looksLeft = 0;
     QTimer m_userMove { this }; // runs while a move by the user may go on
     bool m_isByUser = false;
+    std::optional<QRectF> m_givenUp; // what was asked for, in whose place something else stands
     bool m_isMended = false; // asked once more already
     std::optional<QRectF> m_askedBeforeFrame; // given up before the window manager had framed it
     bool m_isFrameLost = false; // the window manager has ended; m_margins are its frame's

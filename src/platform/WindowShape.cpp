@@ -23,6 +23,11 @@ double heightFor(double width, const Size &ratio)
     return width * ratio.height / ratio.width;
 }
 
+bool hasShape(const Size &size, const Size &ratio)
+{
+    return std::abs(heightFor(size.width, ratio) - size.height) <= tolerance;
+}
+
 } // namespace
 
 WindowShape::WindowShape(Window &window, FrameTracker &tracker)
@@ -34,7 +39,11 @@ WindowShape::WindowShape(Window &window, FrameTracker &tracker)
     m_rest.setInterval(restTime);
     connect(&m_rest, &QTimer::timeout, this, &WindowShape::rest);
     connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
-    connect(&tracker, &FrameTracker::resizedByUser, this, [this] { m_rest.start(); });
+    connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
+    connect(&tracker, &FrameTracker::resizedByDesktop, this, [this](const Rect &asked) {
+        if (isKept() && hasShape(asked.size(), *m_window.attributes().aspectRatio))
+            await(false);
+    });
     connect(&tracker, &FrameTracker::settled, this, &WindowShape::rememberFrame);
 }
 
@@ -73,6 +82,12 @@ void WindowShape::rememberFrame()
         m_before = m_tracker.frame();
 }
 
+void WindowShape::await(bool isPulled)
+{
+    m_isPulled = isPulled;
+    m_rest.start();
+}
+
 // A window that changed under the hand would be pulled from another size than its user sees.
 void WindowShape::rest()
 {
@@ -89,12 +104,14 @@ void WindowShape::correct()
         return;
     const Rect pulled = m_window.frame();
     const Size ratio = *m_window.attributes().aspectRatio;
-    const bool hasShape = std::abs(heightFor(pulled.width, ratio) - pulled.height) <= tolerance;
-    if (hasShape || m_before == Rect() || m_before.size() == pulled.size())
+    const bool isChanged = m_before != Rect() && m_before.size() != pulled.size();
+    if (hasShape(pulled.size(), ratio) || (m_isPulled && !isChanged))
         return;
     // The hint is that of another content, and some desktops hold what is asked for against it.
     NativeDesktop::instance().keepContentRatio(*m_window.windowHandle(), QSize());
-    m_window.setFrame(shapedAfterPull(m_before, pulled, ratio));
+    const double height = heightFor(pulled.width, ratio);
+    m_window.setFrame(m_isPulled ? shapedAfterPull(m_before, pulled, ratio)
+                                 : Rect { pulled.x, pulled.maxY() - height, pulled.width, height });
     m_isAnswering = true;
 }
 

@@ -27,6 +27,7 @@ public:
     void update();
 
 private:
+    void await(bool isPulled);
     void rest();
     void correct();
     void rememberFrame();
@@ -36,6 +37,7 @@ private:
     Window &m_window;
     FrameTracker &m_tracker;
     Rect m_before; // the frame that the user began to pull; empty before the first one
+    bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
     bool m_isAnswering = false; // the desktop, to the frame that a pull was corrected to
     QTimer m_rest { this }; // runs while the user may still be pulling
 };

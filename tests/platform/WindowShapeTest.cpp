@@ -43,12 +43,25 @@ protected:
         ASSERT_TRUE(QTest::qWaitFor([&] { return m_window.frame() == frame; }));
     }
 
+    /// Asks for `frame` of a desktop that gives no window less than 420 points of height.
+    void askForLow(const Rect &frame)
+    {
+        m_window.setMinimumSize(0, 420);
+        m_window.setFrame(frame);
+        ASSERT_TRUE(QTest::qWaitFor([&] { return m_window.frame().height >= 420; }));
+        m_window.setMinimumSize(0, 0);
+    }
+
+    [[nodiscard]] QTimer *restTimer() const
+    {
+        const auto *const shape = m_window.findChild<WindowShape *>();
+        return shape ? shape->findChild<QTimer *>() : nullptr;
+    }
+
     /// Lets the time come after which the user has stopped pulling.
     void rest()
     {
-        auto *const shape = m_window.findChild<WindowShape *>();
-        ASSERT_NE(shape, nullptr);
-        auto *const timer = shape->findChild<QTimer *>();
+        QTimer *const timer = restTimer();
         ASSERT_NE(timer, nullptr);
         ASSERT_TRUE(timer->isActive());
         QTimerEvent event(timer->timerId());
@@ -146,6 +159,26 @@ TEST_F(WindowShapeTest, movedWhileItIsPulledCountsFromWhereItWas)
     rest();
 
     EXPECT_EQ(m_window.frame(), (Rect { 120, 210, 800, 450 }));
+}
+
+TEST_F(WindowShapeTest, thatTheDesktopMadeHigherIsAskedBackAndNotMadeWider)
+{
+    showAt({ 300, 200, 800, 450 });
+    askForLow({ 300, 290, 640, 360 });
+
+    rest();
+
+    EXPECT_EQ(m_window.frame(), (Rect { 300, 290, 640, 360 }));
+}
+
+TEST_F(WindowShapeTest, ofAnotherShapeThatTheDesktopMadeHigherIsLeftAlone)
+{
+    showAt({ 300, 200, 800, 450 });
+
+    askForLow({ 300, 290, 640, 400 });
+
+    ASSERT_NE(restTimer(), nullptr);
+    EXPECT_FALSE(restTimer()->isActive());
 }
 
 TEST_F(WindowShapeTest, thatTheUserCannotResizeIsLeftAlone)
