@@ -14,6 +14,7 @@
 
 #include <penwick/platform/Window.h>
 
+#include <QPainterPath>
 #include <QScrollBar>
 #include <QTextDocument>
 
@@ -133,6 +134,8 @@ void TnTextBox::drawPlaceholder()
         m_placeholderAttributedString.string);
 }
 
+// A painter's own dashes leave out sides beyond the clip and lose count there, so that they would
+// move as parts of the box are painted again. The stroker knows of no clip.
 void TnTextBox::drawBorder(const Rect &rect)
 {
     if (rect.height < bounds().height)
@@ -140,9 +143,10 @@ void TnTextBox::drawBorder(const Rect &rect)
     QPen pen(TnhColors::textBoxEditBorderColor, dashedBorderWidth, Qt::SolidLine, Qt::FlatCap,
         Qt::MiterJoin);
     pen.setDashPattern({ dash / dashedBorderWidth, gap / dashedBorderWidth });
+    QPainterPath edge;
+    edge.addRect(QRectF(rect.x + 2, rect.y + 2, rect.width - 3, rect.height - 3));
     Painter painter(*this);
-    painter.setPen(pen);
-    painter.drawRect(QRectF(rect.x + 2, rect.y + 2, rect.width - 3, rect.height - 3));
+    painter.fillPath(QPainterPathStroker(pen).createStroke(edge), pen.color());
 }
 
 void TnTextBox::showPlacedBorder()

@@ -46,6 +46,15 @@ protected:
         return picture.copy(picture.rect().adjusted(4, 4, -4, -4));
     }
 
+    /// `part` of the box on white, painted alone.
+    static QImage painted(TnTextBox &box, const QRect &part)
+    {
+        QImage picture(part.size(), QImage::Format_RGB32);
+        picture.fill(Qt::white);
+        box.render(&picture, {}, part, QWidget::DrawChildren);
+        return picture;
+    }
+
 private:
     static bool isNear(QRgb one, QRgb other)
     {
@@ -85,6 +94,18 @@ TEST_F(TnTextBoxPictureTest, borderStaysWholeWhileTyping)
     settle();
 
     EXPECT_EQ(row(pictureOf(*box), 1, editBorder), dashes(2, 197, 200));
+}
+
+// The dashes go on around the corners, also where another box lies over one of them.
+TEST_F(TnTextBoxPictureTest, dashesStandWhereTheyAreWhateverPartIsPainted)
+{
+    const auto box = newBox();
+    const QImage whole = painted(*box, box->QWidget::rect());
+    ASSERT_EQ(row(whole, 1, editBorder), dashes(2, 197, 200));
+
+    for (const QRect &part : { QRect(0, 0, 164, 18), QRect(0, 0, 4, 30), QRect(0, 15, 90, 15),
+             QRect(150, 26, 50, 4), QRect(190, 10, 10, 9) })
+        EXPECT_TRUE(painted(*box, part) == whole.copy(part)) << part.x() << ", " << part.y();
 }
 
 TEST_F(TnTextBoxPictureTest, placedBoxHasASolidBorderThreeWideInsideItsBounds)
