@@ -5,6 +5,7 @@
 #include "textbox/TextComposition.h"
 #include "textbox/TextEditing.h"
 
+#include <QAbstractTextDocumentLayout>
 #include <QMimeData>
 #include <QScrollBar>
 #include <QTextDocument>
@@ -81,13 +82,40 @@ bool TextEditor::isEmpty() const
     return document()->isEmpty();
 }
 
+// Not by the editor itself: between whole scales it paints its own caret, however thin it is told
+// to be.
 void TextEditor::draw(const platform::Rect &dirtyRect)
 {
-    ViewOf::draw(dirtyRect);
-    if (hasFocus()) {
-        QPainter painter(viewport());
+    QPainter painter(viewport());
+    painter.save();
+    paintText(painter, toSurface(dirtyRect), selections());
+    painter.restore();
+    if (hasFocus())
         m_caret.paint(painter);
-    }
+}
+
+QList<TextEditor::Selection> TextEditor::selections() const
+{
+    if (!textCursor().hasSelection())
+        return {};
+    const auto group = hasFocus() ? QPalette::Active : QPalette::Inactive;
+    QTextCharFormat format;
+    format.setBackground(palette().brush(group, QPalette::Highlight));
+    format.setForeground(palette().brush(group, QPalette::HighlightedText));
+    return { { textCursor(), format } };
+}
+
+void TextEditor::paintText(
+    QPainter &painter, const QRectF &part, const QList<Selection> &selections) const
+{
+    const QPointF scrolled(horizontalScrollBar()->value(), verticalScrollBar()->value());
+    QAbstractTextDocumentLayout::PaintContext context;
+    context.palette = palette();
+    context.clip = part.translated(scrolled);
+    context.selections = selections;
+    painter.translate(-scrolled);
+    painter.setClipRect(context.clip, Qt::IntersectClip);
+    document()->documentLayout()->draw(&painter, context);
 }
 
 // The pointer

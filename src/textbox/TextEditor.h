@@ -9,6 +9,7 @@
 #include "textbox/TextCaret.h"
 #include "textbox/TextRoom.h"
 
+#include <QAbstractTextDocumentLayout>
 #include <QTextEdit>
 
 #include <optional>
@@ -49,6 +50,12 @@ Q_SIGNALS:
     void refused(int count);
 
 protected:
+    using Selection = QAbstractTextDocumentLayout::Selection;
+
+    /// Paints the text that lies in `part`, with `selections` and without a caret. Both `part` and
+    /// `painter`, which is left displaced, count from the top left corner.
+    void paintText(QPainter &painter, const QRectF &part, const QList<Selection> &selections) const;
+
     void mousePressEvent(QMouseEvent *event) override;
     void mouseMoveEvent(QMouseEvent *event) override;
     void mouseReleaseEvent(QMouseEvent *event) override;
@@ -60,6 +67,7 @@ protected:
     void insertFromMimeData(const QMimeData *source) override;
 
 private:
+    [[nodiscard]] QList<Selection> selections() const;
     [[nodiscard]] TextRoom room() const;
     [[nodiscard]] bool refuses(const QKeyEvent &press);
 

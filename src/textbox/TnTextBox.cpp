@@ -121,6 +121,11 @@ void TnTextBox::draw(const Rect &dirtyRect)
     showDeleteTextButton();
 }
 
+void TnTextBox::drawContent(QPainter &painter)
+{
+    paintText(painter, viewport()->rect(), {}); // what is selected is no part of the drawing
+}
+
 void TnTextBox::drawPlaceholder()
 {
     if (!isEmpty() || !compositionIn(*this).isEmpty())

@@ -223,6 +223,41 @@ TEST_F(TnTextBoxPictureTest, caretIsInTheTextsColourAndOnlyWhileEditing)
     EXPECT_EQ(pictureOf(*box).pixelColor(end), QColor(Qt::white));
 }
 
+// The editor's own, which inverts what is below it, is as wide as nothing; yet between whole scales
+// the toolkit paints it as a hairline.
+TEST_F(TnTextBoxPictureTest, noOtherCaretIsPaintedAtAnyScale)
+{
+    canvas->setBrushColor(TnhColors::redColor);
+    const auto box = newBox();
+    for (const double scale : { 1.0, 1.25, 1.5, 1.75, 2.0 }) {
+        QImage picture((QSizeF(box->QWidget::size()) * scale).toSize(), QImage::Format_RGB32);
+        picture.setDevicePixelRatio(scale);
+        picture.fill(Qt::white);
+
+        box->render(&picture, {}, {}, QWidget::DrawChildren);
+
+        EXPECT_GT(darkest(picture), 40) << scale; // the red caret and the blue border
+    }
+}
+
+TEST_F(TnTextBoxPictureTest, selectedTextIsWhiteOnTheSelectionsColour)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("HHHHHH"));
+    settle();
+    const QRect text(box->cursorRect().topLeft() - QPoint(40, -2), QSize(36, 16));
+    ASSERT_EQ(row(pictureOf(*box).copy(text), 1, qRgb(255, 255, 255)).find("####"), 0U);
+
+    box->selectAll();
+    settle();
+
+    const QImage selected = pictureOf(*box).copy(text);
+    const QRgb ground = box->palette().color(QPalette::Active, QPalette::Highlight).rgb();
+    EXPECT_NE(row(selected, 8, ground).find('#'), std::string::npos);
+    EXPECT_NE(row(selected, 8, qRgb(255, 255, 255)).find('#'), std::string::npos);
+    EXPECT_EQ(row(selected, 8, qRgb(textGrey, textGrey, textGrey)).find('#'), std::string::npos);
+}
+
 TEST_F(TnTextBoxPictureTest, caretIsPaintedOnlyWhereTheKeysGo)
 {
     canvas->setBrushColor(TnhColors::redColor);
