@@ -10,6 +10,13 @@ namespace {
 
 constexpr double titleInset = 2.0; // points, from the left and right edges
 
+bool isPress(const QEvent &event)
+{
+    const bool isDown = event.type() == QEvent::MouseButtonPress
+        || event.type() == QEvent::MouseButtonDblClick || event.type() == QEvent::TabletPress;
+    return isDown && static_cast<const QSinglePointEvent &>(event).button() == Qt::LeftButton;
+}
+
 } // namespace
 
 Button::Button(QWidget *parent)
@@ -91,6 +98,14 @@ FittedText Button::fittedTitle() const
 {
     return fittedText(
         m_attributedTitle.string, m_attributedTitle.font, frame().width - 2 * titleInset);
+}
+
+// The toolkit lets a disabled button swallow presses before any of its operations hears of them.
+bool Button::event(QEvent *event)
+{
+    if (!isEnabled() && isPress(*event))
+        pressIsComing();
+    return ViewOf::event(event);
 }
 
 bool Button::hitButton(const QPoint &position) const

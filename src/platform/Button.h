@@ -70,6 +70,8 @@ public:
     [[nodiscard]] QSize sizeHint() const override;
 
 protected:
+    /// A disabled button takes presses without doing anything, but is pressed all the same.
+    bool event(QEvent *event) override;
     /// The whole of it, whatever the style thinks a button's middle is.
     [[nodiscard]] bool hitButton(const QPoint &position) const override;
 

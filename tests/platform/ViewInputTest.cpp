@@ -2,6 +2,7 @@
 // What is told of presses and keys before the view itself hears of them.
 #include "platform/ViewInput.h"
 
+#include "platform/Button.h"
 #include "platform/PlainView.h"
 
 #include <QTest>
@@ -25,6 +26,25 @@ TEST(ViewInput, pressIsToldOnceAndOfTheLeftButtonAlone)
     QTest::mousePress(&view, Qt::LeftButton);
     QTest::mouseRelease(&view, Qt::LeftButton);
     EXPECT_EQ(pressed, std::vector<const View *> { &view });
+}
+
+TEST(ViewInput, pressOnADisabledButtonIsToldOnceAndOfItAlone)
+{
+    PlainView around;
+    Button button(&around);
+    button.setEnabled(false);
+    button.setAction([](Button &) { FAIL() << "a disabled button does nothing"; });
+    std::vector<const View *> pressed;
+    QObject context;
+    QObject::connect(&ViewInput::shared(), &ViewInput::pressed, &context,
+        [&](View &told) { pressed.push_back(&told); });
+
+    QTest::mouseClick(&button, Qt::RightButton);
+    EXPECT_EQ(pressed, std::vector<const View *> {});
+    QTest::mouseClick(&button, Qt::LeftButton);
+    EXPECT_EQ(pressed, std::vector<const View *> { &button });
+    QTest::mouseDClick(&button, Qt::LeftButton); // only the second press of one
+    EXPECT_EQ(pressed, (std::vector<const View *> { &button, &button }));
 }
 
 TEST(ViewInput, keyIsToldAndStillReachesTheView)

@@ -32,12 +32,6 @@ public:
     void click(const std::string &tool); ///< its button, by whatever means
     /// The left button goes down on the tool bar or a popover.
     void pressBar() { m_doLettersRest = false; }
-    /// The same on one of its buttons; one that is disabled hears of nothing.
-    void pressTool(const std::string &tool)
-    {
-        if (m_isEnabled.at(tool))
-            pressBar();
-    }
     void choose(const std::string &option); ///< its button: kind#value
     void pressPanel(); ///< its background
     /// By X-like names: letters, Return, BackSpace, 1 to 9, and C-z, C-y, C-Delete, C-w.

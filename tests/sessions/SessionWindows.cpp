@@ -26,9 +26,9 @@ void Session::clickTool(const Step &step)
         return;
     const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
     say("tool " + name + (byPointer ? " by pointer" : ""));
-    if (byPointer)
-        m_plain->pressTool(name); // before: it may be its last
     m_real.clickTool(name, byPointer);
+    if (byPointer)
+        m_plain->pressBar();
     m_plain->click(name);
 }
 
@@ -92,7 +92,7 @@ void Session::takeWindowStep(const Step &step)
     } else if (!m_real.held() && step.kind == Kind::ToolMissed) {
         say("press a tool and let go beside it");
         m_real.pressToolElsewhere(toolNames()[static_cast<std::size_t>(step.a) % 8]);
-        m_plain->pressTool(toolNames()[static_cast<std::size_t>(step.a) % 8]);
+        m_plain->pressBar();
     }
 }
 
