@@ -8,9 +8,15 @@ namespace penwick::sessions {
 
 namespace {
 
-constexpr double screenWidth = 720; // points
-constexpr double screenHeight = 540;
+constexpr double screenHeight = 540; // points
 constexpr double border = 2.5; // points, that a desktop draws, and rounding
+
+// Windows stand on whole pixels, counted from the top left corner of the screen.
+bool haveSameCorner(const PlainFrame &one, const PlainFrame &other)
+{
+    return std::round(one.x) == std::round(other.x)
+        && std::round(screenHeight - one.top()) == std::round(screenHeight - other.top());
+}
 
 } // namespace
 
@@ -18,6 +24,12 @@ void PlainFrames::shiftPanel(double x, double y)
 {
     panel.x += x;
     panel.y += y;
+}
+
+bool PlainFrames::isAt(const PlainFrame &frame) const
+{
+    return haveSameCorner(frame, board) && std::round(board.width) == frame.width
+        && std::round(board.height) == frame.height;
 }
 
 void PlainFrames::moveTo(const PlainFrame &frame)
@@ -42,9 +54,8 @@ void PlainFrames::restAt(const PlainFrame &frame)
 {
     PlainFrame kept = reshaped();
     const bool isReshaped = kept.width != board.width || kept.height != board.height;
-    // Windows stand on whole pixels; where they were asked to is what counts.
-    const bool isGranted = frame.x == std::round(kept.x)
-        && screenHeight - frame.top() == std::round(screenHeight - kept.top());
+    // Where they were asked to is what counts.
+    const bool isGranted = haveSameCorner(frame, kept);
     // A desktop may be out by the width of the border that it draws.
     if (!isGranted && std::abs(frame.x - kept.x) < border && std::abs(frame.y - kept.y) < border) {
         kept = { frame.x, frame.y, std::round(kept.width), std::round(kept.height) };
@@ -92,7 +103,6 @@ void PlainFrames::bringPanelUp()
 {
     if (panel.height <= board.height - 28)
         return;
-    panel.x = std::clamp(panel.x, 0.0, screenWidth - panel.width);
     panel.y = std::clamp(panel.y, 0.0, screenHeight - panel.height);
 }
 

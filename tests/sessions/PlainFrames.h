@@ -25,6 +25,8 @@ public:
     PlainFrame board;
     PlainFrame panel;
 
+    /// Whether a board whose window is at `frame`, in whole pixels, is where it is known to be.
+    [[nodiscard]] bool isAt(const PlainFrame &frame) const;
     void moveTo(const PlainFrame &frame); ///< of the same size; the panel goes along
     void resizeTo(const PlainFrame &frame);
     /// The desktop has granted `frame` for what was asked: 16:9 after its edges were pulled, so

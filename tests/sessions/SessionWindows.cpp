@@ -149,8 +149,7 @@ void Session::rest()
 void Session::hearPlace()
 {
     const PlainFrame place = plainFrame(m_real.outerFrame());
-    const PlainFrame &known = m_plain->frames().board;
-    if (place.x != known.x || place.y != known.y)
+    if (!m_plain->frames().isAt(place))
         m_plain->moveTo(place);
 }
 
@@ -165,8 +164,7 @@ void Session::hideOrShow()
         m_plain->show();
         // One over an image is brought inside the screen, and its popover closed.
         const PlainFrame place = plainFrame(m_real.outerFrame());
-        const PlainFrame &known = m_plain->frames().board;
-        if (place.x != known.x || place.y != known.y)
+        if (!m_plain->frames().isAt(place))
             m_plain->comeUpAt(place);
     } else {
         m_real.hide();
