@@ -5,9 +5,13 @@
 #include <penwick/platform/Window.h>
 #include <penwick/platform/WindowController.h>
 
-#include <QGuiApplication>
+#include <QApplication>
 
 #include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <memory>
+#include <optional>
 
 namespace penwick {
 
@@ -36,6 +40,24 @@ void makeUnder(const Construction &construction)
     construction.make();
 }
 
+/// As a host does that keeps the entry object in static storage.
+void outliveApplication()
+{
+    const auto penwick = std::make_unique<std::optional<Penwick>>();
+    {
+        int count = 1;
+        char name[] = "host";
+        char *arguments[] = { name, nullptr };
+        const QApplication application(count, arguments);
+        penwick->emplace();
+        const auto controller = (*penwick)->createDrawingWindowController(
+            WindowType::whiteboard, QGuiApplication::primaryScreen());
+        controller->showWindow(nullptr);
+    }
+    penwick->reset();
+    std::exit(0);
+}
+
 class WithoutApplicationDeathTest : public testing::TestWithParam<Construction>
 { };
 
@@ -53,6 +75,11 @@ TEST_P(WithoutApplicationDeathTest, oneWithoutWidgetsStopsTheProcess)
 
     EXPECT_DEATH(makeUnder<QGuiApplication>(GetParam()), line);
     EXPECT_DEATH(makeUnder<QCoreApplication>(GetParam()), line);
+}
+
+TEST(OutlivedApplicationDeathTest, sessionThatIsLeftEndsInPeace)
+{
+    EXPECT_EXIT(outliveApplication(), testing::ExitedWithCode(0), "");
 }
 
 INSTANTIATE_TEST_SUITE_P(Constructions, WithoutApplicationDeathTest,

@@ -25,6 +25,8 @@ bool isThreadOf(const QCoreApplication &application)
 void requireGuiThread()
 {
     const QCoreApplication *const application = QCoreApplication::instance();
+    if (!application && QCoreApplication::closingDown())
+        return; // what a host still holds is let go of now, by way of these very operations
     if (!application)
         fatalError(noApplication);
     if (!isThreadOf(*application))

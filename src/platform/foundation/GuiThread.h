@@ -5,7 +5,8 @@
 namespace penwick::platform {
 
 /// A fatal error unless this is the thread of the application object. Each public operation of the
-/// entry object, of the controllers and of the windows asks first; it costs one comparison.
+/// entry object, of the controllers and of the windows asks first; it costs one comparison. Content
+/// once the application object has been and is gone: objects of ours may outlive it and end then.
 void requireGuiThread();
 
 /// The same, and a fatal error too unless the application object is one that has widgets. What
