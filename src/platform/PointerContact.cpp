@@ -31,7 +31,9 @@ bool PointerContact::excludes(const QPointerEvent &press) const
 
 bool PointerContact::isBeliedBy(const QPointerEvent &hover) const
 {
-    return m_isOn && m_way != Way::Mouse && penEndOf(hover) != PenEnd::None;
+    if (m_way == Way::Mouse)
+        return m_isOn && wayOf(hover) == Way::Mouse;
+    return m_isOn && penEndOf(hover) != PenEnd::None;
 }
 
 void PointerContact::begin(const QPointerEvent &press, Point location, int clickCount)

@@ -90,6 +90,13 @@ TEST_F(PointerContactTest, penThatHoversWasLetGoAndAMouseThatDoesWasNot)
     EXPECT_FALSE(m_contact.isBeliedBy(mouse(QEvent::MouseMove, m_tip)));
 }
 
+TEST_F(PointerContactTest, mouseThatHoversWasLetGoWhereItsReleaseWasLost)
+{
+    m_contact.begin(mouse(QEvent::MouseButtonPress, m_mouse), {}, 1);
+
+    EXPECT_TRUE(m_contact.isBeliedBy(mouse(QEvent::MouseMove, m_mouse)));
+}
+
 TEST_F(PointerContactTest, pressIsADragOnceItHasBeenFarEnoughAway)
 {
     m_contact.begin(mouse(QEvent::MouseButtonPress, m_mouse), { 10, 10 }, 2);
