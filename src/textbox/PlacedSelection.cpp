@@ -38,8 +38,10 @@ void PlacedSelection::listenIfNeeded()
 
 bool PlacedSelection::eventFilter(QObject *watched, QEvent *event)
 {
-    const bool isPress = event->type() == QEvent::MouseButtonPress && watched->isWidgetType();
-    if (!isPress || belongsTo(m_editor, watched))
+    // A pen's press is told to a window before it is to a widget.
+    const bool isPress
+        = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::TabletPress;
+    if (!isPress || !watched->isWidgetType() || belongsTo(m_editor, watched))
         return false;
     QScrollBar &scroll = *m_editor.verticalScrollBar();
     const int seen = scroll.value();

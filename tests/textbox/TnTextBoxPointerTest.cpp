@@ -285,6 +285,19 @@ TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxIsGoneOnceAnotherWindowIsPress
     EXPECT_FALSE(box->textCursor().hasSelection());
 }
 
+TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxIsGoneOnceAPenPressesElsewhere)
+{
+    const auto box = placedBox();
+    box->selectAll();
+    QTabletEvent press(QEvent::TabletPress, QPointingDevice::primaryPointingDevice(),
+        QPointF(250, 10), QPointF(250, 10), 1.0, 0, 0, 0.0, 0.0, 0.0, Qt::NoModifier,
+        Qt::LeftButton, Qt::LeftButton);
+
+    QCoreApplication::sendEvent(&canvas->widget(), &press);
+
+    EXPECT_FALSE(box->textCursor().hasSelection());
+}
+
 TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxStaysForItsOwnMenu)
 {
     const auto box = placedBox();
