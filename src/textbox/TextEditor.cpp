@@ -16,6 +16,24 @@
 
 namespace penwick {
 
+namespace {
+
+// The text that gives way to what is committed, as `at` stands now, selected.
+QTextCursor replacedBy(const QInputMethodEvent &event, const QTextCursor &at)
+{
+    if (event.replacementLength() == 0)
+        return at;
+    QTextCursor replaced = at;
+    const int last = replaced.document()->characterCount() - 1;
+    const int start = std::clamp(at.selectionStart() + event.replacementStart(), 0, last);
+    replaced.setPosition(start);
+    replaced.setPosition(
+        std::clamp(start + event.replacementLength(), start, last), QTextCursor::KeepAnchor);
+    return replaced;
+}
+
+} // namespace
+
 TextEditor::TextEditor(QTextDocument *text, QWidget *parent)
     : ViewOf(parent)
     , m_caret(*this)
@@ -206,13 +224,21 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
 
 void TextEditor::inputMethodEvent(QInputMethodEvent *event)
 {
-    TextRoom room = roomAt(textCursor());
-    const QString commit = fittingPart(event->commitString(), room);
+    TextRoom room = roomAt(replacedBy(*event, textCursor()));
+    QString commit = fittingPart(event->commitString(), room);
+    // What stands there goes only if all that takes its place comes.
+    const bool isKept
+        = event->replacementLength() > 0 && commit.size() < event->commitString().size();
+    if (isKept) {
+        commit.clear();
+        room = roomAt(textCursor());
+    }
     room.characters -= static_cast<int>(commit.size());
     const QString half = fittingPart(event->preeditString(), room);
     QInputMethodEvent fitting(
         half, attributesWithin(event->attributes(), static_cast<int>(half.size())));
-    fitting.setCommitString(commit, event->replacementStart(), event->replacementLength());
+    if (!isKept)
+        fitting.setCommitString(commit, event->replacementStart(), event->replacementLength());
     ViewOf::inputMethodEvent(&fitting);
     event->setAccepted(fitting.isAccepted());
     Q_EMIT writingChanged();

@@ -41,6 +41,14 @@ protected:
         QCoreApplication::sendEvent(&box, &event);
     }
 
+    /// As an input method does with the `length` characters before the caret.
+    static void correct(TnTextBox &box, int length, const QString &text)
+    {
+        QInputMethodEvent event;
+        event.setCommitString(text, -length, length);
+        QCoreApplication::sendEvent(&box, &event);
+    }
+
     const QString m_one = QStringLiteral("One character did not fit into this text box.");
 };
 
@@ -158,6 +166,30 @@ TEST_F(TnTextBoxLimitTest, commitGoesInAsFarAsItFits)
     EXPECT_EQ(lengthOf(*box), mostCharacters);
     EXPECT_EQ(compositionIn(*box), QString());
     expectSaid(*box, QStringLiteral("2 characters did not fit into this text box."));
+}
+
+TEST_F(TnTextBoxLimitTest, correctionInAFullBoxTakesThePlaceOfTheWord)
+{
+    const auto box = almostFull(5);
+    compose(*box, {}, QStringLiteral("their"));
+
+    correct(*box, 5, QStringLiteral("there"));
+
+    EXPECT_EQ(box->toPlainText().right(6), QStringLiteral("mthere"));
+    EXPECT_EQ(lengthOf(*box), mostCharacters);
+    EXPECT_EQ(said(), QString());
+}
+
+TEST_F(TnTextBoxLimitTest, correctionThatDoesNotFitLeavesTheWord)
+{
+    const auto box = almostFull(5);
+    compose(*box, {}, QStringLiteral("their"));
+
+    correct(*box, 5, QStringLiteral("theirs"));
+
+    EXPECT_EQ(box->toPlainText().right(6), QStringLiteral("mtheir"));
+    EXPECT_EQ(lengthOf(*box), mostCharacters);
+    expectSaid(*box, QStringLiteral("6 characters did not fit into this text box."));
 }
 
 TEST_F(TnTextBoxLimitTest, compositionKeepsItsPlace)
