@@ -56,6 +56,18 @@ QList<QInputMethodEvent::Attribute> attributesWithin(
     return attributes;
 }
 
+void dropCompositionBesideCaret(QTextEdit &editor)
+{
+    const QTextBlock line = editor.textCursor().block();
+    for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next()) {
+        if (block == line || block.layout()->preeditAreaText().isEmpty())
+            continue;
+        block.layout()->setPreeditArea(-1, {});
+        block.layout()->clearFormats();
+        editor.document()->markContentsDirty(block.position(), block.length());
+    }
+}
+
 void commitCompositionIn(QTextEdit &editor)
 {
     if (!compositionIn(editor).isEmpty()) {

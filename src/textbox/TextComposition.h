@@ -17,6 +17,10 @@ namespace penwick {
 [[nodiscard]] QList<QInputMethodEvent::Attribute> attributesWithin(
     QList<QInputMethodEvent::Attribute> attributes, int length);
 
+/// Takes out what is half composed in another line than the insertion point's. An input method says
+/// all of its composition each time, and the editor puts it where the insertion point is then.
+void dropCompositionBesideCaret(QTextEdit &editor);
+
 /// Makes the composition part of the text. An editor that became read-only would drop it.
 void commitCompositionIn(QTextEdit &editor);
 

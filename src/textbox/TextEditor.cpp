@@ -224,6 +224,7 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
 
 void TextEditor::inputMethodEvent(QInputMethodEvent *event)
 {
+    dropCompositionBesideCaret(*this);
     TextRoom room = roomAt(replacedBy(*event, textCursor()));
     QString commit = fittingPart(event->commitString(), room);
     // What stands there goes only if all that takes its place comes.

@@ -126,6 +126,32 @@ TEST_F(TextCompositionTest, inALineThatTheCaretHasLeftIsPartOfTheTextOnceTheBoxI
     EXPECT_EQ(compositionIn(*box), QString());
 }
 
+TEST_F(TextCompositionTest, goesOnInTheLineToWhichTheCaretHasGone)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+    box->insertPlainText(QStringLiteral("on\ntwo")); // as when it is dropped
+
+    compose(*box, QStringLiteral("ka"));
+    EXPECT_EQ(compositionIn(*box), QStringLiteral("ka"));
+
+    commit(*box, QString());
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("on\ntwo"));
+}
+
+TEST_F(TextCompositionTest, givenUpAfterTheCaretWentToAnotherLineIsGone)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+    box->insertPlainText(QStringLiteral("on\ntwo"));
+
+    commit(*box, QString());
+
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("on\ntwo"));
+}
+
 TEST_F(TextCompositionTest, makesTheBoxGrow)
 {
     const auto box = newBox();
