@@ -208,7 +208,7 @@ void PlainBoard::moveTo(const PlainFrame &frame)
 void PlainBoard::comeUpAt(const PlainFrame &frame)
 {
     orderPopoverOut();
-    m_frames.moveTo(frame);
+    m_frames.comeUpAt(frame);
 }
 
 void PlainBoard::rest(const PlainFrame &frame)

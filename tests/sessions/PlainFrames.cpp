@@ -8,7 +8,8 @@ namespace penwick::sessions {
 
 namespace {
 
-constexpr double screenHeight = 540; // points
+constexpr double screenWidth = 720; // points
+constexpr double screenHeight = 540;
 constexpr double border = 2.5; // points, that a desktop draws, and rounding
 
 // Windows stand on whole pixels, counted from the top left corner of the screen.
@@ -38,6 +39,24 @@ void PlainFrames::moveTo(const PlainFrame &frame)
     shiftPanel(std::round(frame.x) - std::round(board.x),
         std::round(screenHeight - board.top()) - std::round(screenHeight - frame.top()));
     board = frame;
+    bringPanelUp();
+}
+
+void PlainFrames::comeUpAt(const PlainFrame &frame)
+{
+    const double scale = std::min({ 1.0, screenWidth / board.width, screenHeight / board.height });
+    PlainFrame inside { board.x, board.y, board.width * scale, board.height * scale };
+    inside.x = std::clamp(board.x, 0.0, screenWidth - inside.width);
+    inside.y = std::clamp(board.y, 0.0, screenHeight - inside.height);
+    if (!haveSameCorner(frame, inside))
+        return moveTo(frame);
+    if (scale == 1.0) {
+        shiftPanel(inside.x - board.x, inside.y - board.y);
+    } else { // placed as if it were new
+        panel.x = inside.x + 20;
+        panel.y = inside.y + (inside.height - panel.height) / 2;
+    }
+    board = inside;
     bringPanelUp();
 }
 

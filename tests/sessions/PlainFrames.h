@@ -28,6 +28,9 @@ public:
     /// Whether a board whose window is at `frame`, in whole pixels, is where it is known to be.
     [[nodiscard]] bool isAt(const PlainFrame &frame) const;
     void moveTo(const PlainFrame &frame); ///< of the same size; the panel goes along
+    /// A board that is shown is brought inside the screen in its own shape, on parts of a pixel if
+    /// need be; its window is at `frame` then.
+    void comeUpAt(const PlainFrame &frame);
     void resizeTo(const PlainFrame &frame);
     /// The desktop has granted `frame` for what was asked: 16:9 after its edges were pulled, so
     /// that no pull outward makes it smaller.
