@@ -16,8 +16,8 @@ public:
     [[nodiscard]] bool keepsWindowsOutOfCaptures() const override
     {
         // The system's newer way of capturing heeds the sharing type no longer.
-        return QOperatingSystemVersion::current() < QOperatingSystemVersion(
-                   QOperatingSystemVersion::MacOS, 15);
+        return QOperatingSystemVersion::current()
+            < QOperatingSystemVersion(QOperatingSystemVersion::MacOS, 15);
     }
 
     void keepContentRatio(QWindow &window, const QSize &content) override
