@@ -28,8 +28,9 @@ protected:
         show(m_window);
         // Whatever is open between window and desktop is dealt with.
         bool isSettled = false;
+        QObject hears;
         QObject::connect(
-            &m_window, &Window::frameSettled, &m_window, [&isSettled] { isSettled = true; });
+            &m_window, &Window::frameSettled, &hears, [&isSettled] { isSettled = true; });
         ASSERT_TRUE(QTest::qWaitFor([&] { return isSettled; }));
     }
 
