@@ -20,6 +20,7 @@ namespace {
 // what stands there is taken for the answer. The desktop does not announce every step of its own.
 constexpr int looks = 6;
 constexpr int lookInterval = 50; // ms
+constexpr int looksBeforeAskingAgain = 3; // of those that are left
 
 // Steps of one move by the user follow each other faster than this.
 constexpr int longestRest = 500; // ms
@@ -144,6 +145,7 @@ void FrameTracker::onFrameExchanged(bool hasFrame)
 
 void FrameTracker::applyRequest()
 {
+    Q_EMIT asking();
     m_window.setGeometry(rounded(m_frame).marginsRemoved(m_margins));
 }
 
@@ -232,7 +234,9 @@ void FrameTracker::adoptScale()
         m_margins = m_margins * (before / scale);
     else if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint))
         m_margins = native.frameMargins();
+    // A toolkit that answers before the desktop has done so may grant what is not there yet.
     // Without more patience: what is asked for may itself bring the window to the screen and back.
+    m_isPending |= m_patience.isActive();
     if (m_isPending)
         applyRequest();
     else
@@ -311,9 +315,19 @@ void FrameTracker::lookAgain()
         m_patience.stop();
         if (std::exchange(m_isPending, false))
             m_givenUp = m_frame;
+    } else if (m_looksLeft == looksBeforeAskingAgain && isOverlooked()) {
+        applyRequest();
     }
     check();
     m_givenUp.reset();
+}
+
+// A window manager that is busy with a new window may answer an older request, or hold this one
+// against the limits of an older one. One that refuses does so twice.
+bool FrameTracker::isOverlooked() const
+{
+    return m_isPending && m_window.isVisible() && !m_isFrameLost && !isArranged()
+        && !isWhereItBelongs(outerGeometry());
 }
 
 // As many pixels are other points. A move comes before the size here, so that whatever keeps its

@@ -44,6 +44,8 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 Q_SIGNALS:
+    /// The desktop is about to be asked for frame(), with margins() around the content.
+    void asking();
     /// The window has another size than when this was last sent, or than when it was shown. Sent
     /// before moved() where both changed.
     void resized();
@@ -81,6 +83,7 @@ private:
     [[nodiscard]] bool isDecoratedAnew() const;
     void awaitAnswer();
     void lookAgain();
+    [[nodiscard]] bool isOverlooked() const;
     void announce();
     void announceRescaled(QPoint delta, bool hasResized);
     void announceUserMove();

@@ -38,6 +38,7 @@ WindowShape::WindowShape(Window &window, FrameTracker &tracker)
     m_rest.setSingleShot(true);
     m_rest.setInterval(restTime);
     connect(&m_rest, &QTimer::timeout, this, &WindowShape::rest);
+    connect(&tracker, &FrameTracker::asking, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
     connect(&tracker, &FrameTracker::resizedByDesktop, this, [this](const Rect &asked) {
@@ -53,6 +54,7 @@ bool WindowShape::isKept() const
     return attributes.aspectRatio && (attributes.styleMask & StyleMask::resizable);
 }
 
+// Some desktops hold what is asked for against a hint that is still that of another content.
 void WindowShape::update()
 {
     if (!m_window.windowHandle())
@@ -107,8 +109,6 @@ void WindowShape::correct()
     const bool isChanged = m_before != Rect() && m_before.size() != pulled.size();
     if (hasShape(pulled.size(), ratio) || (m_isPulled && !isChanged))
         return;
-    // The hint is that of another content, and some desktops hold what is asked for against it.
-    NativeDesktop::instance().keepContentRatio(*m_window.windowHandle(), QSize());
     const double height = heightFor(pulled.width, ratio);
     m_window.setFrame(m_isPulled ? shapedAfterPull(m_before, pulled, ratio)
                                  : Rect { pulled.x, pulled.maxY() - height, pulled.width, height });

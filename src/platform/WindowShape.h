@@ -23,10 +23,8 @@ public:
     /// Borrows both; `tracker` follows `window` and owns this object.
     WindowShape(Window &window, FrameTracker &tracker);
 
-    /// Tells the desktop anew; called before a new frame is asked for and after it was granted.
-    void update();
-
 private:
+    void update();
     void await(bool isPulled);
     void rest();
     void correct();
