@@ -25,7 +25,7 @@ endif()
 # penwick_add_module(NAME SOURCES file... [QT component...] [DEPENDS module...] [LIBRARIES target...])
 #
 # Makes the object library penwick_NAME of one folder under src/. DEPENDS names the modules whose
-# headers the folder may include; a test holds it against the includes.
+# headers the folder may include, or whose artwork it shows; a test holds it against the includes.
 function(penwick_add_module name)
   cmake_parse_arguments(arg "" "" "SOURCES;QT;DEPENDS;LIBRARIES" ${ARGN})
   add_library(penwick_${name} OBJECT ${arg_SOURCES})
@@ -39,5 +39,24 @@ function(penwick_add_module name)
   if(PENWICK_COVERAGE)
     target_compile_options(penwick_${name} PRIVATE --coverage)
   endif()
+  set_property(TARGET penwick_${name} PROPERTY PENWICK_DEPENDS ${arg_DEPENDS})
   set_property(GLOBAL APPEND PROPERTY PENWICK_MODULES penwick_${name})
+endfunction()
+
+# penwick_link_modules(TARGET module...)
+#
+# Links modules and, because objects do not travel transitively, all that they depend on.
+function(penwick_link_modules target)
+  set(wanted ${ARGN})
+  set(modules)
+  while(wanted)
+    list(POP_FRONT wanted module)
+    if(NOT module IN_LIST modules)
+      list(APPEND modules ${module})
+      get_property(depends TARGET penwick_${module} PROPERTY PENWICK_DEPENDS)
+      list(APPEND wanted ${depends})
+    endif()
+  endwhile()
+  list(TRANSFORM modules PREPEND penwick_)
+  target_link_libraries(${target} PRIVATE ${modules})
 endfunction()
