@@ -8,7 +8,7 @@
 #include <penwick/Penwick.h>
 #include <penwick/platform/Geometry.h>
 
-#include "history/CanvasContent.h"
+#include "content/CanvasContent.h"
 
 #include <memory>
 

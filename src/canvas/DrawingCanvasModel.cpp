@@ -63,7 +63,9 @@ void DrawingCanvasModel::createPathWithParam(
     const std::int64_t pathId = path->hash();
     const StrokeEntry entry { std::move(path), { startPoint, std::nullopt, pathColor }, pathId };
 
-    mutablePathArray().append(entry);
+    EntryList<StrokeEntry> strokes = pathArray();
+    strokes.append(entry);
+    setPathArray(std::move(strokes));
     m_strokeIndex.follow(pathArray());
     record({ entry, ActionType::draw, pathId });
     forgetWhatCouldBeRedone();
@@ -74,13 +76,15 @@ void DrawingCanvasModel::updateTheCurrentPath(platform::Point currentPoint)
     if (pathArray().isEmpty())
         return;
     m_strokeIndex.follow(pathArray()); // an undo may have made another stroke the newest
-    StrokeEntry &current = mutablePathArray().mutableLast();
+    EntryList<StrokeEntry> strokes = pathArray();
+    StrokeEntry &current = strokes.mutableLast();
     std::optional<platform::Point> &segmentStart = current.bPathParams.startPoint;
     if (!segmentStart)
         platform::fatalError("the newest stroke has no start point");
     current.bPath->moveToPoint(*segmentStart);
     current.bPath->lineToPoint(currentPoint);
     segmentStart = currentPoint;
+    setPathArray(std::move(strokes));
 }
 
 bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLocation)
@@ -92,7 +96,9 @@ bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLo
     const StrokeEntry entry = pathArray()[*hit];
     record({ entry, ActionType::erase, entry.pathId });
     forgetWhatCouldBeRedone();
-    mutablePathArray().removeAt(*hit);
+    EntryList<StrokeEntry> strokes = pathArray();
+    strokes.removeAt(*hit);
+    setPathArray(std::move(strokes));
     m_strokeIndex.follow(pathArray());
     return true;
 }
@@ -113,19 +119,23 @@ void DrawingCanvasModel::createTextBox(
         "a text box's delegate is no owner of text boxes"));
     const TextBoxEntry entry { textBox->hash(), textBox };
 
-    mutableTextBoxArray().append(entry);
+    EntryList<TextBoxEntry> boxes = textBoxArray();
+    boxes.append(entry);
+    setTextBoxArray(std::move(boxes));
     record({ entry, ActionType::draw, entry.textId });
     m_strokeIndex.follow(pathArray()); // strokes that this made the history forget are free to go
 }
 
 void DrawingCanvasModel::deleteTextBoxWith(std::int64_t hashValue)
 {
-    const auto found = textBoxArray().firstIndexWhere(
+    EntryList<TextBoxEntry> boxes = textBoxArray();
+    const auto found = boxes.firstIndexWhere(
         [hashValue](const TextBoxEntry &entry) { return entry.textId == hashValue; });
     if (!found)
         return;
-    requireHistory().pushUndo({ textBoxArray()[*found], ActionType::erase, hashValue });
-    mutableTextBoxArray().removeAt(*found);
+    requireHistory().pushUndo({ boxes[*found], ActionType::erase, hashValue });
+    boxes.removeAt(*found);
+    setTextBoxArray(std::move(boxes));
 }
 
 void DrawingCanvasModel::clearCanvas()
@@ -138,9 +148,9 @@ void DrawingCanvasModel::clearCanvas()
     for (const TextBoxEntry &entry : textBoxArray())
         history.pushUndo({ entry, ActionType::clear, entry.textId });
     history.setUndoCount(0);
-    mutablePathArray().clear();
+    setPathArray({});
     m_strokeIndex.follow(pathArray()); // so that it keeps nothing alive
-    mutableTextBoxArray().clear();
+    setTextBoxArray({});
 }
 
 } // namespace penwick

@@ -2,7 +2,7 @@
 // The one truth about what is on a canvas.
 #pragma once
 
-#include "history/CanvasContent.h"
+#include "content/CanvasContent.h"
 #include "strokes/StrokeIndex.h"
 
 #include <penwick/platform/Geometry.h>
@@ -64,6 +64,10 @@ public:
     void clearCanvas();
 
 private:
+    // Only the history assigns the arrays; everybody else calls an operation.
+    using CanvasContent::setPathArray;
+    using CanvasContent::setTextBoxArray;
+
     [[nodiscard]] UndoRedoManager &requireHistory() const;
     void record(const UndoRedoState &state);
     void forgetWhatCouldBeRedone();

@@ -4,7 +4,7 @@
 
 #include "canvas/DrawingCanvasDelegate.h"
 #include "canvas/ToolChooser.h"
-#include "history/CanvasContent.h"
+#include "content/CanvasContent.h"
 #include "platform/ViewOf.h"
 #include "platform/WeakReference.h"
 #include "strokes/StrokePicture.h"

@@ -45,31 +45,62 @@ bool isStroke(const UndoRedoState &record)
     return std::holds_alternative<StrokeEntry>(record.element);
 }
 
-void appendElement(
-    const Element &element, EntryList<StrokeEntry> &strokes, EntryList<TextBoxEntry> &textBoxes)
+void appendElement(CanvasContent &content, const Element &element)
 {
-    if (const auto *stroke = std::get_if<StrokeEntry>(&element))
+    if (const auto *stroke = std::get_if<StrokeEntry>(&element)) {
+        EntryList<StrokeEntry> strokes = content.pathArray();
         strokes.append(*stroke);
-    else
-        textBoxes.append(std::get<TextBoxEntry>(element));
+        content.setPathArray(std::move(strokes));
+    } else {
+        EntryList<TextBoxEntry> boxes = content.textBoxArray();
+        boxes.append(std::get<TextBoxEntry>(element));
+        content.setTextBoxArray(std::move(boxes));
+    }
 }
 
-void removeFirstStroke(EntryList<StrokeEntry> &strokes, std::int64_t pathId)
+void removeFirstStroke(CanvasContent &content, std::int64_t pathId)
 {
+    EntryList<StrokeEntry> strokes = content.pathArray();
     const auto index = strokes.firstIndexWhere(
         [pathId](const StrokeEntry &entry) { return entry.pathId == pathId; });
-    if (index)
-        strokes.removeAt(*index);
+    if (!index)
+        return;
+    strokes.removeAt(*index);
+    content.setPathArray(std::move(strokes));
 }
 
-void removeFirstTextBox(EntryList<TextBoxEntry> &textBoxes, std::int64_t textId)
+void removeFirstTextBox(CanvasContent &content, std::int64_t textId)
 {
-    const auto index = textBoxes.firstIndexWhere(
+    EntryList<TextBoxEntry> boxes = content.textBoxArray();
+    const auto index = boxes.firstIndexWhere(
         [textId](const TextBoxEntry &entry) { return entry.textId == textId; });
     if (!index)
         return;
-    textBoxes.removeAt(*index);
+    boxes.removeAt(*index);
+    content.setTextBoxArray(std::move(boxes));
     postTextBoxLeaves(textId);
+}
+
+void removeFirst(CanvasContent &content, const UndoRedoState &record)
+{
+    if (isStroke(record))
+        removeFirstStroke(content, record.elementId);
+    else
+        removeFirstTextBox(content, record.elementId);
+}
+
+void removeLastStroke(CanvasContent &content)
+{
+    EntryList<StrokeEntry> strokes = content.pathArray();
+    strokes.removeLast();
+    content.setPathArray(std::move(strokes));
+}
+
+void removeLastTextBox(CanvasContent &content)
+{
+    EntryList<TextBoxEntry> boxes = content.textBoxArray();
+    boxes.removeLast();
+    content.setTextBoxArray(std::move(boxes));
 }
 
 void printNotAvailable()
@@ -173,11 +204,7 @@ void UndoRedoManager::undoAction()
 
 void UndoRedoManager::undoDraw(const UndoRedoState &record)
 {
-    CanvasContent &content = requireContent();
-    if (isStroke(record))
-        removeFirstStroke(content.mutablePathArray(), record.elementId);
-    else
-        removeFirstTextBox(content.mutableTextBoxArray(), record.elementId);
+    removeFirst(requireContent(), record);
     pushRedo(record);
     popUndo();
 }
@@ -185,8 +212,7 @@ void UndoRedoManager::undoDraw(const UndoRedoState &record)
 void UndoRedoManager::undoErase(const UndoRedoState &record)
 {
     // At the end, not where it was: what comes back lies on top of what was drawn meanwhile.
-    CanvasContent &content = requireContent();
-    appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+    appendElement(requireContent(), record.element);
     pushRedo(record);
     popUndo();
 }
@@ -194,15 +220,15 @@ void UndoRedoManager::undoErase(const UndoRedoState &record)
 void UndoRedoManager::undoClear()
 {
     CanvasContent &content = requireContent();
-    content.mutablePathArray().clear();
-    content.mutableTextBoxArray().clear();
+    content.setPathArray({});
+    content.setTextBoxArray({});
 
     const RecordStack records = m_undoStack;
     for (int index = records.size() - 1; index >= 0; --index) {
         const UndoRedoState &record = records[index];
         if (record.actionAssociated != ActionType::clear)
             break;
-        appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+        appendElement(content, record.element);
         pushRedo(record);
         popUndo();
     }
@@ -236,19 +262,14 @@ void UndoRedoManager::redoAction()
 
 void UndoRedoManager::redoDraw(const UndoRedoState &record)
 {
-    CanvasContent &content = requireContent();
-    appendElement(record.element, content.mutablePathArray(), content.mutableTextBoxArray());
+    appendElement(requireContent(), record.element);
     pushUndo(record);
     popRedo();
 }
 
 void UndoRedoManager::redoErase(const UndoRedoState &record)
 {
-    CanvasContent &content = requireContent();
-    if (isStroke(record))
-        removeFirstStroke(content.mutablePathArray(), record.elementId);
-    else
-        removeFirstTextBox(content.mutableTextBoxArray(), record.elementId);
+    removeFirst(requireContent(), record);
     pushUndo(record);
     popRedo();
 }
@@ -268,9 +289,9 @@ void UndoRedoManager::redoClearOf(const UndoRedoState &record)
     // By position, not by identifier: undo put the group at the end in this very order.
     CanvasContent &content = requireContent();
     if (isStroke(record) && !content.pathArray().isEmpty()) {
-        content.mutablePathArray().removeLast();
+        removeLastStroke(content);
     } else if (!content.textBoxArray().isEmpty()) {
-        content.mutableTextBoxArray().removeLast();
+        removeLastTextBox(content);
         postTextBoxLeaves(m_redoStack.last().elementId);
     }
     pushUndo(record);

@@ -2,8 +2,8 @@
 // One record of the history: what was done to which entry.
 #pragma once
 
-#include "history/CanvasContent.h"
-#include "history/EntryList.h"
+#include "content/CanvasContent.h"
+#include "content/EntryList.h"
 
 #include <cstdint>
 #include <variant>

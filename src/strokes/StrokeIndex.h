@@ -2,8 +2,8 @@
 // Which strokes lie where.
 #pragma once
 
-#include "history/CanvasContent.h"
-#include "history/EntryListChange.h"
+#include "content/CanvasContent.h"
+#include "content/EntryListChange.h"
 #include "strokes/StrokeCrossing.h"
 
 #include <penwick/platform/Geometry.h>

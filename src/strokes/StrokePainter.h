@@ -2,7 +2,7 @@
 // The one way in which strokes are painted.
 #pragma once
 
-#include "history/CanvasContent.h"
+#include "content/CanvasContent.h"
 
 #include <QRect>
 

@@ -9,6 +9,20 @@
 namespace penwick::test {
 namespace {
 
+template <class Content>
+concept letsItsArraysBeAssigned
+    = requires(Content &content, EntryList<StrokeEntry> strokes, EntryList<TextBoxEntry> boxes)
+{
+    content.setPathArray(strokes);
+    content.setTextBoxArray(boxes);
+};
+
+TEST(DrawingCanvasModelContract, onlyTheHistorySeesArraysThatItMayAssign)
+{
+    EXPECT_TRUE(letsItsArraysBeAssigned<CanvasContent>);
+    EXPECT_FALSE(letsItsArraysBeAssigned<DrawingCanvasModel>);
+}
+
 TEST_F(DrawingCanvasModelTest, newModelIsEmptyAndHasNoHistory)
 {
     const DrawingCanvasModel fresh;

@@ -26,13 +26,9 @@ namespace test {
 using Ids = std::vector<std::int64_t>;
 using Posts = std::vector<std::string>;
 
-/// Content whose arrays the test may fill.
+/// Content without a model's operations.
 class TestContent final : public CanvasContent
-{
-public:
-    using CanvasContent::mutablePathArray;
-    using CanvasContent::mutableTextBoxArray;
-};
+{ };
 
 inline UndoRedoState strokeRecord(ActionType action, std::int64_t identifier)
 {
@@ -64,10 +60,15 @@ protected:
     /// Puts the record's entry on the canvas, as if it had just been drawn.
     void putOnCanvas(const UndoRedoState &record)
     {
-        if (const auto *stroke = std::get_if<StrokeEntry>(&record.element))
-            content->mutablePathArray().append(*stroke);
-        else
-            content->mutableTextBoxArray().append(std::get<TextBoxEntry>(record.element));
+        if (const auto *stroke = std::get_if<StrokeEntry>(&record.element)) {
+            EntryList<StrokeEntry> strokes = content->pathArray();
+            strokes.append(*stroke);
+            content->setPathArray(strokes);
+        } else {
+            EntryList<TextBoxEntry> boxes = content->textBoxArray();
+            boxes.append(std::get<TextBoxEntry>(record.element));
+            content->setTextBoxArray(boxes);
+        }
     }
 
     /// Draws `count` strokes, numbered from 1, without anybody listening.

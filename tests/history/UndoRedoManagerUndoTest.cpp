@@ -150,7 +150,9 @@ TEST_F(UndoRedoManagerTest, undoOfAnErasedStrokePutsItAboveStrokesDrawnLater)
 {
     drawStrokes(3);
     const UndoRedoState erased { content->pathArray()[0], ActionType::erase, 1 };
-    content->mutablePathArray().removeAt(0);
+    EntryList<StrokeEntry> strokesLeft = content->pathArray();
+    strokesLeft.removeAt(0);
+    content->setPathArray(strokesLeft);
     manager.pushUndo(erased);
 
     manager.undoAction();

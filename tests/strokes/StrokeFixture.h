@@ -2,7 +2,7 @@
 // Strokes: a plain one, and any at random places for properties that hold for every drawing.
 #pragma once
 
-#include "history/CanvasContent.h"
+#include "content/CanvasContent.h"
 
 #include <penwick/platform/BezierPath.h>
 

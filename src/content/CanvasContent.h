@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
 // What is on one canvas: strokes and text boxes, as plain entries.
-// Declared beside the history because the history works on it; the model is it.
 #pragma once
 
-#include "history/EntryList.h"
+#include "content/EntryList.h"
 
 #include <penwick/platform/BezierPath.h>
 #include <penwick/platform/Geometry.h>
@@ -13,6 +12,7 @@
 #include <cstdint>
 #include <memory>
 #include <optional>
+#include <utility>
 
 namespace penwick {
 
@@ -43,7 +43,8 @@ struct TextBoxEntry
 
 /// The two arrays of a canvas, each oldest first: the drawing order.
 ///
-/// Everybody may read them, only the model (which derives from this) and its history change them.
+/// They are values: whoever changes one changes a copy and assigns it. This is how a canvas's
+/// history sees its model; the model keeps the assignments from everybody else.
 class CanvasContent
 {
 public:
@@ -51,18 +52,15 @@ public:
     CanvasContent &operator=(const CanvasContent &) = delete;
 
     [[nodiscard]] const EntryList<StrokeEntry> &pathArray() const { return m_pathArray; }
+    void setPathArray(EntryList<StrokeEntry> strokes) { m_pathArray = std::move(strokes); }
     [[nodiscard]] const EntryList<TextBoxEntry> &textBoxArray() const { return m_textBoxArray; }
+    void setTextBoxArray(EntryList<TextBoxEntry> boxes) { m_textBoxArray = std::move(boxes); }
 
 protected:
-    CanvasContent();
-    ~CanvasContent();
-
-    [[nodiscard]] EntryList<StrokeEntry> &mutablePathArray() { return m_pathArray; }
-    [[nodiscard]] EntryList<TextBoxEntry> &mutableTextBoxArray() { return m_textBoxArray; }
+    CanvasContent() = default;
+    ~CanvasContent() = default;
 
 private:
-    friend class UndoRedoManager;
-
     EntryList<StrokeEntry> m_pathArray;
     EntryList<TextBoxEntry> m_textBoxArray;
 };

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // An array that is a value: against plain vectors, and what its copies share.
-#include "history/EntryList.h"
+#include "content/EntryList.h"
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>

@@ -2,7 +2,7 @@
 // What differs between two states of a list.
 #pragma once
 
-#include "history/EntryList.h"
+#include "content/EntryList.h"
 
 #include <algorithm>
 

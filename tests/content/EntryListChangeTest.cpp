@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The smallest change between two states of a list.
-#include "history/EntryListChange.h"
+#include "content/EntryListChange.h"
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
