@@ -1,18 +1,15 @@
 // SPDX-License-Identifier: MIT
-// Follows a window's outer frame on the real desktop.
-// The one place where the window manager's late answers are turned into facts.
+// Follows a window's outer frame on the real desktop: the toolkit's events and the desktop's words
+// into the negotiation, and what comes out of it to the toolkit and to whoever listens.
 #pragma once
 
 #include <penwick/platform/Geometry.h>
 
-#include <QElapsedTimer>
-#include <QMargins>
-#include <QObject>
-#include <QRect>
-#include <QTimer>
-#include <QWindow>
+#include "platform/Clock.h"
+#include "platform/FrameNegotiation.h"
 
-#include <optional>
+#include <QObject>
+#include <QWindow>
 
 class QWidget;
 
@@ -33,11 +30,17 @@ public:
     explicit FrameTracker(QWidget &window);
     ~FrameTracker() override;
 
+    /// Where the window is, was asked to be, or is gliding to.
     [[nodiscard]] Rect frame() const;
     /// The title bar and borders, in points, as last known.
-    [[nodiscard]] QMargins margins() const { return m_margins; }
+    [[nodiscard]] QMargins margins() const { return m_negotiation.margins(); }
     /// Asks for `frame` and returns at once. The desktop may grant something else.
     void request(const Rect &frame);
+    /// The window on the screen sets off to `target`. Whoever follows it is told here that it is
+    /// there, and of the steps nothing; a request ends the way.
+    void setOff(const Rect &target);
+    /// The next place on the way.
+    void step(const Rect &frame);
     /// Places the window, which is about to be shown, so that its outer frame is right at once.
     void prepareToShow();
 
@@ -73,44 +76,18 @@ Q_SIGNALS:
 private:
     void followPrimaryScreen();
     void followFrame();
-    void onFrameExchanged(bool hasFrame);
-    void applyRequest();
-    void adoptScale();
-    [[nodiscard]] bool isArranged() const;
-    [[nodiscard]] bool isNew() const;
-    void mendToolkit();
-    void check();
-    [[nodiscard]] bool isDecoratedAnew() const;
-    void awaitAnswer();
-    void lookAgain();
-    [[nodiscard]] bool isOverlooked() const;
-    void announce();
-    void announceRescaled(QPoint delta, bool hasResized);
-    void announceUserMove();
-    [[nodiscard]] QRect outerGeometry() const;
-    [[nodiscard]] bool isWhereItBelongs(const QRect &outer) const;
+    void lookSoon();
+    void look();
+    void awaitNextLook();
+    void carryOut(const FrameEffects &effects);
+    void place(const FramePlacing &placing);
+    void tell(const FrameNews &news);
+    [[nodiscard]] FrameObservation observation() const;
 
     QWidget &m_window;
-    QRectF m_frame; // Qt's desktop, which another primary screen leaves as it is
-    QPoint m_origin; // of frame() in Qt's desktop, when moved() was last thought of
-    QRect m_announced; // Qt's desktop; what the last signals told of
-    QMargins m_margins; // of the desktop, as last used to place the window
-    double m_scale = 0.0; // device pixels a point, for which m_margins hold
-    bool m_isRescaled = false; // and nobody has been told
-    bool m_isPending = false; // asked, not yet granted
+    FrameNegotiation m_negotiation;
     WId m_followed = 0;
-    std::optional<QPoint> m_corner; // of the frame, in device pixels, where the desktop tells it
-    // Children of this object: a test without a clock finds them there and fires them by hand.
-    QTimer m_check { this };
-    QTimer m_patience { this };
-    int m_looksLeft = 0;
-    QTimer m_userMove { this }; // runs while a move by the user may go on
-    bool m_isByUser = false;
-    std::optional<QRectF> m_givenUp; // what was asked for, in whose place something else stands
-    bool m_isMended = false; // asked once more already
-    std::optional<QRectF> m_askedBeforeFrame; // given up before the window manager had framed it
-    bool m_isFrameLost = false; // the window manager has ended; m_margins are its frame's
-    QElapsedTimer m_sinceFramed;
+    Alarm m_alarm; // for the next look
 };
 
 } // namespace penwick::platform

@@ -27,9 +27,9 @@ Glide::Glide(FrameTracker &tracker)
 
 void Glide::start(const Rect &target)
 {
+    const Rect from = m_at.value_or(m_tracker.frame());
     stop();
-    const Rect from = m_tracker.frame();
-    m_target = target;
+    m_at = from;
     m_animation = new QVariantAnimation(this);
     m_animation->setDuration(glideTime);
     m_animation->setEasingCurve(QEasingCurve::OutCubic);
@@ -37,16 +37,29 @@ void Glide::start(const Rect &target)
     m_animation->setEndValue(1.0);
     connect(m_animation, &QVariantAnimation::valueChanged, this,
         [this, from, target](const QVariant &progress) {
-            m_tracker.request(between(from, target, progress.toDouble()));
+            m_at = between(from, target, progress.toDouble());
+            m_tracker.step(*m_at);
         });
-    connect(m_animation, &QVariantAnimation::finished, this, [this] { m_target.reset(); });
+    connect(m_animation, &QVariantAnimation::finished, this, [this, target] {
+        m_at.reset();
+        m_tracker.request(target);
+    });
     m_animation->start(QAbstractAnimation::DeleteWhenStopped);
+    m_tracker.setOff(target); // last: whoever is told may send the window elsewhere
+}
+
+void Glide::halt()
+{
+    if (const auto at = m_at) {
+        stop();
+        m_tracker.request(*at);
+    }
 }
 
 void Glide::stop()
 {
     delete m_animation;
-    m_target.reset();
+    m_at.reset();
 }
 
 } // namespace penwick::platform

@@ -24,16 +24,17 @@ public:
     /// Borrows `tracker`, whose child this is.
     explicit Glide(FrameTracker &tracker);
 
-    /// Where the window is going; nothing while it stands.
-    [[nodiscard]] std::optional<Rect> target() const { return m_target; }
-    /// Sets off from where the window is now, in place of a movement under way.
+    [[nodiscard]] bool isUnderWay() const { return m_at.has_value(); }
+    /// Sets off from where the window is seen now, in place of a movement under way.
     void start(const Rect &target);
-    /// Leaves the window where it is.
+    /// Leaves the window where it is seen now, which is its frame then. For who takes hold of it.
+    void halt();
+    /// Forgets the way, for who asks for another frame.
     void stop();
 
 private:
     FrameTracker &m_tracker;
-    std::optional<Rect> m_target;
+    std::optional<Rect> m_at; // while it is under way
     QPointer<QVariantAnimation> m_animation;
 };
 

@@ -41,10 +41,7 @@ Window::Window(QWidget *parent)
     tell(&FrameTracker::moveBegan, &WindowDelegate::windowWillMove);
     tell(&FrameTracker::moved, &WindowDelegate::windowDidMove);
     tell(&FrameTracker::resized, &WindowDelegate::windowDidResize);
-    connect(tracker, &FrameTracker::settled, this, [this] {
-        if (!d->glide->target())
-            Q_EMIT frameSettled();
-    });
+    connect(tracker, &FrameTracker::settled, this, &Window::frameSettled);
     applyAttributes();
 }
 
@@ -72,13 +69,14 @@ Window::~Window()
 Rect Window::frame() const
 {
     requireGuiThread();
-    return d->glide->target().value_or(d->tracker->frame());
+    return d->tracker->frame();
 }
 
 void Window::setFrame(const Rect &frame, Animate animate)
 {
     requireGuiThread();
-    if (animate == Animate::Yes && isVisible() && !(frame == d->tracker->frame()))
+    const bool isElsewhere = d->glide->isUnderWay() || !(frame == d->tracker->frame());
+    if (animate == Animate::Yes && isVisible() && isElsewhere)
         return d->glide->start(frame);
     d->glide->stop();
     d->tracker->request(frame);

@@ -71,6 +71,7 @@ void Window::mousePressEvent(QMouseEvent *event)
     event->accept();
     if (event->button() != Qt::LeftButton)
         return;
+    d->glide->halt(); // where the user sees it is where it is taken hold of
     d->drag.begin(*this, event->globalPosition().toPoint());
     if (d->windowController)
         d->windowController->mouseDown();

@@ -15,7 +15,7 @@ namespace penwick::platform {
 
 namespace {
 
-constexpr int restTime = 200; // ms
+constexpr Clock::Time restTime { 200 };
 constexpr double tolerance = 2.0; // points, of rounding by the desktop
 
 double heightFor(double width, const Size &ratio)
@@ -35,9 +35,7 @@ WindowShape::WindowShape(Window &window, FrameTracker &tracker)
     , m_window(window)
     , m_tracker(tracker)
 {
-    m_rest.setSingleShot(true);
-    m_rest.setInterval(restTime);
-    connect(&m_rest, &QTimer::timeout, this, &WindowShape::rest);
+    connect(&m_rest, &Alarm::rang, this, &WindowShape::rest);
     connect(&tracker, &FrameTracker::asking, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
@@ -79,22 +77,27 @@ bool WindowShape::isArranged() const
 void WindowShape::rememberFrame()
 {
     if (std::exchange(m_isAnswering, false))
-        m_rest.stop(); // what it granted instead is no pull by the user
-    if (!m_rest.isActive() && !isArranged())
+        m_rest.cancel(); // what it granted instead is no pull by the user
+    if (!m_rest.at() && !isArranged())
         m_before = m_tracker.frame();
 }
 
 void WindowShape::await(bool isPulled)
 {
     m_isPulled = isPulled;
-    m_rest.start();
+    awaitRest();
+}
+
+void WindowShape::awaitRest()
+{
+    m_rest.set(Clock::ofTheUser().now() + restTime);
 }
 
 // A window that changed under the hand would be pulled from another size than its user sees.
 void WindowShape::rest()
 {
     if (NativeDesktop::instance().isPointerHeld())
-        return m_rest.start();
+        return awaitRest();
     correct();
     if (!m_isAnswering)
         rememberFrame();

@@ -4,8 +4,9 @@
 
 #include <penwick/platform/Geometry.h>
 
+#include "platform/Clock.h"
+
 #include <QObject>
-#include <QTimer>
 
 namespace penwick::platform {
 
@@ -26,6 +27,7 @@ public:
 private:
     void update();
     void await(bool isPulled);
+    void awaitRest();
     void rest();
     void correct();
     void rememberFrame();
@@ -37,7 +39,7 @@ private:
     Rect m_before; // the frame that the user began to pull; empty before the first one
     bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
     bool m_isAnswering = false; // the desktop, to the frame that a pull was corrected to
-    QTimer m_rest { this }; // runs while the user may still be pulling
+    Alarm m_rest { Clock::ofTheUser(), this }; // set while the user may still be pulling
 };
 
 } // namespace penwick::platform

@@ -4,7 +4,6 @@
 #include "platform/FrameTracker.h"
 #include "platform/WindowFixture.h"
 
-#include <QTimer>
 #include <QWindow>
 
 namespace penwick::platform {
@@ -53,20 +52,18 @@ protected:
         m_window.setMinimumSize(0, 0);
     }
 
-    [[nodiscard]] QTimer *restTimer() const
+    /// Whether the time is awaited after which the user has stopped pulling.
+    [[nodiscard]] bool isRestAwaited() const
     {
         const auto *const shape = m_window.findChild<WindowShape *>();
-        return shape ? shape->findChild<QTimer *>() : nullptr;
+        const auto *const alarm = shape ? shape->findChild<Alarm *>() : nullptr;
+        return alarm && alarm->at().has_value();
     }
 
-    /// Lets the time come after which the user has stopped pulling.
     void rest()
     {
-        QTimer *const timer = restTimer();
-        ASSERT_NE(timer, nullptr);
-        ASSERT_TRUE(timer->isActive());
-        QTimerEvent event(timer->timerId());
-        QCoreApplication::sendEvent(timer, &event);
+        ASSERT_TRUE(isRestAwaited());
+        Clock::ofTheUser().letPass(Clock::Time(200));
     }
 };
 
@@ -178,8 +175,7 @@ TEST_F(WindowShapeTest, ofAnotherShapeThatTheDesktopMadeHigherIsLeftAlone)
 
     askForLow({ 300, 290, 640, 400 });
 
-    ASSERT_NE(restTimer(), nullptr);
-    EXPECT_FALSE(restTimer()->isActive());
+    EXPECT_FALSE(isRestAwaited());
 }
 
 TEST_F(WindowShapeTest, thatTheUserCannotResizeIsLeftAlone)

@@ -197,11 +197,9 @@ void PlainBoard::turn()
         m_canvas.paint();
 }
 
-// Steps of one move follow each other at once; only the first of them is a new move.
 void PlainBoard::moveTo(const PlainFrame &frame)
 {
-    if (!std::exchange(m_isMoving, true))
-        orderPopoverOut();
+    orderPopoverOut();
     m_frames.moveTo(frame);
 }
 
@@ -213,7 +211,6 @@ void PlainBoard::comeUpAt(const PlainFrame &frame)
 
 void PlainBoard::rest(const PlainFrame &frame)
 {
-    m_isMoving = false;
     m_frames.restAt(frame);
 }
 

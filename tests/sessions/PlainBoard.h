@@ -126,7 +126,6 @@ private:
     bool m_isBannerShown = false;
     bool m_doLettersRest = false; // letters and digits, which otherwise work the tool bar
     PlainFrames m_frames;
-    bool m_isMoving = false;
 
     std::string m_menu; // of this box
     bool m_isMenuOfResponder = false; // it had the keys

@@ -2,20 +2,21 @@
 // The component's windows: shown, hidden, moved, and told what a desktop tells.
 #include "sessions/RealBoard.h"
 
-#include "platform/FrameTracker.h"
+#include "platform/Clock.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelViewController.h"
 
 #include <QApplication>
-#include <QTimer>
 #include <QWindow>
 
 namespace penwick::sessions {
 
 namespace {
 
-constexpr int shortestRest = 200; // ms; shorter times look after a request, or are none
-constexpr int mostLooks = 8;
+// Until what was asked for is granted, or what stands there is taken for the answer.
+constexpr platform::Clock::Time patience { 300 };
+// Until the hand that has moved a window, or pulled at its edges, counts as gone.
+constexpr platform::Clock::Time longestRest { 1000 };
 
 /// While it lives, a window does not hear that it is, or is not any more, the active one.
 class Deaf final : public QObject
@@ -27,21 +28,6 @@ public:
         return event->type() == QEvent::ActivationChange;
     }
 };
-
-/// What times a window's frame.
-QList<QTimer *> timersOf(const platform::Window &window)
-{
-    return window.findChild<platform::FrameTracker *>(QString(), Qt::FindDirectChildrenOnly)
-        ->findChildren<QTimer *>();
-}
-
-/// Lets what waits for `timer` happen now.
-void fire(QTimer &timer)
-{
-    QTimerEvent event(timer.timerId());
-    if (timer.isActive())
-        QCoreApplication::sendEvent(&timer, &event);
-}
 
 } // namespace
 
@@ -120,6 +106,7 @@ QRect RealBoard::outerFrame() const
 
 void RealBoard::moveTo(const QRect &outer)
 {
+    platform::Clock::ofTheDesktop().letPass(longestRest); // each is a move of its own
     QWindow &native = *window().windowHandle();
     native.setGeometry(outer.marginsRemoved(native.frameMargins()));
     hearDesktop();
@@ -128,18 +115,14 @@ void RealBoard::moveTo(const QRect &outer)
 
 void RealBoard::rest()
 {
-    for (QTimer *const timer : timersOf(window())) {
-        if (timer->interval() >= shortestRest)
-            fire(*timer);
-    }
+    platform::Clock::ofTheUser().letPass(longestRest);
+    platform::Clock::ofTheDesktop().letPass(longestRest);
     hearDesktop();
     turn();
 }
 
 void RealBoard::hearDesktop()
 {
-    const std::vector<platform::Window *> family { &window(),
-        m_controller->tPanelWindowController()->window(), bar().popoverW() };
     {
         // Without a screen every window that came up since becomes the active one.
         const bool isActive = window().isActiveWindow();
@@ -147,13 +130,7 @@ void RealBoard::hearDesktop()
         QCoreApplication::processEvents(QEventLoop::X11ExcludeTimers);
         activate(isActive);
     }
-    for (platform::Window *const each : family) {
-        for (QTimer *const timer : timersOf(*each)) {
-            // Until a request is granted, or what stands there is taken for the answer.
-            for (int look = 0; look < mostLooks && timer->interval() < shortestRest; ++look)
-                fire(*timer);
-        }
-    }
+    platform::Clock::ofTheDesktop().letPass(patience);
 }
 
 PlainFrames RealBoard::frames() const

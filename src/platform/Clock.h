@@ -1,0 +1,70 @@
+// SPDX-License-Identifier: MIT
+// Time that passes by itself, and that a test can let pass.
+#pragma once
+
+#include <QObject>
+#include <QTimer>
+
+#include <chrono>
+#include <optional>
+#include <vector>
+
+namespace penwick::platform {
+
+class Alarm;
+
+/// A clock that never goes back. GUI thread only.
+class Clock final
+{
+public:
+    using Time = std::chrono::milliseconds; ///< since some moment, the same for all clocks
+
+    /// What a desktop is given to answer in.
+    [[nodiscard]] static Clock &ofTheDesktop();
+    /// What a user is given to go on in.
+    [[nodiscard]] static Clock &ofTheUser();
+
+    [[nodiscard]] Time now() const;
+    /// Lets `by` pass at once: every alarm that is due meanwhile rings inside this call, in the
+    /// order of their times. For tests that leave nothing to luck.
+    void letPass(Time by);
+
+    /// Borrows `alarm` until it is removed.
+    void add(Alarm &alarm) { m_alarms.push_back(&alarm); }
+    void remove(Alarm &alarm) { std::erase(m_alarms, &alarm); }
+
+private:
+    [[nodiscard]] Alarm *firstDue(Time until) const;
+
+    Time m_ahead {}; // of the machine's own clock
+    std::vector<Alarm *> m_alarms;
+};
+
+/// Rings once, at a time of one clock.
+class Alarm final : public QObject
+{
+    Q_OBJECT
+
+public:
+    /// Borrows `clock`, which all alarms end before.
+    explicit Alarm(Clock &clock, QObject *parent = nullptr);
+    ~Alarm() override;
+
+    /// In place of the time that was set before. A time that has passed rings with the next turn of
+    /// the event loop.
+    void set(Clock::Time at);
+    void cancel();
+    [[nodiscard]] std::optional<Clock::Time> at() const { return m_at; }
+    /// At once, and not again until it is set again.
+    void ring();
+
+Q_SIGNALS:
+    void rang();
+
+private:
+    Clock &m_clock;
+    std::optional<Clock::Time> m_at;
+    QTimer m_timer;
+};
+
+} // namespace penwick::platform
