@@ -17,14 +17,16 @@ using platform::Point;
 constexpr float edgeReach = 0.7072F; // pixels
 constexpr float fullCoverage = 255.0F;
 
-// Not quite half: an edge in the middle of a pixel is frequent, and must not come out one way on
-// the way there and the other on the way back.
+// Added to a coverage before its fraction is cut off. It is a little less than a half because edges
+// through the middle of a pixel are frequent: with a half, the smallest error of calculation would
+// make 127 of one such pixel and 128 of the next.
 constexpr float rounding = 0.49F;
 constexpr std::size_t blockSize = 64; // pixels worked on at a time
 
-// Far more than any screen has, and small enough for whole numbers. A line that reaches farther is
-// bent there; a radius is larger than the diagonal only if nothing but its inside is seen.
+// Coordinates beyond this are moved to it, so that they fit into an int. It is far more than any
+// screen has: what this bends in a line lies where nobody sees it.
 constexpr double farthest = 1e6; // pixels
+// From any place to any other it is less far than this, so a larger radius would look the same.
 constexpr double largestRadius = 4 * farthest;
 
 double limited(double coordinate)
@@ -37,7 +39,8 @@ Point limited(Point point)
     return { limited(point.x), limited(point.y) };
 }
 
-// By value: what works on addresses is not done for several pixels at once.
+// std::max() and std::min() take and return references, which keeps the compiler from working on
+// several pixels at once. These functions take and return values.
 inline float larger(float a, float b)
 {
     return a > b ? a : b;
@@ -48,17 +51,19 @@ inline float smaller(float a, float b)
     return a < b ? a : b;
 }
 
-/// How much of a pixel lies on the inner side of a straight edge. `inside` is the distance of the
-/// pixel's centre from the edge, `along` and `across` the components of the unit vector that
-/// crosses the edge at a right angle, without their signs.
+/// How much of a pixel lies on the inner side of a straight edge, from 0 to 1. `inside` is the
+/// distance of the pixel's centre from the edge, negative on the outer side. `along` and `across`
+/// are the components, without their signs, of the unit vector at a right angle to the edge.
 inline float coveredByEdge(float inside, float along, float across)
 {
     const float steep = larger(along, across);
     const float flat = smaller(along, across);
     const float depth = std::abs(inside);
-    // An edge near the centre cuts the pixel's two opposite sides, and what it leaves grows evenly
-    // as it goes; farther out it cuts a corner off, a triangle. Without branches, because several
-    // pixels are worked on at once.
+    // This is the area of the smaller of the two parts into which the edge cuts the pixel. An edge
+    // far from the centre cuts off a corner, a triangle. An edge nearer to the centre crosses two
+    // opposite sides: the part is then the largest such triangle and a strip, which grows evenly
+    // towards the centre. There are no branches, so that the compiler can work on several pixels
+    // at once.
     const float corner = smaller(larger(0.5F * (steep + flat) - depth, 0.0F), flat);
     const float triangle = 0.5F * corner * corner / larger(steep * flat, 1e-6F);
     const float beforeCorner = larger(0.5F * (steep - flat) - depth, 0.0F) / larger(steep, 0.5F);
@@ -66,8 +71,8 @@ inline float coveredByEdge(float inside, float along, float across)
     return 0.5F + std::copysign(moreThanHalf, inside);
 }
 
-/// A capsule, ready to be asked for many pixels. Numbers are relative to the pixel in which its
-/// line begins, so that they stay small and exact wherever it lies.
+/// A capsule, with all that is computed once for its many pixels. Its numbers are relative to the
+/// pixel in which its line begins, so that they are small, and exact, wherever the capsule lies.
 class Capsule
 {
 public:
@@ -99,7 +104,8 @@ public:
             coverAs<false>(x, y, pixels);
     }
 
-    /// The part of row `y`, whose columns are [first, last), outside of which nothing is covered.
+    /// Narrows the columns [first, last) of row `y` to those in which pixels may be covered.
+    /// Afterwards `first` is not less than `last` if there are none.
     void narrow(int y, int &first, int &last) const
     {
         const float reach = m_radius + edgeReach;
@@ -118,7 +124,8 @@ public:
         last = std::min(last, m_originX + static_cast<int>(std::floor(right)) + 1);
     }
 
-    /// A part of row `y` inside [first, last) in which every pixel is covered whole; may be empty.
+    /// Narrows the columns [first, last) of row `y` to some in which every pixel is wholly covered.
+    /// Afterwards `first` is not less than `last` if none was found.
     void findInside(int y, int &first, int &last) const
     {
         const float reach = m_radius - edgeReach;
@@ -135,7 +142,7 @@ public:
         };
         addDisc(m_startX, above);
         addDisc(m_startX + m_x, above - m_y);
-        // Between the ends: the disc around the line's own point in this row.
+        // The row crosses the line between its ends, so the disc around that point counts too.
         if (std::abs(m_y) > 1e-3F && above / m_y > 0.0F && above / m_y < 1.0F)
             addDisc(m_startX + m_x * (above / m_y), 0.0F);
         first = std::max(first, m_originX + static_cast<int>(std::ceil(left)));
@@ -181,7 +188,9 @@ private:
     float m_perLengthSquared = 0.0F;
     float m_sideAlong = 0.0F;
     float m_sideAcross = 0.0F;
-    float m_endRecess; // so far an end, which is round, stays behind a straight edge, in the mean
+    // Each pixel is computed as if its edge were straight, but the ends are round. Inside a pixel
+    // the arc lies this far behind the straight edge, on average.
+    float m_endRecess;
 };
 
 void coverSpan(const Capsule &capsule, int x, int y, std::span<std::uint8_t> pixels)
@@ -241,8 +250,8 @@ QRect CoverageMask::addCapsule(Point from, Point to, double radius)
     if (touched.isEmpty())
         return pixels;
     if (to.x < from.x || (to.x == from.x && to.y < from.y))
-        std::swap(from, to); // a line that is drawn back again is the same line
-    constexpr double worthFilling = 4.0; // pixels of radius; below, nothing much is inside
+        std::swap(from, to); // so that both directions of a line give the very same pixels
+    constexpr double worthFilling = 4.0; // pixels; a thinner capsule wholly covers hardly any pixel
     const Capsule capsule(limited(from), limited(to), radius);
     for (int y = touched.y(); y <= touched.bottom(); ++y) {
         int first = touched.x();

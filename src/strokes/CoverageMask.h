@@ -17,23 +17,25 @@ namespace penwick {
 /// Coordinates are pixels; rows are counted upwards, like the canvas's own, and pixel (x, y) is the
 /// square from there to (x + 1, y + 1). A QRect here has its lowest row in y().
 ///
-/// The shape is a union of capsules: a line with a radius around it. Where several cover a pixel it
-/// has the largest of their coverages, so neither their order nor how often one is added nor what
-/// part of the area it is added to can be seen in the result.
+/// The shape is made of capsules; a capsule is all that lies within a radius of a line. A pixel
+/// that several capsules cover has the largest of their coverages. The result therefore depends
+/// neither on the order in which capsules are added, nor on how often one is added, nor on how the
+/// area is divided when only parts of it are painted.
 class CoverageMask
 {
 public:
-    /// Covers `area`, and nothing of it is covered yet.
+    /// Makes this a mask of `area`, in which every pixel has the coverage 0.
     void reset(const QRect &area);
     [[nodiscard]] const QRect &area() const { return m_area; }
 
-    /// The pixels of row `y` from `x` on, `width` of them; all of it inside the area.
+    /// The coverage of `width` pixels of row `y`, from column `x` on. All of them must lie inside
+    /// the area.
     [[nodiscard]] std::span<const std::uint8_t> row(int x, int y, int width) const;
 
-    /// Adds everything within `radius` pixels of the line. Gives the pixels that this may touch,
-    /// inside the area or not.
+    /// Adds everything within `radius` pixels of the line. Returns the pixels that the capsule may
+    /// touch, also those outside the area, which the mask does not hold.
     QRect addCapsule(platform::Point from, platform::Point to, double radius);
-    /// Uncovers the pixels of `part`, which lies inside the area.
+    /// Sets the pixels of `part` back to the coverage 0. `part` must lie inside the area.
     void clear(const QRect &part);
 
 private:
@@ -43,8 +45,8 @@ private:
     std::vector<std::uint8_t> m_coverage; // the lowest row first
 };
 
-/// The pixels that a capsule around the line may touch, and with it whatever lies in the rectangle
-/// between `from` and `to` with that radius around it.
+/// The pixels that a capsule around the line may touch: the rectangle that `from` and `to` span,
+/// grown by the radius. It holds for every other shape inside that grown rectangle too.
 [[nodiscard]] QRect pixelsOfCapsule(platform::Point from, platform::Point to, double radius);
 
 } // namespace penwick

@@ -9,8 +9,8 @@ namespace penwick {
 
 namespace {
 
-/// A premultiplied pixel, every channel times `share` of 255, rounded. Two channels at once: each
-/// has sixteen bits of room.
+/// Multiplies every channel of a premultiplied pixel by `share` / 255, and rounds. Two channels are
+/// computed at once: every second one leaves the sixteen bits that a product needs.
 inline std::uint32_t shareOf(std::uint32_t pixel, std::uint32_t share)
 {
     constexpr std::uint32_t everySecond = 0x00ff00ff;
@@ -24,7 +24,8 @@ inline std::uint32_t shareOf(std::uint32_t pixel, std::uint32_t share)
 
 } // namespace
 
-// Without transparency where there can be none, so that showing it is plain copying.
+// On opaque paper no pixel is ever transparent. A format without alpha is then shown by plain
+// copying, which is faster.
 PixelLayer::PixelLayer(QSize size, const QColor &paper)
     : m_image(
         size, paper.alpha() == 255 ? QImage::Format_RGB32 : QImage::Format_ARGB32_Premultiplied)

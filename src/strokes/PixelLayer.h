@@ -13,11 +13,11 @@ namespace penwick {
 
 class CoverageMask;
 
-/// A picture of part of a canvas, from the canvas's bottom left corner on. What nothing was painted
-/// on shows the paper: a colour, or nothing.
+/// A picture of a canvas, which begins at the canvas's bottom left corner. Where nothing has been
+/// painted it shows the paper, which is a colour or transparent.
 ///
 /// Coordinates are device pixels and rows are counted upwards, as in CoverageMask, so that a pixel
-/// stays the same pixel however the canvas is resized. The alpha is premultiplied.
+/// keeps its coordinates when the canvas is resized. The alpha is premultiplied.
 class PixelLayer
 {
 public:
@@ -30,12 +30,12 @@ public:
     /// The part of image() that shows `area`.
     [[nodiscard]] QRect inImage(const QRect &area) const;
 
-    /// Takes the pixels of `area` from `other`; of what lies outside of either, nothing.
+    /// Copies the pixels of `area` from `other`, as far as `area` lies inside both layers.
     void copy(const PixelLayer &other, const QRect &area);
-    /// Leaves nothing but paper in `area`, which lies inside.
+    /// Fills `area` with paper. `area` must lie inside the layer.
     void clear(const QRect &area);
-    /// Lays `color` over the pixels of `area`, which lies inside both, as far as `mask` covers
-    /// them.
+    /// Lays `color` over each pixel of `area` in the measure in which `mask` covers it. `area` must
+    /// lie inside both the layer and the mask.
     void blend(const CoverageMask &mask, const QColor &color, const QRect &area);
 
 private:

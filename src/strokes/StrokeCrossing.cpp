@@ -17,7 +17,7 @@ namespace {
 using platform::Point;
 using platform::Rect;
 
-constexpr double surelyOnIt = 1e-6; // points behind the edge
+constexpr double surelyOnIt = 1e-6; // points beyond a stroke's edge
 
 double dot(Point a, Point b)
 {
@@ -29,7 +29,8 @@ double cross(Point a, Point b)
     return a.x * b.y - a.y * b.x;
 }
 
-/// A part of a way; none of it at first, and wherever it ends before it begins.
+/// A piece of a way, between two parts as in Way::at(). It is empty where it ends before it begins,
+/// as a new Span does.
 struct Span
 {
     double begin = std::numeric_limits<double>::infinity();
@@ -46,7 +47,7 @@ struct Span
 
 constexpr Span wholeWay { 0.0, 1.0 };
 
-/// Of `span`, where start + part * slope lies from `lowest` to `highest`.
+/// The piece of `span` in which start + part * slope lies between `lowest` and `highest`.
 Span within(Span span, double start, double slope, double lowest, double highest)
 {
     if (slope == 0.0)
@@ -63,7 +64,7 @@ Span spanOnDisc(const Way &way, Point centre, double radius)
     const Point start = way.from - centre;
     const double square = dot(direction, direction);
     const double toNearest = -dot(start, direction) / square;
-    const double away = cross(start, direction); // times the way's length
+    const double away = cross(start, direction); // the centre's distance, times the way's length
     const double halfSquare = radius * radius * square - away * away;
     if (halfSquare < 0.0)
         return {};
@@ -71,7 +72,8 @@ Span spanOnDisc(const Way &way, Point centre, double radius)
     return { std::max(0.0, toNearest - half), std::min(1.0, toNearest + half) };
 }
 
-/// Where the way is at most `radius` from the line but beside neither of its ends.
+/// The piece of the way inside the rectangle that reaches `radius` to both sides of the line; the
+/// round ends are no part of it.
 Span spanBesideLine(const Way &way, const StrokeLine &line, double radius)
 {
     const Point lineDirection = line.to - line.from;
@@ -85,7 +87,8 @@ Span spanBesideLine(const Way &way, const StrokeLine &line, double radius)
     return within(along, cross(unit, start), cross(unit, direction), -radius, radius);
 }
 
-/// A thick line with round ends is convex: what a way has of it is in one piece.
+/// The piece of the way on a thick line with round ends. There is only one, because that shape is
+/// convex: a straight way enters and leaves it at most once.
 Span spanOnLine(const Way &way, const StrokeLine &line, double radius)
 {
     Span span;
@@ -103,7 +106,8 @@ bool isApart(const Rect &area, const StrokeLine &line)
         || std::min(line.from.y, line.to.y) > area.maxY();
 }
 
-/// The beginning of the first span on which the stroke surely lies.
+/// The first place on `spans` for which strokeContains() holds as well. Each span is tried just
+/// behind its beginning and, because rounding may still deny that place, in its middle.
 std::optional<double> firstOn(
     const Way &way, const platform::BezierPath &path, std::vector<Span> spans)
 {
@@ -137,7 +141,8 @@ Meeting meetingOn(const Way &way, const platform::BezierPath &path)
         return {};
     const double length = way.length();
     const double radius = path.lineWidth() / 2;
-    // A little wider than need be: only a short cut, it must not decide at the very edge.
+    // The rectangle only saves the work for lines that are far away. It is a little too wide, so
+    // that rounding at its border never loses a line that is met.
     const Rect area = Rect::spanning(way.from, way.to).grownBy(radius + surelyOnIt);
     Meeting meeting;
     std::vector<Span> spans;

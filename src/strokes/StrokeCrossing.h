@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where a pointer that goes straight on comes upon a stroke.
+// Where a pointer that moves in a straight line meets a stroke.
 #pragma once
 
 #include <penwick/platform/Geometry.h>
@@ -19,17 +19,17 @@ struct Way
     platform::Point to;
 
     [[nodiscard]] double length() const;
-    /// 0 is where it begins, 1 where it ends.
+    /// The point at `part` of the way: 0 is its beginning, 1 its end.
     [[nodiscard]] platform::Point at(double part) const;
 };
 
 /// How a pointer meets a stroke on its way.
 struct Meeting
 {
-    /// How far along the way strokeContains() first holds for its points, or did at its beginning;
-    /// a millionth of a point is added, so that it surely holds there. Nothing where the stroke is
-    /// not met, where it is met only at the end or for less than can be told, and for a way
-    /// without length.
+    /// The first part of the way, as in Way::at(), at which strokeContains() holds. A way may begin
+    /// on the stroke. Up to a millionth of a point is added, so that rounding cannot put the place
+    /// just outside the stroke. Empty where the way misses the stroke, meets it only at its end or
+    /// for too short a piece to be sure of, or has no length.
     std::optional<double> part;
     bool isAtEnd = false; ///< whether strokeContains() holds at the end
 };

@@ -33,9 +33,10 @@ double squaredDistance(Point point, const StrokeLine &line)
 bool strokeContains(const platform::BezierPath &path, Point point)
 {
     if (path.lineWidth() <= 0.0)
-        return false; // it leaves no mark either
+        return false; // a path without thickness leaves no mark on the canvas either
     const double radius = path.lineWidth() / 2;
-    // One point wider than need be: only a short cut, it must not decide at the very edge.
+    // The bounds only save the work for points that are far away. They are one point too wide, so
+    // that rounding at their border never loses a hit.
     if (!path.controlPointBounds().grownBy(radius + 1).contains(point))
         return false;
     return visitLines(path,

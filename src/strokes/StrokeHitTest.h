@@ -12,10 +12,9 @@ namespace penwick {
 
 struct StrokeLine;
 
-/// Whether `point` is at most half the path's line width away from its centre line, round ends and
-/// joins included; exactly half is a hit. A line to where it began is a dot and has ends; a path
-/// without lines and curves is hit nowhere.
-/// Cheap enough to be asked of every stroke on every pointer event.
+/// Whether `point` is at most half the path's line width away from its centre line; exactly half is
+/// a hit. Ends and joins are round. A line that ends where it began is a dot, round as well; a path
+/// without lines and curves is hit nowhere. A point far away is answered from the path's bounds.
 [[nodiscard]] bool strokeContains(const platform::BezierPath &path, platform::Point point);
 
 /// The same for one line of a stroke that is twice `radius` thick.

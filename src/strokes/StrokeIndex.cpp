@@ -30,7 +30,7 @@ using TreeBox = geometry::model::box<TreePoint>;
 
 constexpr std::size_t strokesOfANode = 16;
 constexpr double longestPiece = 64.0; // points
-constexpr double mostPieces = 1000.0; // however far a pointer claims to have gone
+constexpr double mostPieces = 1000.0; // bounds the work for two events that are very far apart
 
 // Rounded outwards: the tree may find a stroke too many, never one too few.
 float below(double value)
@@ -91,7 +91,8 @@ EntryListChange StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
         remove(change.first, change.first + change.removed);
         return change;
     }
-    // The newest has no place, because it may grow; and numbers are given in the list's order.
+    // Everything behind the change is numbered anew, so that numbers rise from old to new. The
+    // newest stroke gets no number, because it may still grow.
     const int wanted = std::max(0, strokes.size() - 1);
     const int present = static_cast<int>(m_places.size());
     remove(std::min({ change.first, wanted, present }), present);
@@ -113,7 +114,7 @@ void StrokeIndex::insert(int from, int to)
     for (int index = from; index < to; ++index)
         m_places.push_back({ boundsOf(m_strokes[index]), m_nextNumber++ });
     if (from == 0 && to > 0) {
-        m_tree->places = Tree::Places(m_places); // all at once makes the better tree, and sooner
+        m_tree->places = Tree::Places(m_places); // faster than one by one, and a better tree
         return;
     }
     m_tree->places.insert(m_places.begin() + from, m_places.end());
@@ -145,7 +146,8 @@ std::optional<int> StrokeIndex::oldestAt(Point point) const
     return oldest;
 }
 
-// A long way has little in common with the one rectangle around it, so it is taken in pieces.
+// The one rectangle around a long slanting way may hold many strokes that are nowhere near the way.
+// The rectangles around its pieces hold far fewer.
 std::vector<int> StrokeIndex::near(const Way &way) const
 {
     const double wanted = std::ceil(way.length() / longestPiece);

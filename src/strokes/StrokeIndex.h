@@ -19,25 +19,27 @@ namespace penwick {
 /// Where a pointer meets strokes on its way.
 struct Meetings
 {
-    /// Where each is met first, in the order of the way; of strokes that are met at once the oldest
-    /// comes first. Without what is met only at the end.
+    /// For each stroke the place where the pointer first meets it, in the order in which it comes
+    /// to them; where it meets several at once the oldest comes first. Strokes that it meets only
+    /// at the end of its way are left out.
     std::vector<platform::Point> places;
     bool isAtEnd = false; ///< whether a stroke lies at the end
 };
 
 /// Finds the strokes of a list by place, without asking each of them.
 ///
-/// Follows a list: it has to be told of every change but the growth of the newest stroke, which is
-/// the only one that may grow. Small next to the strokes themselves. GUI thread only.
+/// The index must be told of every change of the list but one: the newest stroke may grow without a
+/// word. No other stroke may grow. The index takes little memory next to the strokes themselves.
+/// GUI thread only.
 class StrokeIndex
 {
 public:
     StrokeIndex();
     ~StrokeIndex();
 
-    /// The list as it was last told.
+    /// The list that follow() was last given.
     [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_strokes; }
-    /// Takes `strokes` for the list from now on; gives what has changed.
+    /// Takes `strokes` as the list from now on. Returns how it differs from the list before.
     EntryListChange follow(const EntryList<StrokeEntry> &strokes);
 
     /// The index of the oldest stroke that `point` lies on.
@@ -48,8 +50,8 @@ public:
     [[nodiscard]] std::vector<int> touching(const platform::Rect &area) const;
 
 private:
-    // A stroke's place in the tree. It has a number of its own because indices move when a stroke
-    // goes; numbers keep the order.
+    // A stroke as the tree knows it. The tree cannot know it by its index, which changes when an
+    // older stroke is removed. The number never changes, and numbers rise from old to new.
     struct Bounds
     {
         float left, bottom, right, top;
@@ -69,7 +71,8 @@ private:
     void visit(const platform::Rect &area, Visit visit) const;
 
     EntryList<StrokeEntry> m_strokes;
-    // Of all strokes but the newest, which may grow. A deque has no room to spare.
+    // One for each stroke but the newest, which may still grow. It is a deque because a vector may
+    // reserve twice the memory that it needs.
     std::deque<Place> m_places;
     std::uint32_t m_nextNumber = 0;
     std::unique_ptr<Tree> m_tree;

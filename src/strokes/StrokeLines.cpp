@@ -13,7 +13,7 @@ using platform::Point;
 
 // How far the chords that stand for a curve may lie from it, in points: well below a pixel.
 constexpr double curveTolerance = 0.01;
-constexpr double mostChords = 10'000.0; // whatever the coordinates, an answer comes in time
+constexpr double mostChords = 10'000.0; // bounds the work, however large the coordinates
 
 double dot(Point a, Point b)
 {

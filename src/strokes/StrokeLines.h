@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A path as the straight lines that it is painted and hit by.
+// A path as straight lines, from which it is painted and searched for hits.
 #pragma once
 
 #include <penwick/platform/BezierPath.h>
@@ -15,12 +15,12 @@ struct StrokeLine
     platform::Point to;
 };
 
-/// All lines of `path`, in order, for a path that is no chain; chords stand for its curves, and lie
-/// closer to them than anybody can see.
+/// All lines of `path`, in order. Instead of each curve it gives chords that are closer to the
+/// curve than anybody can see. For a chain use visitLines(), which makes no list.
 [[nodiscard]] std::vector<StrokeLine> linesOf(const platform::BezierPath &path);
 
-/// Hands the lines of `path` to `visit`, in order, until it returns true; whether it did. The first
-/// `skipped` lines of a chain are left out.
+/// Calls `visit` with each line of `path`, in order, until `visit` returns true; returns whether it
+/// did. If `path` is a chain, its first `skipped` lines are left out.
 template <class Visit>
 bool visitLines(const platform::BezierPath &path, Visit visit, std::size_t skipped = 0)
 {

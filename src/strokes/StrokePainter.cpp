@@ -44,7 +44,7 @@ QRect addStroke(
 {
     const BezierPath &path = *stroke.bPath;
     if (path.lineWidth() <= 0.0)
-        return {}; // whoever asked for a line without thickness gets one that cannot be seen
+        return {}; // a path without thickness leaves no mark
     const double radius = radiusOf(path, scale);
     QRect touched;
     const auto add = [&](const StrokeLine &line) {

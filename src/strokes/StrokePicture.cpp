@@ -14,7 +14,7 @@ namespace {
 // Layers are a little larger than the canvas, so that resizing it by hand seldom needs new ones.
 constexpr int layerStep = 64; // pixels
 
-// More changes than this at once are painted as one area.
+// If more strokes than this come or go at once, the one rectangle around them all is painted.
 constexpr int mostApart = 16;
 
 QSize roundedUp(QSize size)
@@ -66,7 +66,7 @@ void StrokePicture::followChange(
     if (isNewestNew)
         --lastCome;
     mark(strokes(), change.first, lastCome);
-    // Whoever has no colour takes the one before it, and that may be another now.
+    // A stroke without a colour takes the colour of one before it, which may be another one now.
     if (lastCome < strokes().size() && !strokes()[lastCome].bPathParams.pathColor)
         m_marked = m_finished.area();
     if (isNewestNew)
@@ -126,7 +126,7 @@ QRect StrokePicture::addGrowth()
     const int elements = newest.bPath->elementCount();
     if (elements == m_newestElements)
         return {};
-    if (!m_isNewestApart) { // it had been settled, and goes on all the same
+    if (!m_isNewestApart) { // it was painted with those below, but is growing again
         mark(strokes(), strokes().size() - 1, strokes().size());
         takeNewestApart();
     }

@@ -14,15 +14,17 @@ namespace penwick {
 
 /// What a list of strokes looks like, oldest first, each one shape in its colour.
 ///
-/// Painting copies finished pixels. A segment more of the newest stroke costs what the segment
-/// covers; so does taking the newest stroke back, once, by the stroke. Any other stroke that comes
-/// or goes costs the strokes that touch the rectangle around it, and finding it in the list. The
-/// pixels are those of painting everything anew. GUI thread only.
+/// The pixels are kept, and mended where the list changes; they are always the very pixels that
+/// painting everything anew would give. A further segment of the newest stroke costs the pixels
+/// that it covers. Removing the newest stroke costs the pixels around it, as long as it is still
+/// kept apart from those below. Adding or removing any other stroke costs the search for it in the
+/// list, and painting every stroke that touches the rectangle around it. GUI thread only.
 class StrokePicture
 {
 public:
-    /// Takes `strokes` for what is to be seen. To be told of every change, the growth of the newest
-    /// stroke included; no other may grow. Gives the pixels that such growth has changed.
+    /// Takes `strokes` as the list to be shown. It must be called after every change, the growth of
+    /// the newest stroke included; no other stroke may grow. Returns the pixels that this growth
+    /// has changed.
     QRect follow(const EntryList<StrokeEntry> &strokes);
 
     /// Brings the pixels up to date for a canvas of `size` device pixels with `scale` pixels a
@@ -52,14 +54,14 @@ private:
     double m_scale = 0.0; // pixels a point
     QColor m_paper = Qt::transparent;
     PixelLayer m_finished;
-    QRegion m_marked; // where strokes came or went since they were painted
+    QRegion m_marked; // to be painted anew, because strokes came or went there
 
     // While the newest stroke grows it is kept apart: its coverage, and what lies below it.
     bool m_isNewestApart = false;
     PixelLayer m_below;
     CoverageMask m_newest;
-    QRect m_newestArea; // what m_newest covers
-    int m_newestElements = 0; // so much of the newest stroke is painted
+    QRect m_newestArea; // outside of it m_newest covers nothing
+    int m_newestElements = 0; // how many elements of the newest stroke's path are painted
 
     CoverageMask m_scratch;
 };
