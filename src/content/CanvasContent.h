@@ -22,8 +22,8 @@ class TnTextBox; // a widget: history keeps it alive and never looks inside
 struct Path
 {
     std::optional<platform::Point> startPoint; ///< where the next segment begins
-    std::optional<platform::Point> endPoint; ///< always empty; part of the record nevertheless
-    std::optional<QColor> pathColor; ///< alpha already applied; empty: the current stroke colour
+    std::optional<platform::Point> endPoint; ///< never set; kept as a part of the record
+    std::optional<QColor> pathColor; ///< alpha already applied; empty: that of an older stroke
 };
 
 /// One freehand stroke. The thickness is the path's own line width.
@@ -31,20 +31,21 @@ struct StrokeEntry
 {
     std::shared_ptr<platform::BezierPath> bPath;
     Path bPathParams;
-    std::int64_t pathId = 0; ///< the path's hash, taken once
+    std::int64_t pathId = 0; ///< the path's hash()
 };
 
 /// One text box.
 struct TextBoxEntry
 {
-    std::int64_t textId = 0; ///< the box's hash, taken once
+    std::int64_t textId = 0; ///< the box's hash()
     std::shared_ptr<TnTextBox> textBox;
 };
 
 /// The two arrays of a canvas, each oldest first: the drawing order.
 ///
-/// They are values: whoever changes one changes a copy and assigns it. This is how a canvas's
-/// history sees its model; the model keeps the assignments from everybody else.
+/// They are values: whoever changes one changes a copy and assigns it. The history of a canvas
+/// assigns them through this class; the model, which derives from it, hides the setters from all
+/// others.
 class CanvasContent
 {
 public:

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // An array that is a value and cheap to copy.
-// The canvas view takes a copy of the content on every pointer event; that must not cost more as
-// the drawing grows, and the copy must keep what it was while the original goes on.
+// The canvas view takes a copy of the content on every pointer event. That must not cost more as
+// the drawing grows, and a copy must not change when the original does.
 #pragma once
 
 #include "platform/foundation/FatalError.h"
@@ -19,8 +19,8 @@ namespace penwick {
 /// An array whose copies share what they have in common.
 ///
 /// Copying, append(), removeLast() and changing the last entry cost the same at every length,
-/// whether or not copies are alive; removeAt() in the middle costs a walk over the list, and so
-/// does the first append() after a removal whose removed entries a copy still shows.
+/// whether or not copies are alive. removeAt() in the middle costs a walk over the list, and so
+/// does the first append() after a removeLast() if a copy still has the removed entry.
 ///
 /// All entries but the last live in a store that copies share and that only grows while it is
 /// shared; a list sees its first m_settledCount entries. The last one is held by the list itself,
@@ -94,8 +94,8 @@ public:
     [[nodiscard]] Iterator begin() const { return { this, 0 }; }
     [[nodiscard]] Iterator end() const { return { this, size() }; }
 
-    /// How many entries at the front this list and `other` are known to have in common, without a
-    /// look at them; there may be more.
+    /// How many entries, from the first on, this list and `other` surely have in common, because
+    /// they share a store. The entries are not compared, so more of them may be equal.
     [[nodiscard]] int sharedStart(const EntryList &other) const
     {
         return m_settled == other.m_settled ? std::min(m_settledCount, other.m_settledCount) : 0;

@@ -21,8 +21,8 @@ struct EntryListChange
 };
 
 /// The smallest change that makes `before` into `after`; `same` tells whether two entries are the
-/// same one. What both lists share is not looked at, so after an append() or a removeLast() this
-/// costs nothing.
+/// same one. Entries in a store that both lists share are not compared, so after an append() or a
+/// removeLast() the cost does not grow with the list.
 template <class T, class Same>
 [[nodiscard]] EntryListChange changeBetween(
     const EntryList<T> &before, const EntryList<T> &after, Same same)
