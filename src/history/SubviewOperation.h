@@ -12,7 +12,7 @@ namespace penwick {
 /// Which subviews of the canvas are to leave it. A canvas without subviews ignores every case.
 struct SubviewOperation
 {
-    /// The spelling of the cases is fixed, the lower case of the last three included.
+    /// The spelling of the cases is fixed, the small letters inside the last three included.
     enum class Case
     {
         removeWithId, ///< the first text box whose hash is `identifier`; none if none matches

@@ -15,7 +15,8 @@ namespace penwick {
 
 namespace {
 
-// So many undo steps in a row, or undone records, are offered to the user.
+// After this many undo steps in a row the undo button is disabled. With more undone records than
+// this the state of the redo button is no longer posted.
 constexpr int offeredSteps = 5;
 
 void post(const QString &name, const QVariant &object = QVariant())
@@ -124,7 +125,7 @@ void UndoRedoManager::setUndoStack(RecordStack stack)
 
 void UndoRedoManager::pushUndo(const UndoRedoState &record)
 {
-    m_undoStack.append(record); // never empty then: the rule has nothing to post
+    m_undoStack.append(record); // not empty any more, so there is nothing to post
 }
 
 void UndoRedoManager::popUndo()
@@ -170,7 +171,7 @@ void UndoRedoManager::setUndoCount(std::int64_t count)
 
 CanvasContent &UndoRedoManager::requireContent() const
 {
-    // A plain reference will do: the command keeps the content alive.
+    // A plain reference is safe: undoAction() and redoAction() keep the content alive.
     return *platform::require(m_drawingCanvasModel.lock(), "the history's canvas model is gone");
 }
 
@@ -178,7 +179,7 @@ void UndoRedoManager::undoAction()
 {
     if (m_undoStack.isEmpty())
         return;
-    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and with it, this history
+    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and this history, which it owns
     if (m_undoCount == std::numeric_limits<std::int64_t>::max())
         platform::fatalError("the number of undo steps overflows");
     setUndoCount(m_undoCount + 1);
@@ -211,7 +212,8 @@ void UndoRedoManager::undoDraw(const UndoRedoState &record)
 
 void UndoRedoManager::undoErase(const UndoRedoState &record)
 {
-    // At the end, not where it was: what comes back lies on top of what was drawn meanwhile.
+    // The element comes back at the end of its array, not at its old place, and so lies on top of
+    // what was drawn meanwhile.
     appendElement(requireContent(), record.element);
     pushRedo(record);
     popUndo();
@@ -238,7 +240,7 @@ void UndoRedoManager::redoAction()
 {
     if (m_redoStack.isEmpty())
         return;
-    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and with it, this history
+    const auto aliveUntilDone = m_drawingCanvasModel.lock(); // and this history, which it owns
     setUndoCount(0);
 
     const UndoRedoState record = m_redoStack.last();
@@ -286,7 +288,8 @@ void UndoRedoManager::redoClear()
 
 void UndoRedoManager::redoClearOf(const UndoRedoState &record)
 {
-    // By position, not by identifier: undo put the group at the end in this very order.
+    // The entry is found by its position at the end, not by its identifier: undoing the clear
+    // appended the entries in the order in which it pushed these records.
     CanvasContent &content = requireContent();
     if (isStroke(record) && !content.pathArray().isEmpty()) {
         removeLastStroke(content);

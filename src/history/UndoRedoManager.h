@@ -13,8 +13,8 @@ namespace penwick {
 ///
 /// It never paints. It posts, on the default notification centre and before the call returns,
 /// which button is to be enabled, which text box is to leave the canvas and that the content is to
-/// be shown again; see NotificationNames.h. Each assignment to a property runs that property's
-/// rule exactly once, and a push or a pop is an assignment. GUI thread only.
+/// be shown again; see NotificationNames.h. Each assignment to a property posts, exactly once, what
+/// the property's setter says; a push or a pop is such an assignment. GUI thread only.
 class UndoRedoManager final
 {
 public:
@@ -22,19 +22,19 @@ public:
     UndoRedoManager(const UndoRedoManager &) = delete;
     UndoRedoManager &operator=(const UndoRedoManager &) = delete;
 
-    /// The content to replay on. Held weakly: the content owns its history. A command that needs
-    /// it and finds it gone is a fatal error.
+    /// The content that undo and redo change. Held weakly, because the content owns its history. A
+    /// command that needs the content and finds it gone is a fatal error.
     [[nodiscard]] std::shared_ptr<CanvasContent> drawingCanvasModel() const
     {
         return m_drawingCanvasModel.lock();
     }
     void setDrawingCanvasModel(std::weak_ptr<CanvasContent> model);
 
-    /// What can be undone, however often: the limit of five lives in the button state alone.
+    /// What can be undone. The stack has no limit: only the button is disabled after five steps.
     [[nodiscard]] const RecordStack &undoStack() const { return m_undoStack; }
     /// Posts {"enableUndo": false} for an empty stack, before it is stored.
     void setUndoStack(RecordStack stack);
-    /// The assignment of the stack grown by `record`, at a cost that does not grow with it.
+    /// Assigns the stack with `record` added, at a cost that does not depend on its length.
     void pushUndo(const UndoRedoState &record);
 
     /// What can be redone.
@@ -49,9 +49,8 @@ public:
     /// stored.
     void setUndoCount(std::int64_t count);
 
-    /// Takes back the newest record, or the whole group of clear records on top. Nothing on an
-    /// empty stack. A record of kind undo or redo stays where it is and prints
-    /// "Undo Not Available!".
+    /// Takes back the newest record, or the whole group of clear records on top. Does nothing on an
+    /// empty stack. For a record of kind undo or redo it only prints "Undo Not Available!".
     void undoAction();
 
     /// Does the newest undone record, or group of clear records, again. As undoAction() otherwise,

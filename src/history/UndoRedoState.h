@@ -10,7 +10,7 @@
 
 namespace penwick {
 
-/// What a record says was done. The order of the cases is their stored code.
+/// What was done. The cases' numbers are fixed, so their order must stay.
 enum class ActionType
 {
     draw, ///< a stroke or a text box was added
