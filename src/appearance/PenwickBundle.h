@@ -8,9 +8,9 @@
 
 namespace penwick {
 
-/// The component's bundle; null until the first entry object was made. GUI thread only.
+/// The component's bundle; null until the first Penwick object was made. GUI thread only.
 [[nodiscard]] const std::shared_ptr<platform::Bundle> &penwickBundle();
-/// Replaces it; every new entry object does.
+/// Replaces the bundle, as every new Penwick object does.
 void setPenwickBundle(std::shared_ptr<platform::Bundle> bundle);
 
 } // namespace penwick

@@ -11,12 +11,12 @@
 
 namespace penwick {
 
-// Constants of the compiler throughout: the library makes none of them as it is loaded, and none
-// is ever made twice.
+// All of these are constants at compile time and inline: loading the library runs no code for them,
+// and the library holds each only once.
 
 namespace ColorParts {
 inline constexpr ushort full = 0xFFFF;
-/// Alphas as QColor counts them when it is given a fraction.
+/// 0.3, 0.4 and 0.8 of `full`, rounded as QColor::setAlphaF() rounds them.
 inline constexpr ushort alpha030 = 19661;
 inline constexpr ushort alpha040 = 26214;
 inline constexpr ushort alpha080 = 52428;

@@ -8,8 +8,9 @@
 
 namespace penwick {
 
-/// A new cursor of the bundle's image called `cursor_type`, with the hot spot of the four tool
-/// cursors, (0, 0) for any other image. Without a bundle or without that image the process stops.
+/// A new cursor with the bundle's image called `cursor_type`. Its hot spot is that of CursorHotspot
+/// for the four tool cursors, (0, 0) for any other image. Without a bundle or without that image
+/// the process stops.
 [[nodiscard]] platform::Cursor getCursorOfType(const QString &cursor_type);
 
 } // namespace penwick

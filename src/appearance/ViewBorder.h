@@ -10,8 +10,8 @@ namespace platform {
 class View;
 }
 
-/// Gives `view`'s layer that border; widths and radii in points. A view without a layer stays as
-/// it is: who wants a border asks for a layer first.
+/// Gives the layer of `view` a border; width and radius in points. A view without a layer stays as
+/// it is: whoever wants a border calls setWantsLayer() first.
 void setViewBorder(
     platform::View &view, const QColor &borderColor, double borderWidth, double borderRadius);
 
