@@ -159,7 +159,7 @@ void DrawViewController::createTextBoxOnCanvas(Point)
     const auto &boxes = canvas().textBoxArray();
     if (boxes.isEmpty())
         platform::fatalError("the canvas has no text box to show");
-    // All of it: the box hangs below the point that was clicked.
+    // The whole box is marked, not the clicked point: the box lies below that point.
     canvas().setNeedsDisplay(boxes.last().textBox->frame());
 }
 

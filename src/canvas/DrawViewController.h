@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where the outside reaches a canvas: tools, options, text boxes and the history's notifications.
+// The controller of a canvas: tools, options, text boxes and the history reach the canvas by it.
 #pragma once
 
 #include "canvas/DrawingCanvasDelegate.h"
@@ -26,8 +26,8 @@ class UndoRedoManager;
 
 /// Joins canvas, model, history and tool bar of one drawing window.
 ///
-/// Canvas and model are there for the whole life of a loaded window; an operation that needs one
-/// that is not there stops the process. Several spellings are fixed.
+/// Canvas and model are there for the whole life of a loaded window; an operation that misses one
+/// of them stops the process. Some names are misspelt, and are fixed so.
 class DrawViewController final : public platform::ViewController,
                                  public DrawingCanvasDelegate,
                                  public ToolSelectionDelegate,
@@ -39,12 +39,13 @@ public:
     DrawViewController();
     ~DrawViewController() override;
 
-    /// What the scene connects; weak.
+    // What the loading of a scene connects. The two views are held weakly.
     void setDrawingView(DrawingCanvasView *view);
     [[nodiscard]] platform::ImageView *annotatedImageView() const { return m_annotatedImageView; }
     void setAnnotatedImageView(platform::ImageView *view) { m_annotatedImageView = view; }
     void setDrawingCanvasModel(std::shared_ptr<DrawingCanvasModel> model);
-    /// The drawing window, for whoever sets it: nothing here does, or asks. Weak.
+    /// A place in which others may keep the drawing window; the controller neither sets nor uses
+    /// it. Weak.
     [[nodiscard]] platform::Window *drawingWindow() const;
     void setDrawingWindow(platform::Window *window);
 

@@ -11,8 +11,8 @@ namespace penwick {
 class DrawingCanvasModel;
 class DrawingCanvasView;
 
-/// The controller of a canvas, as the canvas sees it. Implemented by a QObject that is the owner of
-/// the text boxes too. Points are in the canvas's coordinates.
+/// The controller of a canvas, as the canvas sees it. Implemented by a QObject that is the
+/// TextBoxDelegate of the canvas's text boxes too. Points are in the canvas's coordinates.
 class DrawingCanvasDelegate
 {
 public:

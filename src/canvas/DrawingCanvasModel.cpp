@@ -40,7 +40,7 @@ UndoRedoManager &DrawingCanvasModel::requireHistory() const
 void DrawingCanvasModel::record(const UndoRedoState &state)
 {
     UndoRedoManager &history = requireHistory();
-    // Once something new is done after a clear, what it removed can no longer be brought back.
+    // Once something new is done after a clear, the clear can no longer be undone.
     const RecordStack &done = history.undoStack();
     if (!done.isEmpty() && done.last().actionAssociated == ActionType::clear)
         history.setUndoStack({});
@@ -123,7 +123,8 @@ void DrawingCanvasModel::createTextBox(
     boxes.append(entry);
     setTextBoxArray(std::move(boxes));
     record({ entry, ActionType::draw, entry.textId });
-    m_strokeIndex.follow(pathArray()); // strokes that this made the history forget are free to go
+    // record() may have made the history forget strokes; the index must not keep them alive.
+    m_strokeIndex.follow(pathArray());
 }
 
 void DrawingCanvasModel::deleteTextBoxWith(std::int64_t hashValue)
@@ -149,7 +150,7 @@ void DrawingCanvasModel::clearCanvas()
         history.pushUndo({ entry, ActionType::clear, entry.textId });
     history.setUndoCount(0);
     setPathArray({});
-    m_strokeIndex.follow(pathArray()); // so that it keeps nothing alive
+    m_strokeIndex.follow(pathArray()); // so that the index keeps no stroke alive
     setTextBoxArray({});
 }
 

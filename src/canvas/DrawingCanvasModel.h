@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The one truth about what is on a canvas.
+// What is on a canvas; the view only has copies of it.
 #pragma once
 
 #include "content/CanvasContent.h"
@@ -42,25 +42,27 @@ public:
     void createPathWithParam(
         const QColor &pathColor, double pathThickNess, platform::Point startPoint);
 
-    /// Extends the newest stroke by one segment, a sub-path of its own. Nothing without strokes.
+    /// Extends the newest stroke by one segment, a sub-path of its own. Does nothing if there is no
+    /// stroke.
     void updateTheCurrentPath(platform::Point currentPoint);
 
     /// Erases the oldest stroke that the point lies on; false if there is none.
     bool performEraseOperationAtLocation(platform::Point eraseLocation);
 
-    /// Where an eraser that goes straight on comes upon strokes on its way.
+    /// Where an eraser that moves along `way` meets strokes.
     [[nodiscard]] Meetings strokesMetOn(const Way &way);
 
-    /// Adds a text box, but to no view. What could be redone stays so, unlike after a stroke.
-    /// `delegate` must be a TextBoxDelegate (else the process stops); the box borrows it.
+    /// Adds a text box to the content; the caller adds it to a view. Unlike a new stroke, a new box
+    /// leaves what can be redone as it is. `delegate` must be a TextBoxDelegate (else the process
+    /// stops); the box borrows it.
     void createTextBox(platform::Point textBoxLocation, const QColor &fontColor, double fontSize,
         QObject *delegate);
 
-    /// Drops the first text box of that hash and records it, leaving the undo count and what could
-    /// be redone alone. Nothing for an unknown hash. The box's view stays where it is.
+    /// Removes the first text box with that hash and records it; the undo count and what can be
+    /// redone stay as they are. Does nothing for an unknown hash. The box stays in its view.
     void deleteTextBoxWith(std::int64_t hashValue);
 
-    /// Drops everything. Only this can be undone afterwards, never what came before it.
+    /// Removes everything. Afterwards only the clearing itself can be undone, nothing before it.
     void clearCanvas();
 
 private:
@@ -73,7 +75,7 @@ private:
     void forgetWhatCouldBeRedone();
 
     std::shared_ptr<UndoRedoManager> m_undoRedoManager;
-    StrokeIndex m_strokeIndex; // brought up to date before it is asked or a stroke grows
+    StrokeIndex m_strokeIndex; // follow() is called before it is asked and before a stroke grows
 };
 
 } // namespace penwick

@@ -50,7 +50,8 @@ void DrawingCanvasView::setPathArray(const EntryList<StrokeEntry> &strokes)
     m_hasDroppedEntry = false;
 }
 
-// The controller marks what a segment needs; the smooth edge of a hairline reaches farther.
+// For a new segment the controller marks an area that is as wide as the line on each side. The
+// smooth edge of a very thin line reaches farther than that, so its pixels are marked here.
 void DrawingCanvasView::markHairline(const QRect &pixels)
 {
     const double scale = QWidget::devicePixelRatioF();
@@ -70,7 +71,7 @@ void DrawingCanvasView::setTextBoxArray(const EntryList<TextBoxEntry> &boxes)
 void DrawingCanvasView::setLastSelecedTool(const QString &tool)
 {
     m_lastSelecedTool = tool;
-    m_toolBeforeEraserEnd.clear(); // somebody has chosen
+    m_toolBeforeEraserEnd.clear(); // the choice stays when the pen's tip is put down
 }
 
 DrawingCanvasDelegate *DrawingCanvasView::drawingCanvasDelegate() const
@@ -93,14 +94,16 @@ DrawingCanvasModel &DrawingCanvasView::model() const
     return *require(controller().drawingCanvasModel(), "the canvas's controller has no model");
 }
 
-// With the text tool a click that trembles would else end the editing and begin a new box at once.
+// With the text tool, a click with a trembling hand must not count as a drag: the drag would end
+// the editing of a box, and the release would at once begin a new one.
 double DrawingCanvasView::dragDistance() const
 {
     return m_currentSelectedTool == Tools::text ? QGuiApplication::styleHints()->startDragDistance()
                                                 : 0.0;
 }
 
-// The toolkit tells the application alone which end comes near; here the press tells.
+// The toolkit tells the application object alone, which is the host's, which end of a pen comes
+// near. The canvas learns of the end only when it is put down.
 void DrawingCanvasView::followPenEnd(platform::PenEnd end)
 {
     if (end == platform::PenEnd::Tip && !m_toolBeforeEraserEnd.isEmpty()) {
@@ -128,7 +131,7 @@ void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
     followPenEnd(event.penEnd);
     if (ownWindow.isKeyWindow() && m_popoverWindow) {
         m_popoverWindow->orderOut();
-        m_currentSelectedTool = m_lastSelecedTool; // a colour that was not chosen is given up
+        m_currentSelectedTool = m_lastSelecedTool; // the user has not chosen a colour after all
     }
     if (m_currentSelectedTool != Tools::brush)
         return;
@@ -144,8 +147,8 @@ void DrawingCanvasView::beginStroke()
     model().createPathWithParam(color, m_brushThickness, m_startPoint);
 }
 
-// The pointer in the top row of pixels is said to be at the top edge, which is no part of a
-// rectangle.
+// A pointer in the top row of pixels has the y of the canvas's top edge, which Rect::contains()
+// does not count as inside.
 bool DrawingCanvasView::isOver(Point point) const
 {
     const platform::Rect area = bounds();
@@ -162,9 +165,10 @@ void DrawingCanvasView::mouseDragged(const platform::MouseEvent &event)
         dragTo(point);
 }
 
-// However fast the eraser is, each stroke on its way gets an event of its own. Those that the
-// events took are not there to be met again. Answers whether something lies at the end, which then
-// is for the pointer's own event; so an eraser that meets nothing asks but once.
+// However fast the eraser moves, it erases each stroke that its way crosses, at the place where it
+// meets the stroke. Only the oldest stroke at a place is erased, so the way is searched again until
+// no stroke is met or none goes any more. Returns whether a stroke lies at the end of the way,
+// which is left to the caller.
 bool DrawingCanvasView::dragEraserTo(Point point)
 {
     const Way way { std::exchange(m_eraserPlace, point).value_or(point), point };
@@ -237,8 +241,9 @@ void DrawingCanvasView::endStroke(Point point)
     setNeedsDisplay();
 }
 
-// The model keeps the click's empty stroke. The copy here may not have had it yet, and then what
-// is dropped is an earlier stroke: that one must not vanish, so draw() takes the arrays anew.
+// The model keeps the empty stroke that a click without a drag has begun. The copy here may not
+// have received it yet; the entry that is dropped is then an earlier stroke. So that this stroke
+// does not vanish from the screen, draw() takes the arrays from the model again.
 void DrawingCanvasView::dropEntryOfClick()
 {
     if (m_pathArray.isEmpty())
@@ -259,7 +264,7 @@ void DrawingCanvasView::placeTextBox(Point point)
     platform::Window *const ownWindow = window();
     if (!ownWindow || ownWindow->firstResponder() != this) {
         if (ownWindow)
-            ownWindow->makeFirstResponder(this); // the click only ends the editing
+            ownWindow->makeFirstResponder(this); // the click only ends the editing of a box
         return;
     }
     auto *const owner = dynamic_cast<QObject *>(&controller());
@@ -327,13 +332,14 @@ void DrawingCanvasView::showStrokes(const platform::Rect &dirtyRect)
         painter.fillRect(surface().rect(), paper());
         return;
     }
-    // A pixel more than marked on every side: what is too much is clipped away.
+    // One point more than was marked, on every side, so that no pixel at the edge is left out; the
+    // painter clips what is too much.
     const platform::Rect dirty = dirtyRect.grownBy(1.0);
     const QRect area
         = QRectF(dirty.x * scale, dirty.y * scale, dirty.width * scale, dirty.height * scale)
               .toAlignedRect()
         & QRect(QPoint(), size);
-    painter.scale(1 / scale, 1 / scale); // pixel for pixel, no matter how many make a point
+    painter.scale(1 / scale, 1 / scale); // so that the picture is copied pixel for pixel
     painter.drawImage(QPoint(area.x(), size.height() - area.y() - area.height()), pixels.image(),
         pixels.inImage(area));
 }
@@ -345,10 +351,10 @@ void DrawingCanvasView::draw(const platform::Rect &dirtyRect)
     bringBackTextBoxes();
 }
 
-// So text boxes that undo brought back appear again.
+// Undo brings a text box back into the array only; here it becomes a view on the canvas again.
 void DrawingCanvasView::bringBackTextBoxes()
 {
-    const EntryList<TextBoxEntry> boxes = m_textBoxArray; // whoever leaves may change the list
+    const EntryList<TextBoxEntry> boxes = m_textBoxArray; // adding a box may change the list
     for (const TextBoxEntry &entry : boxes)
         addSubview(entry.textBox);
 }

@@ -31,7 +31,7 @@ public:
     explicit DrawingCanvasView(const platform::Rect &frame);
     ~DrawingCanvasView() override;
 
-    /// Where the pointer of the brush was last.
+    /// Where the brush was last dragged to or let go.
     [[nodiscard]] platform::Point lastPoint() const { return m_lastPoint; }
     void setLastPoint(platform::Point point) { m_lastPoint = point; }
     /// Where the brush was pressed, then where it was dragged to last.
@@ -58,7 +58,8 @@ public:
     /// The tool that the pointer obeys. "brush", "eraser" and "text" do something.
     [[nodiscard]] const QString &currentSelectedTool() const { return m_currentSelectedTool; }
     void setCurrentSelectedTool(const QString &tool) { m_currentSelectedTool = tool; }
-    /// The drawing tool that a momentary one gives way to again. The spelling is fixed.
+    /// The drawing tool chosen last. It is the current tool again after one that only acts once,
+    /// such as undo. The spelling is fixed.
     [[nodiscard]] const QString &lastSelecedTool() const { return m_lastSelecedTool; }
     void setLastSelecedTool(const QString &tool);
     /// The cursor over the whole canvas.
@@ -84,9 +85,9 @@ public:
     /// The window in which the tool bar shows its options; null where there is none. Weak.
     [[nodiscard]] platform::Window *popoverWindow() const { return m_popoverWindow; }
     void setPopoverWindow(platform::Window *window) { m_popoverWindow = window; }
-    /// Who chooses the eraser when the eraser end of a pen is put down, and the tool before it
-    /// with the other end, unless another was chosen meanwhile; without one the controller does.
-    /// Weak.
+    /// Chooses the eraser when the eraser end of a pen is put down, and the tool from before when
+    /// the tip is put down next, unless another tool was chosen meanwhile. Without a chooser the
+    /// controller chooses. Weak.
     void setToolChooser(ToolChooser *chooser) { m_toolChooser = chooser; }
     [[nodiscard]] DrawingCanvasDelegate *drawingCanvasDelegate() const;
     void setDrawingCanvasDelegate(DrawingCanvasDelegate *delegate);
@@ -98,7 +99,7 @@ public:
     [[nodiscard]] bool takesPens() const override { return true; }
     void resetCursorRects() override;
     void draw(const platform::Rect &dirtyRect) override;
-    /// The strokes, and under them the window's paper where this covers it.
+    /// The strokes; below them the window's background, if the canvas covers the window.
     void drawContent(QPainter &painter) override;
 
 private:
@@ -134,15 +135,15 @@ private:
     QColor m_brushColor;
     QString m_currentSelectedTool;
     QString m_lastSelecedTool;
-    std::optional<platform::Point> m_eraserPlace; // where it was last, while it is held down
-    QString m_toolBeforeEraserEnd; // empty: the tool is not the pen's doing
+    std::optional<platform::Point> m_eraserPlace; // where the eraser was last, while it is down
+    QString m_toolBeforeEraserEnd; // empty: the pen has not chosen the eraser
     platform::WeakReference<ToolChooser> m_toolChooser;
     platform::Cursor m_cursorType = platform::Cursor::arrow();
     std::shared_ptr<platform::View> m_textBoxView;
     QPointer<platform::Window> m_popoverWindow;
     platform::WeakReference<DrawingCanvasDelegate> m_drawingCanvasDelegate;
     bool m_coversWindow = false;
-    bool m_hasDroppedEntry = false; // the copy lacks what a click without a drag dropped
+    bool m_hasDroppedEntry = false; // m_pathArray lacks an entry, see dropEntryOfClick()
 };
 
 } // namespace penwick
