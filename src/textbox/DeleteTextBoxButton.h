@@ -6,8 +6,8 @@
 
 namespace penwick {
 
-/// A small image just outside its box's top right corner, with another one under the pointer.
-/// Without the component's bundle the process stops.
+/// A small image just outside its box's top right corner; a second image takes its place while the
+/// pointer is over it. Without the component's bundle the process stops.
 class DeleteTextBoxButton final : public platform::Button
 {
     Q_OBJECT
@@ -28,7 +28,7 @@ public:
     void mouseEntered() override;
     void mouseExited() override;
     void mouseMoved(const platform::MouseEvent &event) override;
-    /// Sets the arrow, as every move over the button does.
+    /// Sets the arrow as the cursor. Every move over the button calls it.
     void cursorUpdate(const platform::MouseEvent &event);
 
 private:

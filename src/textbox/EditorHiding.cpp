@@ -20,7 +20,7 @@ EditorHiding::EditorHiding(QTextEdit &editor)
 bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
 {
     switch (event->type()) {
-    case QEvent::DragMove: // is sent to nobody but the drag's target
+    case QEvent::DragMove: // sent to the drag's target alone
         m_isDraggedOver = true;
         break;
     case QEvent::DragLeave:

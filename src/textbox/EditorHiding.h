@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What of an editor must not outlive its place on the screen.
+// Ends what an editor must not leave behind when it goes off the screen.
 #pragma once
 
 #include <QObject>
@@ -10,9 +10,9 @@ namespace penwick {
 
 /// Closes an editor's menu and ends the drag over it when the editor is hidden.
 ///
-/// A menu is a window of its own and would stay. And the desktop says nothing more about a drag to
-/// a window that is gone: the toolkit would keep the editor as the drag's target, dead or not, and
-/// tell it of the next drag that anything in the process refuses.
+/// A menu is a window of its own and would stay open. And a window that is gone hears no more about
+/// a drag from the desktop: the toolkit would keep the editor as the drag's target, even after its
+/// destruction, and tell it of the next drag that another widget of the process refuses.
 class EditorHiding final : public QObject
 {
     Q_OBJECT

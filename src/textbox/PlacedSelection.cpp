@@ -12,7 +12,7 @@ namespace penwick {
 
 namespace {
 
-/// Its menu included, which is a window of its own.
+/// Whether `object` is the editor or inside it. The editor's menu, a window of its own, is inside.
 bool belongsTo(const QTextEdit &editor, const QObject *object)
 {
     while (object && object != &editor)
@@ -38,7 +38,7 @@ void PlacedSelection::listenIfNeeded()
 
 bool PlacedSelection::eventFilter(QObject *watched, QEvent *event)
 {
-    // A pen's press is told to a window before it is to a widget.
+    // A pen's press reaches a QWindow first and then a widget; only the widget tells what it is on.
     const bool isPress
         = event->type() == QEvent::MouseButtonPress || event->type() == QEvent::TabletPress;
     if (!isPress || !watched->isWidgetType() || belongsTo(m_editor, watched))
@@ -46,7 +46,7 @@ bool PlacedSelection::eventFilter(QObject *watched, QEvent *event)
     QScrollBar &scroll = *m_editor.verticalScrollBar();
     const int seen = scroll.value();
     clearSelectionIn(m_editor);
-    scroll.setValue(seen); // where the caret would be is of no interest
+    scroll.setValue(seen); // clearing has scrolled to the caret, which a placed box does not show
     return false;
 }
 

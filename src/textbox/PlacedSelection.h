@@ -8,8 +8,9 @@ class QTextEdit;
 
 namespace penwick {
 
-/// Drops what is selected in a read-only editor as soon as anything else is pressed, so that no
-/// mark stays behind. Listens to the process's presses only while something is selected there.
+/// Clears the selection of a read-only editor as soon as anything else is pressed, so that no text
+/// stays highlighted on the canvas. Listens to the process's presses only while there is such a
+/// selection.
 class PlacedSelection final : public QObject
 {
     Q_OBJECT

@@ -8,12 +8,12 @@
 
 namespace penwick {
 
-/// The desktop's own font. `size` is in points of the screen's logical pixels; one that no line of
-/// text could have is taken for the nearest that it could.
+/// The desktop's own font. `size` is in points, which are logical pixels of the screen; instead of
+/// a size that no font can have, the nearest possible one is used.
 [[nodiscard]] QFont systemFontOf(double size);
 
-/// The one face that is called `face`: its family and its style without their spaces, a hyphen
-/// between them, as in "DejaVuSans-Bold". Nothing where it is not installed.
+/// The face with the name `face`, which is its family and its style, both without spaces, joined by
+/// a hyphen, as in "DejaVuSans-Bold". Empty if no such face is installed.
 [[nodiscard]] std::optional<QFont> fontNamed(const QString &face, double size);
 
 /// The font of what is written: the preferred one where it is installed, else the desktop's own.

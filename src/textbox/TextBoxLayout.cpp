@@ -14,7 +14,8 @@ namespace penwick {
 
 namespace {
 
-/// Laying out is what a long text costs at every key: never twice for the same width.
+/// Laying out a long text takes time and happens at every key, so it is not repeated for a width
+/// that the text has already.
 void setWidth(QTextDocument &text, double width)
 {
     if (text.textWidth() != width)
@@ -44,13 +45,14 @@ bool isWrapped(const QTextDocument &text)
 
 } // namespace
 
-// Measured as wide as the box may become, then laid out as wide as it will be, so that text from
-// the right to the left stands at the right edge of the box and not of the canvas.
+// The text is laid out in the largest width that the box may get, which measures it, and then in
+// the width that the box will have. In the first width a text that runs from right to left stands
+// at the right edge of the canvas, not of the box.
 platform::Size layOutText(QTextDocument &text, double canvasWidth)
 {
     const double widest = std::max(1.0, std::floor(canvasWidth));
     setWidth(text, widest);
-    const double ideal = std::ceil(text.idealWidth()); // lays all of it out
+    const double ideal = std::ceil(text.idealWidth()); // this call lays the whole text out
     const double width = isWrapped(text) ? widest : std::min(ideal, widest);
     setWidth(text, std::min(std::max(width, smallestTextBox.width), widest));
     return { width, std::ceil(text.size().height()) };

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a text box has to say to whoever writes in it.
+// A message at a text box for the person who writes in it.
 #pragma once
 
 class QString;
@@ -7,7 +7,7 @@ class QWidget;
 
 namespace penwick {
 
-/// Shows `text` below `box` for some seconds, and has assistive programs say it.
+/// Shows `text` below `box` for some seconds, and has assistive programs speak it.
 void sayAt(QWidget &box, const QString &text);
 
 } // namespace penwick

@@ -15,17 +15,19 @@ constexpr double leastInReach = 20.0; // points
 
 Size inWholePoints(Size size)
 {
-    // A canvas without any extent is none yet; a box is never less than a point.
+    // A canvas that has not been laid out yet has no size; a box has at least one point.
     return { std::max(1.0, std::floor(size.width)), std::max(1.0, std::floor(size.height)) };
 }
 
-/// The nearest to `place` from which `length` ends before `end`, and which is not below 0.
+/// Where something of `length` is to begin, as near to `place` as possible, so that it ends by
+/// `end`. Something longer than that begins at 0.
 double within(double place, double length, double end)
 {
     return std::max(0.0, std::min(place, end - length));
 }
 
-/// The nearest to `place` from which at least `least` of `length` lies between 0 and `end`.
+/// Where something of `length` is to begin, as near to `place` as possible, so that at least
+/// `leastInReach` of it lies between 0 and `end`.
 double reaching(double place, double length, double end)
 {
     const double least = std::min({ leastInReach, length, end });

@@ -6,14 +6,15 @@
 
 namespace penwick {
 
-/// The least that a text box shrinks to, where the canvas is that large.
+/// A text box becomes no smaller than this, unless the canvas is smaller.
 constexpr platform::Size smallestTextBox { 200.0, 30.0 };
 
 /// What the delete button takes beyond the right and the top edge of its box, in points.
 constexpr double roomForDeleteButton = 21.0;
 
-// Frames are in the canvas's coordinates, whose origin is its bottom left corner. A canvas is taken
-// in whole points, as the editor is: half a point less would wrap what has just fitted.
+// Frames are in the canvas's coordinates, whose origin is its bottom left corner. The size of a
+// canvas is rounded down to whole points, because an editor's size is whole: an editor that came
+// out half a point too narrow would wrap a line that had just fitted.
 
 /// The frame of a box that is being written in and needs `needed`.
 ///

@@ -53,7 +53,7 @@ void TextCaret::paint(QPainter &painter) const
         return;
     QRectF place = m_editor.cursorRect();
     place.setWidth(caretWidth);
-    // An empty editor may be lower than a line of its font.
+    // A box in which nothing has been written yet may be less high than a line of its font.
     const double height = m_editor.viewport()->height();
     place.setBottom(std::min(place.bottom(), height - distanceFromEdge));
     painter.fillRect(place, m_color);

@@ -23,7 +23,7 @@ void insertComposition(const QTextBlock &block)
 {
     QTextLayout &layout = *block.layout();
     QTextCursor there(block);
-    // The line may have become shorter before it.
+    // The line may have become shorter since, so that the composition's place is beyond its end.
     there.setPosition(
         block.position() + std::min(layout.preeditAreaPosition(), block.length() - 1));
     const QString left = layout.preeditAreaText();
@@ -34,7 +34,8 @@ void insertComposition(const QTextBlock &block)
 
 } // namespace
 
-// In all of the text: the insertion point may have gone on, as when something is dropped elsewhere.
+// Every line is searched, because the insertion point may have left the composition's line, as it
+// does when something is dropped elsewhere in the text.
 QString compositionIn(const QTextEdit &editor)
 {
     QString all;
@@ -48,9 +49,9 @@ QList<QInputMethodEvent::Attribute> attributesWithin(
 {
     for (QInputMethodEvent::Attribute &attribute : attributes) {
         if (attribute.type == QInputMethodEvent::Selection)
-            continue; // it is about the text
+            continue; // a selection counts characters of the text, not of the composition
         attribute.start = std::min(attribute.start, length);
-        if (attribute.type != QInputMethodEvent::Cursor) // whose length is no stretch
+        if (attribute.type != QInputMethodEvent::Cursor) // its length says whether it is seen
             attribute.length = std::min(attribute.length, length - attribute.start);
     }
     return attributes;
@@ -76,7 +77,7 @@ void commitCompositionIn(QTextEdit &editor)
     }
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();
-    // By an input method that does not commit when it is told to.
+    // An input method that does not commit when it is told to has left its composition here.
     const QString left = editor.textCursor().block().layout()->preeditAreaText();
     if (!left.isEmpty()) {
         QInputMethodEvent commit;

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What an input method has half composed in an editor, and is not yet part of its text.
+// The composition of an input method: letters that an editor shows while they are being composed,
+// and that are not yet part of its text.
 #pragma once
 
 #include <QInputMethodEvent>
@@ -10,18 +11,20 @@ class QTextEdit;
 
 namespace penwick {
 
-/// The composition in the text, wherever it stands; empty where there is none.
+/// The composition, in whichever line it stands; empty if there is none.
 [[nodiscard]] QString compositionIn(const QTextEdit &editor);
 
 /// `attributes` for a composition of which only the first `length` characters are shown.
 [[nodiscard]] QList<QInputMethodEvent::Attribute> attributesWithin(
     QList<QInputMethodEvent::Attribute> attributes, int length);
 
-/// Takes out what is half composed in another line than the insertion point's. An input method says
-/// all of its composition each time, and the editor puts it where the insertion point is then.
+/// Removes a composition from every line but the insertion point's. With each of its events an
+/// input method sends the whole composition, which the editor shows at the insertion point; what is
+/// left in another line would be there twice.
 void dropCompositionBesideCaret(QTextEdit &editor);
 
-/// Makes the composition part of the text. An editor that became read-only would drop it.
+/// Makes the composition part of the text. An editor that becomes read-only would otherwise lose
+/// it.
 void commitCompositionIn(QTextEdit &editor);
 
 } // namespace penwick

@@ -34,7 +34,7 @@ void prepareForPress(QTextEdit &editor, const QMouseEvent &press)
     if (press.button() == Qt::RightButton)
         return;
     commitCompositionIn(editor);
-    // Shift alone makes the selection longer.
+    // A press with Shift alone extends the selection; the editor does that itself.
     if (press.button() == Qt::LeftButton && press.modifiers() != Qt::ShiftModifier)
         editor.setTextCursor(editor.cursorForPosition(press.position().toPoint()));
 }
@@ -55,7 +55,9 @@ QString typedBy(const QKeyEvent &press)
         return text;
     const QChar first = text.front();
     const auto modifiers = press.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier);
-    // Some write marks of direction with Ctrl and Shift. With Alt beside it, Ctrl is AltGr.
+    // Some keyboards write marks of the text's direction with Ctrl and Shift, so these marks are
+    // text whatever the modifiers. Ctrl and Alt together are AltGr, which writes; Ctrl alone is a
+    // command.
     const bool isWritten = first.category() == QChar::Other_Format
         || (modifiers != Qt::ControlModifier
             && (first.isPrint() || first.category() == QChar::Other_PrivateUse));
@@ -71,7 +73,7 @@ bool endsEditing(const QKeyEvent &press)
 
 bool redoIfAsked(QTextEdit &editor, QKeyEvent &press)
 {
-    // Where the desktop has other keys for it, the editor would leave these to the canvas.
+    // Where the desktop redoes by another key, the editor would leave Ctrl+Y to the canvas.
     if (editor.isReadOnly() || press.keyCombination() != (Qt::ControlModifier | Qt::Key_Y))
         return false;
     press.accept();

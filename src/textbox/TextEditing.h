@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What an editor does with presses and when an edit ends, beyond the toolkit's own.
+// What an editor does beyond the toolkit's own when it is pressed, typed in, and left.
 #pragma once
 
 #include <QString>
@@ -10,28 +10,27 @@ class QTextEdit;
 
 namespace penwick {
 
-/// Ends an edit: what is half composed becomes text, nothing stays selected, the next edit cannot
-/// undo this one, and a menu that was opened for it closes, because what it offers is not possible
-/// any more.
+/// Ends an edit: a composition becomes text, nothing stays selected, the next edit cannot undo this
+/// one, and the editor's menu closes, because what it offers is not possible any more.
 void endEditIn(QTextEdit &editor);
 
-/// Before the editor hears of a press that is no call for the menu: what is half composed becomes
-/// text, because the editor would count it as text that it is not yet; and the left button puts the
-/// caret where it is pressed, because the editor would drag what is selected in a loop of events of
-/// its own, in which the host may end the session.
+/// To be called before the editor hears of a press; the right button, which opens the menu, changes
+/// nothing. A composition becomes text, because the editor would count positions as if it were text
+/// already. The left button puts the caret where it is pressed, which clears the selection: the
+/// editor would drag selected text in an event loop of its own, in which the host may end the
+/// session.
 void prepareForPress(QTextEdit &editor, const QMouseEvent &press);
 
-/// Selects nothing any more; the caret stays.
+/// Clears the selection; the caret stays where it is.
 void clearSelectionIn(QTextEdit &editor);
 
-/// What `press` would write where it is no command of the editor's; empty for those that are.
+/// The text that `press` would write; empty if it is a command.
 [[nodiscard]] QString typedBy(const QKeyEvent &press);
 
 /// Whether `press` is one of the keys that end an edit: Return without Shift, Tab and Escape.
 [[nodiscard]] bool endsEditing(const QKeyEvent &press);
 
-/// Redoes if `press` is Ctrl+Y and `editor` can be written in; whether it was. The press is
-/// accepted then.
+/// If `press` is Ctrl+Y and `editor` is editable: accepts it, redoes, and returns true.
 bool redoIfAsked(QTextEdit &editor, QKeyEvent &press);
 
 /// Closes the menu of `editor`, if it is open. A menu is a window of its own: left alone, it would

@@ -18,7 +18,8 @@ namespace penwick {
 
 namespace {
 
-// The text that gives way to what is committed, as `at` stands now, selected.
+// A cursor on the text that `event` replaces by what it commits, which it selects; `at` itself if
+// the event replaces nothing. The event counts from the beginning of the selection of `at`.
 QTextCursor replacedBy(const QInputMethodEvent &event, const QTextCursor &at)
 {
     if (event.replacementLength() == 0)
@@ -52,7 +53,8 @@ TextEditor::TextEditor(QTextDocument *text, QWidget *parent)
 
     connect(document(), &QTextDocument::contentsChanged, this, &TextEditor::writingChanged);
     connect(this, &QTextEdit::cursorPositionChanged, &m_caret, &TextCaret::restart);
-    // A new box is lower than a line of a large font; it grows with the first letter.
+    // A new box is less high than a line of a large font and grows with the first letter. Until
+    // then it must not scroll.
     connect(verticalScrollBar(), &QScrollBar::valueChanged, this, [this] {
         if (isEmpty())
             verticalScrollBar()->setValue(0);
@@ -63,12 +65,12 @@ TextEditor::~TextEditor() = default;
 
 void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point origin)
 {
-    m_look.reset(); // what follows is to be heard
+    m_look.reset(); // it would keep the editor from taking the new font and colours
     setFont(font);
-    document()->setDefaultFont(font); // a style sheet's would be the widget's
+    document()->setDefaultFont(font); // the widget's may be a style sheet's
     QTextCharFormat ink;
     ink.setForeground(color);
-    textCursor().setBlockCharFormat(ink); // lasts when all of the text is deleted
+    textCursor().setBlockCharFormat(ink); // stays when all text is deleted
     setTextColor(color);
     QPalette colors = palette();
     colors.setColor(QPalette::Text, color);
@@ -83,7 +85,7 @@ void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point 
     margins.setTopMargin(origin.y);
     margins.setBottomMargin(bottomPadding);
     document()->rootFrame()->setFrameFormat(margins);
-    document()->clearUndoRedoStacks(); // the user did none of this
+    document()->clearUndoRedoStacks(); // the user must not undo any of this
 }
 
 void TextEditor::setEditable(bool editable)
@@ -100,8 +102,8 @@ bool TextEditor::isEmpty() const
     return document()->isEmpty();
 }
 
-// Not by the editor itself: between whole scales it paints its own caret, however thin it is told
-// to be.
+// QTextEdit does not paint here, because at a scale such as 1.5 it shows its own caret even with a
+// width of 0.
 void TextEditor::draw(const platform::Rect &dirtyRect)
 {
     QPainter painter(viewport());
@@ -138,8 +140,9 @@ void TextEditor::paintText(
 
 // The pointer
 
-// Pressing is only half of what the editor does with a press: it selects text as the pointer goes
-// on, and on X11 the wheel's button pastes.
+// A view takes the left button alone, and a text box gives QTextEdit none of its drags and
+// releases. QTextEdit needs them nevertheless: it selects text as the pointer moves on, and on X11
+// it pastes with the middle button.
 void TextEditor::mousePressEvent(QMouseEvent *event)
 {
     prepareForPress(*this, *event);
@@ -169,7 +172,7 @@ void TextEditor::wheelEvent(QWheelEvent *event)
 {
     if (verticalScrollBar()->maximum() == 0 || event->modifiers().testFlag(Qt::ControlModifier))
         event->ignore();
-    else // not by the editor, which would change its font's size where it is read-only
+    else // a read-only QTextEdit would change the size of its font
         QAbstractScrollArea::wheelEvent(event); // NOLINT(bugprone-parent-virtual-call): as said
 }
 
@@ -193,7 +196,7 @@ void TextEditor::keyPressEvent(QKeyEvent *event)
 TextRoom TextEditor::room() const
 {
     TextRoom room = roomAt(textCursor());
-    // What is half composed has its place already.
+    // The composition will be text soon, so its room is taken already.
     const auto composed = static_cast<int>(compositionIn(*this).size());
     room.characters = std::max(0, room.characters - composed);
     return room;
@@ -208,7 +211,7 @@ bool TextEditor::refuses(const QKeyEvent &press)
     return count > 0;
 }
 
-// The editor's own would read an offer that has no format at all as if it had one, and crash.
+// QTextEdit's own implementation crashes when an offer has no format at all.
 void TextEditor::insertFromMimeData(const QMimeData *source)
 {
     if (!isEditable() || !source || !source->hasText())
@@ -227,7 +230,7 @@ void TextEditor::inputMethodEvent(QInputMethodEvent *event)
     dropCompositionBesideCaret(*this);
     TextRoom room = roomAt(replacedBy(*event, textCursor()));
     QString commit = fittingPart(event->commitString(), room);
-    // What stands there goes only if all that takes its place comes.
+    // Text is replaced only if there is room for all that replaces it.
     const bool isKept
         = event->replacementLength() > 0 && commit.size() < event->commitString().size();
     if (isKept) {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The editor under a text box: plain text in one font and colour, with the caret of its own.
+// The editor under a text box: plain text in one font and colour, with a caret of its own.
 #pragma once
 
 #include "platform/OwnLook.h"
@@ -16,17 +16,17 @@
 
 namespace penwick {
 
-/// Edits plain text, or shows it where it is not editable. It has no background, no frame and no
-/// scroll bars, and its size is its owner's to set; what is longer is scrolled by the wheel. It
-/// takes only so much text (TextRoom.h), however that comes.
+/// Edits plain text, or only shows it while it is not editable. It has no background, no frame and
+/// no scroll bars. Its owner sets its size; text that is longer is scrolled by the wheel. It takes
+/// only as much text as TextRoom.h allows, whether typed, composed, pasted or dropped.
 ///
-/// Its own coordinates run downwards, as text does.
+/// Its own y axis points downwards, as text runs.
 class TextEditor : public platform::ViewOf<QTextEdit>
 {
     Q_OBJECT
 
 public:
-    /// Shows `text`, which must outlive it; a text of its own where that is null.
+    /// Shows `text`, which must outlive the editor; if `text` is null, a text of its own.
     explicit TextEditor(QTextDocument *text = nullptr, QWidget *parent = nullptr);
     ~TextEditor() override;
 
@@ -34,7 +34,7 @@ public:
 
     [[nodiscard]] bool isEditable() const { return !isReadOnly(); }
     void setEditable(bool editable);
-    [[nodiscard]] bool isEmpty() const; ///< what is half composed is no text yet
+    [[nodiscard]] bool isEmpty() const; ///< a composition is no text yet
 
     /// Writes everything in `font` and `color`, beginning at `origin` from the top left corner.
     void setInk(const QFont &font, const QColor &color, platform::Point origin);
@@ -42,7 +42,7 @@ public:
     void draw(const platform::Rect &dirtyRect) override;
 
 Q_SIGNALS:
-    /// The text, or what is half composed in it, has changed.
+    /// The text, or the composition in it, has changed.
     void writingChanged();
     /// A key was pressed that ends editing.
     void endAsked();
@@ -52,8 +52,8 @@ Q_SIGNALS:
 protected:
     using Selection = QAbstractTextDocumentLayout::Selection;
 
-    /// Paints the text that lies in `part`, with `selections` and without a caret. Both `part` and
-    /// `painter`, which is left displaced, count from the top left corner.
+    /// Paints the text that lies in `part`, with `selections` and without a caret. `part` and
+    /// `painter` are in the viewport's coordinates, y down; `painter` is left translated.
     void paintText(QPainter &painter, const QRectF &part, const QList<Selection> &selections) const;
 
     void mousePressEvent(QMouseEvent *event) override;

@@ -57,11 +57,11 @@ QString fittingPart(const QString &text, const TextRoom &room)
         if (marks <= mostMarks)
             taken += letter;
         else if (place - taken.size() > mostCharacters)
-            break; // nothing but marks comes
+            break; // so many marks in a row that the rest is not worth reading
     }
     const bool isCut = taken.size() < text.size();
     if (isCut && !taken.isEmpty() && taken.back().isHighSurrogate())
-        taken.chop(1); // half a character
+        taken.chop(1); // the first half of a character whose second half was cut off
     return taken;
 }
 

@@ -8,8 +8,8 @@ class QTextCursor;
 
 namespace penwick {
 
-// Nobody who writes on a board comes near these. They are there for a clipboard that holds a whole
-// document: every key lays the text out anew, and must be done within a frame of the host's.
+// Nobody who writes on a board comes near these limits. They are for a clipboard that holds a whole
+// document: each key lays the whole text out anew, and that must not delay the host's next frame.
 constexpr int mostCharacters = 2500; ///< of a box
 constexpr int mostLines = 250; ///< of a box, wrapped ones not counted
 constexpr int mostMarks = 64; ///< accents and the like on one letter
@@ -19,7 +19,7 @@ struct TextRoom
 {
     int characters = mostCharacters;
     int lineEnds = mostLines - 1;
-    int marks = mostMarks; ///< more on the letter that stands there
+    int marks = mostMarks; ///< how many more the letter there can take
 
     friend bool operator==(const TextRoom &, const TextRoom &) = default;
 };
@@ -27,8 +27,8 @@ struct TextRoom
 /// What may go in at `place`, instead of what is selected there.
 [[nodiscard]] TextRoom roomAt(const QTextCursor &place);
 
-/// The beginning of `text` that goes into `room`, without marks that are too many. Costs no more
-/// than what is taken, however long `text` is.
+/// As much of the beginning of `text` as goes into `room`; marks that are too many are left out.
+/// The cost is bounded by the room, however long `text` is.
 [[nodiscard]] QString fittingPart(const QString &text, const TextRoom &room);
 
 } // namespace penwick

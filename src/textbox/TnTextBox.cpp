@@ -85,7 +85,7 @@ TnTextBox::~TnTextBox() = default;
 
 void TnTextBox::customizeTextBox()
 {
-    // The two full stops are meant.
+    // The two full stops are intended.
     m_placeholderAttributedString = { tr("Type your text here.."), faded(m_textFontColor),
         systemFontOf(placeholderFontSize), Qt::AlignJustify };
     setInk(textFontOf(m_textFontSize), m_textFontColor, textContainerOrigin());
@@ -117,13 +117,13 @@ void TnTextBox::draw(const Rect &dirtyRect)
     drawPlaceholder();
     if (!m_hasDashedBorder)
         return;
-    drawBorder(bounds()); // always whole: the clip alone decides what of it is painted
+    drawBorder(bounds()); // the whole border; the clip decides what of it is painted
     showDeleteTextButton();
 }
 
 void TnTextBox::drawContent(QPainter &painter)
 {
-    paintText(painter, viewport()->rect(), {}); // what is selected is no part of the drawing
+    paintText(painter, viewport()->rect(), {}); // a selection is no part of the drawing
 }
 
 void TnTextBox::drawPlaceholder()
@@ -139,8 +139,9 @@ void TnTextBox::drawPlaceholder()
         m_placeholderAttributedString.string);
 }
 
-// A painter's own dashes leave out sides beyond the clip and lose count there, so that they would
-// move as parts of the box are painted again. The stroker knows of no clip.
+// QPainter skips the sides of a dashed rectangle that are outside the clip and begins to count its
+// dashes after them, so the dashes would move whenever only a part of the box is painted.
+// QPainterPathStroker knows no clip.
 void TnTextBox::drawBorder(const Rect &rect)
 {
     if (rect.height < bounds().height)
@@ -250,9 +251,9 @@ bool TnTextBox::resignFirstResponder()
     addGestureRecognizer(panGesture());
     if (m_deleteTextButton) {
         m_deleteTextButton->setHidden(true);
-        m_deleteTextButton->restoreImage(); // hidden, it may not hear that the pointer left
+        m_deleteTextButton->restoreImage(); // a hidden button may not hear that the pointer left
     }
-    verticalScrollBar()->setValue(0); // what is too long for the canvas is read from its beginning
+    verticalScrollBar()->setValue(0); // a text too long for the canvas shows its beginning
     setAccessibleDescription({});
     if (isEmpty()) {
         m_isTextBoxDeleted = true;
@@ -265,7 +266,8 @@ bool TnTextBox::resignFirstResponder()
 
 void TnTextBox::viewDidMoveToWindow()
 {
-    // Brought back by undo, it can be edited and left again.
+    // A box that undo brings back can be edited, and left, once more. While the box counts as
+    // deleted, leaving it would do nothing.
     if (window())
         m_isTextBoxDeleted = false;
 }
@@ -295,7 +297,7 @@ void TnTextBox::fitToText()
         return;
     m_isWritten = m_isWritten || !isEmpty() || !compositionIn(*this).isEmpty();
     if (!m_isWritten)
-        return; // it stands where it was clicked until the first letter
+        return; // until the first letter the box stays where the canvas was clicked
     m_isFitting = true;
     const platform::Size canvas = superview()->bounds().size();
     const platform::Size needed = layOutText(*document(), canvas.width);
@@ -312,7 +314,7 @@ void TnTextBox::moveInto(const Rect &frame)
     if (frame == this->frame())
         return;
     setFrame(frame);
-    setNeedsDisplay(); // and with it the delete button goes along
+    setNeedsDisplay(); // draw() also puts the delete button in its place
 }
 
 void TnTextBox::superviewDidResize(platform::Size former)

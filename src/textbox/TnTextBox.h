@@ -20,8 +20,8 @@ namespace penwick {
 /// (thin border, dragged by the pointer, deleted by Backspace).
 ///
 /// Held by reference: history keeps a box that has left its canvas, and the same box comes back.
-/// Its own coordinates run downwards, as text does. A box that reports its end without a delegate
-/// stops the process.
+/// Its own y axis points downwards, as text runs. A box that deletes itself and has no delegate to
+/// tell stops the process.
 class TnTextBox final : public TextEditor
 {
     Q_OBJECT
@@ -33,8 +33,9 @@ public:
     static std::shared_ptr<TnTextBox> create(
         const platform::Rect &frame, double fontSize, const QColor &fontColor);
 
-    // The other constructors leave the setting up to customizeTextBox(): a scene's, one for a
-    // frame, and one that shows `textContainer`, which must outlive the box.
+    // The first three constructors leave it to the caller to call customizeTextBox(): one for a
+    // scene, one with a frame, and one that shows `textContainer`, which must outlive the box. The
+    // fourth is the one that create() uses.
     explicit TnTextBox(QWidget *parent = nullptr);
     explicit TnTextBox(const platform::Rect &frame);
     TnTextBox(const platform::Rect &frame, QTextDocument &textContainer);
@@ -48,16 +49,17 @@ public:
     [[nodiscard]] platform::Point mouseDownPoint() const { return m_mouseDownPoint; }
     /// Whether the box looks edited: dashed border and delete button.
     [[nodiscard]] bool hasDashedBorder() const { return m_hasDashedBorder; }
-    /// The area in which pointer moves are to be followed. Reserved: a widget hears of all of them.
+    /// The area in which pointer moves are followed. Kept, but not used: a widget hears of them
+    /// all.
     [[nodiscard]] const std::optional<platform::Rect> &trackingArea() const
     {
         return m_trackingArea;
     }
     void setTrackingArea(const std::optional<platform::Rect> &area) { m_trackingArea = area; }
-    /// The canvas that holds the box. Reserved: superview() tells it. Weak.
+    /// The canvas that holds the box. Kept, but not used: superview() tells it. Weak.
     [[nodiscard]] platform::View *textParentView() const { return m_textParentView.get(); }
     void setTextParentView(platform::View *view) { m_textParentView = view; }
-    // Taken by customizeTextBox(); later changes are for the next call of it.
+    // customizeTextBox() uses these; a later change has no effect before it is called again.
     [[nodiscard]] double textFontSize() const { return m_textFontSize; } ///< points
     void setTextFontSize(double size) { m_textFontSize = size; }
     [[nodiscard]] const QColor &textFontColor() const { return m_textFontColor; }
@@ -69,7 +71,8 @@ public:
     {
         return m_placeholderAttributedString;
     }
-    /// Whether the box has deleted itself; not any more once it is back on a canvas.
+    /// Whether the box has deleted itself because it was left empty; false again once it is back on
+    /// a canvas.
     [[nodiscard]] bool isTextBoxDeleted() const { return m_isTextBoxDeleted; }
     /// What drags the placed box; made when it is first asked for.
     [[nodiscard]] platform::PanGestureRecognizer &panGesture();
@@ -78,17 +81,17 @@ public:
     /// bundle the process stops.
     void customizeTextBox();
 
-    /// Where the text begins, from the box's top left corner: smaller fonts stand lower.
+    /// Where the text begins, from the box's top left corner, y down: small fonts begin lower.
     [[nodiscard]] platform::Point textContainerOrigin() const;
 
     void draw(const platform::Rect &dirtyRect) override;
     /// The text alone.
     void drawContent(QPainter &painter) override;
-    /// Draws the dashed border into `rect`, unless that is less than the whole height.
+    /// Draws the dashed border into `rect`, unless `rect` is less high than the box.
     void drawBorder(const platform::Rect &rect);
     void mouseDown(const platform::MouseEvent &event) override;
     void mouseUp(const platform::MouseEvent &event) override;
-    /// Nothing: a placed box is moved by its gesture, and selecting text is the editor's own.
+    /// Does nothing: panGesture() moves a placed box, and the editor selects text by itself.
     void mouseDragged(const platform::MouseEvent &event) override;
     void mouseMoved(const platform::MouseEvent &event) override;
     void keyUp(const platform::KeyEvent &event) override;
@@ -96,7 +99,7 @@ public:
     void superviewDidResize(platform::Size former) override;
     bool resignFirstResponder() override;
 
-    /// The box follows the pointer.
+    /// Moves the box with the pointer.
     void handleGesture(const platform::PanGestureRecognizer &gesture);
     /// Takes the box off its canvas and tells the owner.
     void deleteTextBox();
@@ -112,7 +115,7 @@ private:
     void moveInto(const platform::Rect &frame);
     void drawPlaceholder();
 
-    platform::Point m_mouseDownPoint; // of the grab, from the box's origin
+    platform::Point m_mouseDownPoint; // where the pointer took hold, from the box's origin
     bool m_hasDashedBorder = true;
     std::optional<platform::Rect> m_trackingArea;
     platform::WeakReference<platform::View> m_textParentView;
@@ -123,9 +126,9 @@ private:
     platform::AttributedString m_placeholderAttributedString;
     bool m_isTextBoxDeleted = false;
     std::unique_ptr<platform::PanGestureRecognizer> m_panGesture;
-    std::optional<platform::Cursor> m_pointer; // for the mode that m_pointerIsForText says
+    std::optional<platform::Cursor> m_pointer; // the cursor that was made last
     bool m_pointerIsForText = false;
-    bool m_isWritten = false; // something was in it once
+    bool m_isWritten = false; // whether there has ever been text in the box
     bool m_isFitting = false;
 };
 
