@@ -13,7 +13,8 @@ namespace penwick {
 
 namespace {
 
-// Out of the interface file's common widget, ready to be put into the popover window.
+// Takes `popover` out of the widget in which the interface file has all three, and makes it ready
+// to be put into the popovers' window.
 std::unique_ptr<PopoverView> taken(
     PopoverView &popover, PopoverViewController &owner, const platform::Bundle &bundle)
 {
@@ -25,7 +26,7 @@ std::unique_ptr<PopoverView> taken(
     popover.setParent(nullptr);
     popover.adoptScene();
     for (auto *const option : popover.findChildren<ToolOptionsButton *>())
-        option->toggleToolState(); // today's value is selected from the start
+        option->toggleToolState(); // shows which option the interface file selects
     return std::unique_ptr<PopoverView>(&popover);
 }
 

@@ -8,8 +8,8 @@
 
 namespace penwick {
 
-/// One view in it is the grid, which holds option buttons and nothing else. It takes its colours
-/// when it enters a window.
+/// Its first subview is the grid, which holds option buttons and nothing else. The popover takes
+/// its colours when it enters a window.
 class PopoverView final : public platform::ViewOf<QWidget>
 {
     Q_OBJECT

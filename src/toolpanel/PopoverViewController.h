@@ -22,7 +22,7 @@ class Window;
 } // namespace platform
 
 /// Holds the three popovers of one interface file and turns a press on an option into the choice.
-/// The selection in a popover outlasts its being hidden.
+/// A popover that is hidden keeps its selection.
 class PopoverViewController final : public platform::ViewController
 {
     Q_OBJECT
@@ -36,8 +36,7 @@ public:
     [[nodiscard]] PopoverView *textPopoverView() const { return m_textPopoverView.get(); }
     [[nodiscard]] PopoverView *colorPopoverView() const { return m_colorPopoverView.get(); }
     [[nodiscard]] PopoverView *brushPopoverView() const { return m_brushPopoverView.get(); }
-    /// Takes all three, each of which may be missing. Whichever of them gives the keys up closes
-    /// the popover.
+    /// Takes all three; each may be null. A popover closes when its view resigns first responder.
     void setPopoverViews(std::unique_ptr<PopoverView> text, std::unique_ptr<PopoverView> color,
         std::unique_ptr<PopoverView> brush);
 
@@ -54,7 +53,7 @@ public:
     /// The action of every option button. A sender that is none, or has no identifier, stops the
     /// process; an unknown kind of option is ignored.
     void OnToolOptionSelection(platform::Button &sender); // NOLINT: the name is fixed
-    /// Closes the popover and gives the keys up.
+    /// Closes the popover, and lets another view have the keys.
     bool resignFirstResponder() override;
 
 private:

@@ -4,9 +4,9 @@
 
 namespace penwick {
 
-/// Plain letters and digits work the tool bar only while the pointer was the last to act on the
-/// board or the bar: whoever goes on typing after the end of an edit writes, and chooses no tool.
-/// Keys with Ctrl, and Escape, never rest.
+/// Plain letters and digits work the tool bar only if the pointer was used on board or bar after
+/// the last edit of a text. Somebody who goes on typing when an edit has ended means text, and must
+/// not choose tools by it: the keys rest. Keys with Ctrl, and Escape, never rest.
 class ToolKeyRest
 {
 public:

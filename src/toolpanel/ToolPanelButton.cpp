@@ -26,7 +26,7 @@ ToolPanelButton::ToolPanelButton(QWidget *parent)
     , m_hoverBackgroundColorContrast(TnhColors::toolPanelButtonHoverColorContrast)
     , m_originalBackgroundColor(TnhColors::toolPanelButtonColor)
 {
-    ToolPanelButton::awakeFromScene(); // by name: nothing that derives is there yet
+    ToolPanelButton::awakeFromScene(); // derived classes are not made yet
 }
 
 ToolPanelButton::ToolPanelButton(const platform::Rect &frame)
@@ -38,7 +38,7 @@ ToolPanelButton::ToolPanelButton(const platform::Rect &frame)
 
 ToolPanelButton::~ToolPanelButton() = default;
 
-// Again after a scene gave the button its place and its images.
+// Called by the constructors, and again when a scene has given the button its place and images.
 void ToolPanelButton::awakeFromScene()
 {
     m_trackingArea = platform::TrackingArea { bounds() };
@@ -110,7 +110,7 @@ void ToolPanelButton::mouseExited()
         setImage(m_buttonImage);
 }
 
-// The end button gets the panel's ordinary colours here, as every other.
+// Here the end button gets the ordinary colours of the panel, like every other button.
 void ToolPanelButton::toggleToolState()
 {
     if (m_isSelected) {

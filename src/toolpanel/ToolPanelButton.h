@@ -32,8 +32,8 @@ public:
 
     [[nodiscard]] const QColor &arrowNormalColor() const { return m_arrowNormalColor; }
     [[nodiscard]] const QColor &arrowHoverColor() const { return m_arrowHoverColor; }
-    /// The triangle's colour. The property's own name is "setArrowColor", which leaves its setter
-    /// without one of its kind.
+    /// The triangle's colour. The name of this getter is fixed; it reads like a setter's, so the
+    /// setter has another name.
     [[nodiscard]] const QColor &setArrowColor() const { return m_setArrowColor; }
     void assignArrowColor(const QColor &color);
     /// Image of the normal state.
@@ -43,8 +43,8 @@ public:
     [[nodiscard]] const QIcon &buttonAltImage() const { return m_buttonAltImage; }
     void setButtonAltImage(const QIcon &image) { m_buttonAltImage = image; }
 
-    /// Where the pointer's coming and going is told: the bounds as they were when the button was
-    /// made.
+    /// The area of which the pointer's entering and leaving are told: the bounds as they were when
+    /// the button was made or a scene was loaded.
     [[nodiscard]] const std::optional<platform::TrackingArea> &trackingArea() const
     {
         return m_trackingArea;
@@ -54,8 +54,8 @@ public:
         m_trackingArea = area;
     }
 
-    // The backgrounds. They are read through these operations, so that a class that derives has
-    // others by overriding two of them; what is assigned is then kept and not shown.
+    // The backgrounds. They are read by these functions alone: a derived class that overrides one
+    // shows its own colour, and a colour assigned to it is kept but not shown.
 
     /// Under the pointer and when selected.
     [[nodiscard]] virtual QColor hoverBackgroundColor() const { return m_hoverBackgroundColor; }
@@ -76,9 +76,9 @@ public:
     }
     void setOriginalBackgroundColor(const QColor &color) { m_originalBackgroundColor = color; }
 
-    /// Nothing here; for a class that derives.
+    /// Does nothing; a derived class may override it.
     virtual void setViewImages() { }
-    /// Nothing here; for a class that derives.
+    /// Does nothing; a derived class may override it.
     virtual void defineTrackingAreaForTextBox() { }
 
     /// Shows isSelected().

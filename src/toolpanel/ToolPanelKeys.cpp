@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the tool bar makes of keys, and of the presses and keys that tell whether they rest.
+// How keys work the tool bar, and which presses and keys make letters and digits rest.
 #include "toolpanel/ToolPanelViewController.h"
 
 #include "canvas/DrawingCanvasView.h"

@@ -315,8 +315,9 @@ void ToolPanelViewController::placePopover(const ToolPanelButton &anchor)
     const platform::Size size = m_popoverW->frame().size();
     const platform::Rect place { panel.x + popoverGap + view()->frame().maxX() + anchor.frame().x,
         panel.y + anchor.frame().y, size.width, size.height };
-    // Where there is no room for it beside the panel, what it offers would be out of reach; over
-    // the panel it would cover its button, which closes it.
+    // A popover that reaches beyond the screen is moved onto it, because nobody could reach its
+    // options there. It is not moved over the panel, where it would cover the button that closes
+    // it.
     m_popoverW->setFrame(platform::broughtInsideBeside(place, platform::workAreaFor(panel), panel));
 }
 

@@ -53,8 +53,8 @@ struct ToolPanelOutlets
 /// Keeps the button of the canvas's tool selected, hands every press on to the drawing side, shows
 /// the popovers in a window of their own and enables undo and redo as the history says.
 ///
-/// Its stored values may be assigned, as whoever builds it from parts does; none of them is owned
-/// but the popovers' window.
+/// Its stored values have setters for whoever puts a tool bar together from parts. It owns none of
+/// them but the popovers' window.
 class ToolPanelViewController final : public platform::ViewController,
                                       public ToolPanelOptionDelegate,
                                       public ToolChooser
@@ -66,9 +66,9 @@ public:
     ~ToolPanelViewController() override;
 
     [[nodiscard]] ToolPanelOutlets &outlets() { return m_outlets; }
-    /// Who gets the choice of a tool: when the panel appears, the controller of the window that it
-    /// belongs to; null before. It is a DrawingCanvasDelegate too, or the first press stops the
-    /// process. Weak.
+    /// Receives the choice of a tool. It is null until the panel appears, and then the controller
+    /// of the drawing window's content. It must be a DrawingCanvasDelegate too, or the first press
+    /// stops the process. Weak.
     [[nodiscard]] ToolSelectionDelegate *toolSelectionDelegate() const;
     void setToolSelectionDelegate(ToolSelectionDelegate *delegate);
     /// The popovers' controller; null until the view was loaded. The popovers' window owns it.
@@ -94,7 +94,7 @@ public:
     /// order; nothing until the view was loaded.
     [[nodiscard]] const std::optional<Buttons> &buttons() const;
     void setButtons(const std::optional<Buttons> &buttons);
-    /// Kept, and not used by anything here.
+    /// Kept, but not used.
     [[nodiscard]] ToolPanelButton *lastSelectedTool() const;
     void setLastSelectedTool(ToolPanelButton *button);
     /// The button of the tool that was the canvas's before the press.
@@ -118,10 +118,10 @@ public:
     /// Takes the popover off the screen.
     void hidePopover();
     /// Presses the button, or the option of the open popover, that the key stands for; Escape
-    /// closes the popover. Answers whether there was something to do.
+    /// closes the popover. Returns whether the key stood for any of these.
     ///
-    /// While a text is edited all keys are its editor's; a key that repeats itself works nothing;
-    /// letters and digits rest as ToolKeyRest says.
+    /// While a text is edited all keys are its editor's. A key that is held down works only once.
+    /// Letters and digits rest as ToolKeyRest says.
     bool performKey(const QKeyEvent &event);
     /// The keyboard has come to the tool bar: letters and digits work it again.
     void keyboardEntered() { m_keyRest.keyboardEnteredBar(); }
