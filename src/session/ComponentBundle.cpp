@@ -15,7 +15,7 @@ std::shared_ptr<platform::Bundle> makeComponentBundle()
     bundle->addScene(main, QStringLiteral("DrawingWindowController"), makeDrawingWindowScene);
     bundle->addScene(
         main, QStringLiteral("SharingNotificationWindowController"), makeSharingNotificationScene);
-    // The bundle outlives its own makers.
+    // These functions may refer to the bundle, because they live only as long as it does.
     const platform::Bundle &images = *bundle;
     bundle->addScene(main, QStringLiteral("ToolPanelWindowController"),
         [&images] { return makeToolPanelScene(images); });

@@ -66,8 +66,8 @@ DrawingWindowController::DrawingWindowController(std::unique_ptr<platform::Windo
 
 DrawingWindowController::~DrawingWindowController()
 {
-    // The window goes after this object and must not tell it so; nor is it news to the host that
-    // what stood above the window goes first.
+    // The window is destroyed after this object, so it must not tell this object of that. Nor is
+    // the host to hear, by the window's signals, how the windows above it go.
     if (window()) {
         window()->setDelegate(nullptr);
         window()->blockSignals(true);
@@ -161,7 +161,7 @@ void DrawingWindowController::windowDidLoad()
     attributes.hasShadow = true;
     attributes.aspectRatio = platform::Size { 16.0, 9.0 };
     window.setAttributes(attributes);
-    // The host's own translations; no context, because the title is the host's to word.
+    // The title is the host's to word: its translators are asked, with an empty context.
     window.setWindowTitle(QCoreApplication::translate("", "Tarnhill Whiteboard"));
     window.setFrame(boardOn(mainScreenFrame(), m_minWindowWidth), Animate::Yes);
     loadBanner();
@@ -176,7 +176,7 @@ void DrawingWindowController::loadBanner()
     require(controller.get(), "the drawing window has no sharing banner");
     if (!controller->window())
         return;
-    // The window goes with its controller, which has nothing else to do.
+    // This pointer to the window keeps the window's controller, which owns it, alive.
     m_sharingNotificationWindow = { controller, controller->window() };
     setNotificationWindowProperties(*m_sharingNotificationWindow);
     m_drawingWindow->expectChildWindow(*m_sharingNotificationWindow);
@@ -273,7 +273,7 @@ void DrawingWindowController::setAnnotationImage(
     content().configureAnnotatingImageView(image);
     platform::ImageView &view = *content().annotatedImageView();
     view.setImageFrameStyle(platform::ImageFrameStyle::Photo);
-    new PictureFit(*m_drawingWindow, view); // the view's
+    new PictureFit(*m_drawingWindow, view); // owned by the view
 }
 
 DrawViewController &DrawingWindowController::content() const

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// How a drawing window and the windows that stand above it, tool bar, popover and banner, live
-// together.
+// How a drawing window and the windows above it (tool bar, popover and banner) move, appear and
+// close together.
 #include <penwick/DrawingWindowController.h>
 
 #include "canvas/DrawingCanvasView.h"
@@ -60,8 +60,8 @@ void DrawingWindowController::takeToolBarAlong(platform::Point way)
         panel->setFrameOrigin(panel->frame().origin() + way);
 }
 
-// Undo and redo are what they were, though a tool bar that appears has neither: the drawing is
-// still there.
+// A tool bar that appears disables undo and redo. Here the drawing is still there, so both buttons
+// get back the state that they had.
 void DrawingWindowController::reopenToolBar()
 {
     ToolPanelViewController &bar = m_tPanelWindowController->content();
@@ -112,7 +112,7 @@ void DrawingWindowController::showSharingNotificationWindow()
     require(m_drawingWindow.data(), "the drawing window is gone");
     centreBanner();
     m_drawingWindow->addChildWindow(*m_sharingNotificationWindow);
-    m_sharingNotificationWindow->orderFront(); // at once, or as soon as the drawing window is there
+    m_sharingNotificationWindow->orderFront(); // now, or once the drawing window is shown
     platform::callLater(
         *this, bannerTime, &DrawingWindowController::closeSharingNotificationWindow);
 }
@@ -128,8 +128,8 @@ void DrawingWindowController::closeSharingNotificationWindow()
 
 // Appearing, moving, resizing, closing
 
-// The desktop's own rule for a window that is shown. What stands above it goes along; a tool bar
-// that was placed beside a larger window is placed anew.
+// Brings an image's window onto the screen, as a desktop does with a window that it shows. The
+// windows above it go along. If the window has to become smaller, the tool bar is placed anew.
 void DrawingWindowController::bringPictureInside()
 {
     if (m_windowType != WindowType::imageAnnotation || !m_isPlaced || !m_drawingWindow)
@@ -164,7 +164,7 @@ void DrawingWindowController::windowDidMove()
     if (m_drawingWindow)
         m_drawingWindowOrigin = m_drawingWindow->frame().origin();
     if (m_tPanelWindowController)
-        m_tPanelWindowController->keepEndInReach(); // it has followed
+        m_tPanelWindowController->keepEndInReach(); // the panel moved with the window
 }
 
 void DrawingWindowController::windowDidResize()

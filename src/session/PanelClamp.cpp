@@ -8,8 +8,8 @@ namespace penwick {
 namespace {
 
 constexpr double margin = 3.0; // points
-// Further in than the margin that is tested, so that a panel pushed out on the left stands clear
-// of the edge.
+// A panel that was pushed out on the left comes back this much farther than the margin, so that it
+// stands clear of the edge.
 constexpr double leftSnap = 20.0; // points
 constexpr double titleBar = 22.0; // points, of the parent
 

@@ -11,9 +11,10 @@ namespace penwick {
 [[nodiscard]] platform::Rect clampedPanel(
     const platform::Rect &panel, const platform::Rect &parent);
 
-/// `panel`, where it is higher than `parent` has room for, moved up or down into `workArea`; one
-/// that is higher than that too keeps its lower end there, which ends the session. Never sideways:
-/// on its way to another screen it would not stay beside its parent.
+/// `panel` as it is, if `parent` is high enough for it. Otherwise it is moved up or down into
+/// `workArea`; if that is not high enough either, its lower end, which has the button that ends the
+/// session, lies inside. It is never moved sideways, because it would leave its place in the parent
+/// while that is on its way to another screen.
 [[nodiscard]] platform::Rect reachablePanel(
     const platform::Rect &panel, const platform::Rect &parent, const platform::Rect &workArea);
 

@@ -13,8 +13,8 @@ namespace penwick {
 
 namespace {
 
-// A controller is often let go of inside one of its own window's events, so it leaves the screen
-// now and dies from the event loop.
+// A host often lets go of a controller inside an event of the controller's own window. So the
+// window leaves the screen at once, and both are deleted from the event loop.
 std::shared_ptr<DrawingWindowController> shared(std::unique_ptr<DrawingWindowController> controller)
 {
     if (!controller)

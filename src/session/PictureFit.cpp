@@ -25,7 +25,7 @@ PictureFit::PictureFit(platform::Window &window, platform::ImageView &view)
     : m_window(window)
     , m_view(view)
 {
-    delete view.findChild<PictureFit *>(QString(), Qt::FindDirectChildrenOnly); // of another image
+    delete view.findChild<PictureFit *>(QString(), Qt::FindDirectChildrenOnly); // another image's
     setParent(&view);
     window.installEventFilter(this);
     connect(&window, &platform::Window::frameSettled, this, &PictureFit::onSettled);
@@ -33,7 +33,7 @@ PictureFit::PictureFit(platform::Window &window, platform::ImageView &view)
 
 bool PictureFit::eventFilter(QObject *watched, QEvent *event)
 {
-    // Before the first paint, where the desktop tells the borders beforehand.
+    // Where the desktop tells the borders beforehand, this comes before the first paint.
     if (event->type() == QEvent::Resize)
         fit();
     return QObject::eventFilter(watched, event);
@@ -50,8 +50,9 @@ void PictureFit::onSettled()
 {
     const bool hasFrame = m_window.frameGeometry() != m_window.geometry();
     const auto former = std::exchange(m_settled, m_window.size());
-    // A desktop that tells nothing beforehand may still put a frame around the content, inside the
-    // frame that was asked for; one that never does leaves the content to the user's next pull.
+    // A desktop that has told no borders beforehand may still add them later, inside the frame that
+    // was asked for, and so make the content smaller. Where no borders ever come, the picture is
+    // fitted until the user pulls at an edge.
     const bool isPulled = former && *former != m_settled;
     if (!isPulled)
         fit();

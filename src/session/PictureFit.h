@@ -21,8 +21,8 @@ class PictureFit final : public QObject
     Q_OBJECT
 
 public:
-    /// Borrows `window`; `view`, which has its image and lies in `window`, owns this object, and
-    /// has one at a time.
+    /// Borrows `window`. `view` lies in `window`, has its image, and owns this object; a former
+    /// PictureFit of `view` is deleted.
     PictureFit(platform::Window &window, platform::ImageView &view);
 
     bool eventFilter(QObject *watched, QEvent *event) override;
@@ -33,7 +33,7 @@ private:
 
     platform::Window &m_window;
     platform::ImageView &m_view;
-    std::optional<QSize> m_settled; // of the content, without a frame around it
+    std::optional<QSize> m_settled; // the content's size when the window's frame was last settled
 };
 
 } // namespace penwick

@@ -19,8 +19,8 @@ namespace {
 
 constexpr double screenMargin = 20.0; // points, beside a banner as wide as the screen
 
-// Other languages have longer words for it. What not even the screen is wide enough for, the label
-// shortens.
+// The banner's words are longer in other languages. If not even the screen is wide enough for them,
+// the label shortens them.
 void growFor(const Ui::SharingNotification &scene, QWidget &window)
 {
     const double room = platform::workAreaFor({}).width - 2 * screenMargin - window.width();
@@ -39,7 +39,7 @@ std::unique_ptr<QObject> makeSharingNotificationScene()
 {
     auto window = std::make_unique<platform::Window>();
     platform::WindowAttributes attributes;
-    attributes.styleMask = 0; // nothing but its content
+    attributes.styleMask = 0; // no frame, only the content
     window->setAttributes(attributes);
     Ui::SharingNotification scene;
     scene.setupUi(window.get());

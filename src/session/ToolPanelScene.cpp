@@ -36,7 +36,7 @@ std::unique_ptr<QObject> makeToolPanelScene(const platform::Bundle &bundle)
     auto panel = std::make_unique<ToolBarPanelWindow>();
     Ui::ToolPanel scene;
     scene.setupUi(panel.get());
-    scene.grip->setAttribute(Qt::WA_TransparentForMouseEvents); // it is the handle that is dragged
+    scene.grip->setAttribute(Qt::WA_TransparentForMouseEvents); // the handle below takes them
 
     for (auto *const rounded : { scene.toolBarHandle, scene.toolPanelRoot }) {
         rounded->setWantsLayer(true);

@@ -24,15 +24,15 @@ class ToolPanelWindowController final : public platform::WindowController,
 
 public:
     ToolPanelWindowController();
-    /// The same, with a window that did not come from the scene: it is not set up, and not the
-    /// panel until setToolPanelWindow() says so.
+    /// A controller of a window that did not come from the scene. The window is not set up, and is
+    /// not the panel until setToolPanelWindow() is called with it.
     explicit ToolPanelWindowController(std::unique_ptr<platform::Window> window);
     ~ToolPanelWindowController() override;
 
     /// The panel; the scene connects it. Weak.
     [[nodiscard]] ToolBarPanelWindow *toolPanelWindow() const { return m_toolPanelWindow; }
     void setToolPanelWindow(ToolBarPanelWindow *window) { m_toolPanelWindow = window; }
-    /// A window kept for the popover, which nothing here reads; null at first. Owned.
+    /// A place to keep the popovers' window, which is not used; null at first. Owned.
     [[nodiscard]] const std::shared_ptr<platform::Window> &popoverWindow() const
     {
         return m_popoverWindow;
@@ -45,7 +45,7 @@ public:
     [[nodiscard]] ToolPanelViewController &content() const;
 
     void windowDidLoad() override;
-    /// Glides the panel inside its parent's frame; nothing without a parent.
+    /// Glides the panel into its parent's frame; does nothing without a parent.
     void adjustPosition();
     /// Moves a panel that is higher than its parent has room for so that its lower end, which ends
     /// the session, is on the screen; at once.

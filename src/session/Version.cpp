@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include <penwick/Version.h>
 
-// The build passes the project's one version. One division, so that the number is the very double
-// that its decimal spelling means.
+// The build passes the project's version. There is only one division, so that the number is exactly
+// the double nearest to its decimal spelling.
 constinit const double PenwickVersionNumber
     = (PENWICK_VERSION_MAJOR * 10000 + PENWICK_VERSION_MINOR * 100 + PENWICK_VERSION_PATCH)
     / 10000.0;
