@@ -25,8 +25,7 @@ class ToolPanelWindowController;
 /// Builds and places the drawing window and announces the end of the session when it closes.
 ///
 /// Penwick::createDrawingWindowController() makes it; the window lives as long as this object.
-/// GUI thread only: anywhere else, and where there is no QApplication, its operations stop the
-/// process.
+/// GUI thread only: on another thread, or without a QApplication, its operations stop the process.
 class PENWICK_EXPORT DrawingWindowController final : public platform::WindowController,
                                                      public platform::WindowDelegate
 {
@@ -35,8 +34,8 @@ class PENWICK_EXPORT DrawingWindowController final : public platform::WindowCont
 public:
     /// Needs a primary screen: without one the process stops.
     DrawingWindowController();
-    /// The same, with a window that did not come from the component's own scene: it is not set up,
-    /// and not the drawing window until setDrawingWindow() says so.
+    /// Takes `window`, which did not come from the component's own scene. It is not set up, and is
+    /// not the drawing window until setDrawingWindow() is called with it. Needs a primary screen.
     explicit DrawingWindowController(std::unique_ptr<platform::Window> window);
     ~DrawingWindowController() override;
 
@@ -47,15 +46,17 @@ public:
     void setDrawingWindowOrigin(const std::optional<platform::Point> &origin);
     /// The controller of the tool bar; null before the window was loaded. Owned.
     [[nodiscard]] const std::shared_ptr<ToolPanelWindowController> &tPanelWindowController() const;
-    /// The former tool bar goes unless somebody else holds it. The new one is placed, and closed
-    /// with the drawing window; whoever sets it makes its panel a child window.
+    /// Holds `controller` in place of the former one, which is destroyed unless somebody else holds
+    /// it. The new tool bar is placed and closed together with the drawing window; the caller makes
+    /// its panel a child window.
     void setTPanelWindowController(std::shared_ptr<ToolPanelWindowController> controller);
     /// The banner's window; null where it could not be loaded. Owned.
     [[nodiscard]] const std::shared_ptr<platform::Window> &sharingNotificationWindow() const;
     void setSharingNotificationWindow(std::shared_ptr<platform::Window> window);
     /// The kind of window; nothing before the window was placed.
     [[nodiscard]] std::optional<WindowType> mWindowType() const;
-    /// Records `type`, which the end of the session is told by; changes nothing of the window.
+    /// Records `type`, which the announcement of the session's end depends on; changes nothing of
+    /// the window.
     void setMWindowType(std::optional<WindowType> type);
     /// The drawing window; null once it is gone. Owned by this controller.
     [[nodiscard]] platform::Window *drawingWindow() const;
@@ -73,8 +74,8 @@ public:
     void createWindowForApplication(WindowType win_type, QScreen &screen,
         const std::optional<QImage> &annotatedImage, const std::optional<QString> &windowTitle);
 
-    /// Moves `window`'s bottom left corner to the recorded one plus that offset. Nothing recorded
-    /// yet stops the process.
+    /// Moves the bottom left corner of `window` to the recorded origin plus this offset, in points,
+    /// y up. If no origin is recorded yet, the process stops.
     void setWindowPositionRelativeToMainWindow(
         platform::Window &window, double xoffset, double yOffset);
     /// Makes `window` a transparent banner that a capture of the screen leaves out where the
@@ -90,15 +91,17 @@ public:
     void hideThePopover();
 
     void windowDidLoad() override;
-    /// Brings a window over an image inside its screen's work area, in its own shape, and the
-    /// tool bar back that went when the window was closed.
+    /// Brings a window over an image inside its screen's work area, in its own shape. Shows the
+    /// tool bar again, which went when the window was closed.
     void windowWillAppear() override;
-    /// Hides the popover, as does another window's taking over.
+    /// Hides the popover.
     void windowWillMove() override;
+    /// Hides the popover.
     void windowDidResignMain() override;
     /// Records where the window is now.
     void windowDidMove() override;
-    /// Moves the tool bar with the corner that moved, and pulls it back inside.
+    /// Moves the tool bar as far as the window's bottom left corner has moved, and then back inside
+    /// the window.
     void windowDidResize() override;
     /// Closes the tool bar and posts penwickSessionEndNotificationKey().
     void windowWillClose() override;
@@ -126,7 +129,7 @@ private:
     double m_minWindowHeight;
     std::shared_ptr<ToolPanelWindowController> m_tPanelWindowController;
     std::shared_ptr<platform::Window> m_sharingNotificationWindow;
-    bool m_isPlaced = false; // a window that has nothing to draw on is not, and has no tool bar
+    bool m_isPlaced = false; // false for a window without its image, which has no tool bar
 };
 
 } // namespace penwick

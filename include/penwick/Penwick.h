@@ -24,8 +24,8 @@ namespace penwick {
 /// The component's entry object. It holds the controller of the drawing window that it opened
 /// last, and with it the window: a second window replaces the first, and both leave the screen
 /// with this object unless the host holds their controllers. Needs a QApplication, of which it
-/// changes nothing. GUI thread only: on any other thread, and without a QApplication (one that has
-/// no widgets, as a QGuiApplication, is none), each operation stops the process.
+/// changes nothing. GUI thread only: on any other thread, and without a QApplication (a
+/// QGuiApplication, which has no widgets, is not enough), each operation stops the process.
 class PENWICK_EXPORT Penwick
 {
 public:
@@ -36,7 +36,8 @@ public:
 
     /// The controller of the drawing window opened last; null before the first.
     [[nodiscard]] std::shared_ptr<DrawingWindowController> penwickWindowController() const;
-    /// Holds `controller` in place of the one before, which goes unless somebody else holds it.
+    /// Holds `controller` in place of the one before, which is let go of: unless somebody else
+    /// holds it, its window leaves the screen.
     void setPenwickWindowController(std::shared_ptr<DrawingWindowController> controller);
 
     /// Builds and places a drawing window, which the host then shows with showWindow().

@@ -28,10 +28,11 @@ enum class LineJoinStyle
     Bevel = 2
 };
 
-/// A path that is a thing of its own: two paths with the same geometry are still two.
+/// A path with an identity: two paths with the same geometry are still two.
 ///
-/// A path of lines each of which begins, by a move, where the last one ended is a chain; what is
-/// drawn by hand is one. A chain keeps one point for each line, any other path all its elements.
+/// A path is a chain if it consists of lines alone, and each has before it a move to where the last
+/// line ended. A stroke that is drawn by hand is a chain. A chain is kept as one point for each
+/// line, any other path as all its elements.
 ///
 /// Coordinates are points, y up, in the space of whatever draws it. Never copied; shared by
 /// reference. GUI thread only.
@@ -83,16 +84,16 @@ public:
 
     /// The smallest rectangle that holds every point of the path, control points included, and so
     /// the path itself, its thickness aside. Empty at the origin for a path without elements.
-    /// Known without a walk over the path.
+    /// Costs the same for every path.
     [[nodiscard]] Rect controlPointBounds() const;
 
-    /// A new general path with the same moves, lines and curves in the same order and coordinates,
-    /// those that lead nowhere included; empty for a path without elements. Built at every call.
+    /// A new QPainterPath with the same moves, lines and curves in the same order and coordinates,
+    /// also those without length; empty for a path without elements. Built at every call.
     ///
-    /// What a QPainterPath has no element for: closing becomes a line back to where the sub-path
-    /// began, or nothing where it ends there already, and a line or curve right after it begins
-    /// with a move there. Of moves in a row only the last is kept. A path that begins with a line
-    /// or a curve begins with a move to the origin.
+    /// A QPainterPath cannot hold all elements as they are. Closing becomes a line back to where
+    /// the sub-path began, or nothing if it ends there already; a line or curve right after closing
+    /// gets a move to that place before it. Of several moves in a row only the last is kept. A path
+    /// that begins with a line or a curve gets a move to the origin before it.
     [[nodiscard]] QPainterPath CGPath() const; // NOLINT(readability-identifier-naming): fixed name
 
 private:

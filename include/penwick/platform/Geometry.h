@@ -8,7 +8,7 @@
 
 namespace penwick::platform {
 
-/// A place, in points. x to the right, y up; what the origin is, the user of the point says.
+/// A place, in points; x to the right, y up. Whoever uses a point says where its origin is.
 struct Point
 {
     double x = 0.0;

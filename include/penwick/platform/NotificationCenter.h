@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Process-wide notifications by name, delivered at once.
-// Qt's signals need the sender; here a host observes what any part of the component posts.
+// To connect to a signal of Qt's a host would need its sender, which may be inside the component.
+// Here a host names what it wants to hear of, whoever posts it.
 #pragma once
 
 #include <penwick/Export.h>

@@ -14,15 +14,16 @@ namespace penwick::platform {
 
 class Window;
 
-/// Holds a window and keeps it alive; the window goes with its controller. GUI thread only:
-/// anywhere else, and where there is no QApplication, its operations stop the process.
+/// Owns a window, which is destroyed together with its controller. GUI thread only: on another
+/// thread, or without a QApplication, its operations stop the process.
 class PENWICK_EXPORT WindowController : public QObject
 {
     Q_OBJECT
 
 public:
     WindowController();
-    /// Takes `window`, which did not come from a scene: windowDidLoad() is not run. Null: none.
+    /// Takes `window`, which may be null. It did not come from a scene, so windowDidLoad() is not
+    /// called.
     explicit WindowController(std::unique_ptr<Window> window);
     ~WindowController() override;
 
@@ -35,16 +36,17 @@ public:
     /// be. `sender` is whoever asks; it is not used.
     Q_INVOKABLE void showWindow(QObject *sender);
 
-    /// Takes the window, and the windows that belong to it, off the screen. No end is announced.
+    /// Takes the window and its child windows off the screen. Unlike Window::close() it announces
+    /// no end.
     void retire();
 
     /// The window has been loaded.
     virtual void windowDidLoad();
     /// The left button went down where no view of the window took it.
     virtual void mouseDown();
-    /// It was let go again.
+    /// The left button that mouseDown() was called for was let go again.
     virtual void mouseUp();
-    /// A key went down that no view of the window took; answers whether it does something here.
+    /// A key went down that no view of the window took. Returns whether the controller acted on it.
     virtual bool keyDown(const QKeyEvent &event);
 
 private:
