@@ -44,8 +44,8 @@ Complaint applyScreen(Options &options, const QString &value)
     return {};
 }
 
-// The component passes over what it does not know, and would leave it at that without a word. What
-// is no NAME#VALUE at all it says itself.
+// The component ignores an option that it does not know without a word, so the mistake is told
+// here. About an option that is not of the form NAME#VALUE the component prints a line itself.
 Complaint complaintAboutOption(const QString &option)
 {
     static const QStringList colors { QStringLiteral("black"), QStringLiteral("white"),

@@ -22,8 +22,8 @@ namespace {
 
 using platform::NotificationCenter;
 
-// A window that has not changed for this long has come to rest; a step of a glide or of a drag is
-// much shorter.
+// A window that has not changed for this long has come to rest. The steps of a glide or a drag
+// follow each other much faster.
 constexpr int restTime = 80; // milliseconds
 
 QSet<QString> notificationNames()
@@ -45,7 +45,7 @@ bool isWindowOfComponent(const QObject &object)
     return widget && widget->isWindow() && names.contains(widget->objectName());
 }
 
-// The widget on the screen as `window`, null if it is none of the component's.
+// The component's widget whose native window is `window`; null if there is none.
 QWidget *widgetOf(const QWindow &window)
 {
     for (QWidget *const widget : QApplication::topLevelWidgets()) {
@@ -55,7 +55,7 @@ QWidget *widgetOf(const QWindow &window)
     return nullptr;
 }
 
-// Qt keeps the place of a screen in device pixels and counts in points from there.
+// Qt gives the corner of a screen in device pixels, and counts points from that corner.
 QPointF toDevicePixels(QPointF place, const QWidget &window)
 {
     const QPointF corner = window.screen()->geometry().topLeft();
@@ -119,7 +119,7 @@ EventLog::~EventLog()
 bool EventLog::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::Expose) {
-        // The window manager's title bar has become known with it.
+        // By the first exposure the window manager's title bar is known.
         const auto *const window = qobject_cast<const QWindow *>(watched);
         if (QWidget *const widget = window ? widgetOf(*window) : nullptr)
             windowChanged(*widget);
@@ -173,7 +173,7 @@ void EventLog::windowHidden(QWidget &window)
 {
     WindowRecord &record = recordOf(window);
     record.rest->stop();
-    // A window that was hidden before it came to rest was shown all the same.
+    // A window that is hidden before it came to rest has been shown too; that is written first.
     if (record.isShownUnsaid)
         writeWindow(window, true);
     writeWindow(window, false);

@@ -35,7 +35,7 @@ private:
     {
         QTimer *rest = nullptr; // started anew by every change; owned by the log
         QByteArray lastLine;
-        bool isShownUnsaid = false; // shown, and nothing written about it yet
+        bool isShownUnsaid = false; // shown, but that is not written yet
     };
 
     void writeNotification(const platform::Notification &notification);

@@ -18,7 +18,7 @@ using platform::NotificationCenter;
 Session::Session()
     : m_penwick(std::make_unique<Penwick>())
 {
-    // Later, not now: the window is still closing and would be destroyed under its own feet.
+    // The component is dropped later, not in the notification, because the window is still closing.
     NotificationCenter::defaultCenter().addObserver(
         this, penwickSessionEndNotificationKey(), [this](const platform::Notification &) {
             writePicture();
@@ -102,7 +102,7 @@ platform::Window *Session::window() const
     return m_controller ? m_controller->drawingWindow() : nullptr;
 }
 
-// While the window is there: it goes with the session.
+// Must be called before the session is dropped, and the window with it.
 void Session::writePicture()
 {
     if (!m_pictureFile || !window() || window()->contentImage().save(*m_pictureFile))

@@ -6,14 +6,14 @@
 #include <algorithm>
 #include <stdexcept>
 
-// Last: they define words that everybody else uses too.
+// X's headers come last, because they define macros with common names, such as None.
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/Xcomposite.h>
 
 namespace {
 
-// While it lives, no window comes, goes or moves.
+// Holds the X server still: while this object lives, no window comes, goes or moves.
 class Standstill
 {
 public:
@@ -34,7 +34,7 @@ private:
     Display *const m_display;
 };
 
-// The library ends the process otherwise; here an answer that is not there says as much.
+// By default the library ends the process at an error. Here an error shows in the missing answer.
 int passOver(Display *, XErrorEvent *)
 {
     return 0;
@@ -101,7 +101,7 @@ std::vector<unsigned long> ScreenCapture::childrenOfRoot() const
     return windows;
 }
 
-// A window manager puts windows into frames of its own; what is to be left out is the frame.
+// A window manager puts a window into a frame of its own. The frame is what has to be left out.
 unsigned long ScreenCapture::childOfRootAround(unsigned long window) const
 {
     for (;;) {

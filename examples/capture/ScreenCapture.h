@@ -10,8 +10,9 @@
 // NOLINTNEXTLINE(bugprone-reserved-identifier): X's own name for what a Display points at
 struct _XDisplay;
 
-/// Puts the screen together window by window, the undermost first, as a compositing manager does:
-/// whatever lies below a window that is left out is whole. On a connection of its own.
+/// Puts the screen together window by window, the undermost first, as a compositing manager does,
+/// so that whatever lies below a window that is left out is whole. Has its own connection to the
+/// server.
 class ScreenCapture final
 {
 public:
