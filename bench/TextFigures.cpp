@@ -4,7 +4,7 @@
 #include "Figure.h"
 
 #include "appearance/PenwickBundle.h"
-#include "platform/ViewOf.h"
+#include "platform/view/ViewOf.h"
 #include "textbox/TnTextBox.h"
 
 #include <penwick/platform/Window.h>

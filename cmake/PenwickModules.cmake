@@ -26,6 +26,7 @@ endif()
 #
 # Makes the object library penwick_NAME of one folder under src/. DEPENDS names the modules whose
 # headers the folder may include, or whose artwork it shows; a test holds it against the includes.
+# SOURCES names the public headers that are the folder's too.
 function(penwick_add_module name)
   cmake_parse_arguments(arg "" "" "SOURCES;QT;DEPENDS;LIBRARIES" ${ARGN})
   add_library(penwick_${name} OBJECT ${arg_SOURCES})

@@ -2,7 +2,7 @@
 // The reference through which every part finds the component's resources.
 #pragma once
 
-#include "platform/Bundle.h"
+#include "platform/scene/Bundle.h"
 
 #include <memory>
 

@@ -2,7 +2,7 @@
 // The cursors of the tools.
 #pragma once
 
-#include "platform/Cursor.h"
+#include "platform/view/Cursor.h"
 
 #include <QString>
 

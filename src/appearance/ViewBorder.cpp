@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "appearance/ViewBorder.h"
 
-#include "platform/View.h"
+#include "platform/view/View.h"
 
 namespace penwick {
 

@@ -9,6 +9,7 @@
 #include "history/UndoRedoManager.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/StandardOutput.h"
+#include "platform/view/ViewHost.h"
 #include "textbox/TnTextBox.h"
 
 #include <penwick/platform/Window.h>
@@ -173,7 +174,7 @@ void DrawViewController::didClearCanvas()
 void DrawViewController::shouldDeleteTheTextBox(std::int64_t withHash)
 {
     model().deleteTextBoxWith(withHash);
-    if (platform::Window *const window = canvas().window())
+    if (platform::ViewHost *const window = canvas().window())
         window->makeFirstResponder(window->contentView());
     updateDrawingCanvasViewForDisplay();
 }
@@ -222,7 +223,7 @@ void DrawViewController::handleToolSelection(const QString &selectedTool)
     if (selectedTool == Tools::color) {
         goBackToDrawing(); // the colour itself is chosen in a popover
     } else if (selectedTool == Tools::text) {
-        if (platform::Window *const window = view.window())
+        if (platform::ViewHost *const window = view.window())
             window->makeFirstResponder(&view);
         selectDrawingTool(selectedTool, QStringLiteral("Text_Cursor"));
     } else if (selectedTool == Tools::brush) {
@@ -254,8 +255,8 @@ void DrawViewController::selectDrawingTool(const QString &tool, const QString &c
 void DrawViewController::setCursor(const platform::Cursor &cursor)
 {
     canvas().setCursorType(cursor);
-    if (platform::Window *const window = canvas().window())
-        window->invalidateCursorRects(canvas());
+    if (canvas().window())
+        canvas().refreshCursorRects();
 }
 
 void DrawViewController::clearIfThereIsAnything()

@@ -5,8 +5,8 @@
 #include "canvas/DrawingCanvasDelegate.h"
 #include "canvas/ToolSelectionDelegate.h"
 #include "history/SubviewOperation.h"
-#include "platform/ImageView.h"
-#include "platform/ViewController.h"
+#include "platform/view/ImageView.h"
+#include "platform/view/ViewController.h"
 #include "textbox/TextBoxDelegate.h"
 
 #include <penwick/platform/NotificationCenter.h>

@@ -5,6 +5,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/ToolSelectionDelegate.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/view/ViewHost.h"
 #include "textbox/TnTextBox.h"
 
 #include <QGuiApplication>
@@ -126,7 +127,7 @@ void DrawingCanvasView::chooseTool(const QString &tool)
 
 void DrawingCanvasView::mouseDown(const platform::MouseEvent &event)
 {
-    platform::Window &ownWindow = *require(window(), "a canvas was pressed outside a window");
+    platform::ViewHost &ownWindow = *require(window(), "a canvas was pressed outside a window");
     m_eraserPlace = convertTo(event.locationInWindow, nullptr);
     followPenEnd(event.penEnd);
     if (ownWindow.isKeyWindow() && m_popoverWindow) {
@@ -261,7 +262,7 @@ void DrawingCanvasView::takeArraysAnew()
 
 void DrawingCanvasView::placeTextBox(Point point)
 {
-    platform::Window *const ownWindow = window();
+    platform::ViewHost *const ownWindow = window();
     if (!ownWindow || ownWindow->firstResponder() != this) {
         if (ownWindow)
             ownWindow->makeFirstResponder(this); // the click only ends the editing of a box
@@ -304,7 +305,7 @@ void DrawingCanvasView::setCoversWindow(bool covers)
 
 QColor DrawingCanvasView::paper() const
 {
-    return m_coversWindow && window() ? window()->attributes().backgroundColor : Qt::transparent;
+    return m_coversWindow && window() ? window()->backgroundColor() : Qt::transparent;
 }
 
 QSize DrawingCanvasView::pixelSize() const

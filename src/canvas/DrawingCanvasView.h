@@ -5,8 +5,8 @@
 #include "canvas/DrawingCanvasDelegate.h"
 #include "canvas/ToolChooser.h"
 #include "content/CanvasContent.h"
-#include "platform/ViewOf.h"
-#include "platform/WeakReference.h"
+#include "platform/foundation/WeakReference.h"
+#include "platform/view/ViewOf.h"
 #include "strokes/StrokePicture.h"
 
 #include <penwick/platform/Window.h>

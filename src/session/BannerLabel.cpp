@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "session/BannerLabel.h"
 
-#include "platform/OwnLook.h"
+#include "platform/view/OwnLook.h"
 
 #include <QFontMetricsF>
 #include <QPainterPath>

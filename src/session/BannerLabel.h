@@ -2,7 +2,7 @@
 // The words on the banner.
 #pragma once
 
-#include "platform/ViewOf.h"
+#include "platform/view/ViewOf.h"
 
 #include <QFont>
 #include <QString>

@@ -2,7 +2,7 @@
 // The component's own resources, with every scene that its parts ask for.
 #pragma once
 
-#include "platform/Bundle.h"
+#include "platform/scene/Bundle.h"
 
 #include <memory>
 

@@ -4,12 +4,12 @@
 #include <penwick/DrawingWindowController.h>
 
 #include "canvas/DrawingCanvasView.h"
-#include "platform/KeptShape.h"
-#include "platform/OneShotTimer.h"
-#include "platform/WorkArea.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
+#include "platform/foundation/KeptShape.h"
+#include "platform/foundation/OneShotTimer.h"
 #include "platform/foundation/StandardOutput.h"
+#include "platform/window/WorkArea.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
 #include "toolpanel/ToolPanelViewController.h"

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "session/PanelClamp.h"
 
-#include "platform/WorkArea.h"
+#include "platform/foundation/Placement.h"
 
 namespace penwick {
 

@@ -3,10 +3,10 @@
 
 #include "appearance/PenwickBundle.h"
 #include "history/NotificationNames.h"
-#include "platform/Storyboard.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
 #include "platform/foundation/StandardOutput.h"
+#include "platform/scene/Storyboard.h"
 #include "session/ComponentBundle.h"
 
 namespace penwick {

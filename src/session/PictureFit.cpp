@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "session/PictureFit.h"
 
-#include "platform/ImageView.h"
-#include "platform/KeptShape.h"
+#include "platform/foundation/KeptShape.h"
+#include "platform/view/ImageView.h"
 
 #include <penwick/platform/Window.h>
 

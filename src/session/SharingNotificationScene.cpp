@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "session/SharingNotificationScene.h"
 
-#include "platform/PlainView.h"
-#include "platform/WorkArea.h"
+#include "platform/view/PlainView.h"
+#include "platform/window/WorkArea.h"
 #include "session/BannerLabel.h"
 #include "session/SharingNotificationViewController.h"
 

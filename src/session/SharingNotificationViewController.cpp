@@ -2,7 +2,7 @@
 #include "session/SharingNotificationViewController.h"
 
 #include "appearance/ViewBorder.h"
-#include "platform/View.h"
+#include "platform/view/View.h"
 
 namespace penwick {
 

@@ -2,7 +2,7 @@
 // The content of the banner that announces sharing.
 #pragma once
 
-#include "platform/ViewController.h"
+#include "platform/view/ViewController.h"
 
 namespace penwick {
 

@@ -2,7 +2,8 @@
 #include "session/ToolPanelScene.h"
 
 #include "appearance/Theme.h"
-#include "platform/PlainView.h"
+#include "platform/scene/ButtonImages.h"
+#include "platform/view/PlainView.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
 #include "toolpanel/ToolPanelViewController.h"
@@ -45,7 +46,7 @@ std::unique_ptr<QObject> makeToolPanelScene(const platform::Bundle &bundle)
 
     auto content = std::make_unique<ToolPanelViewController>();
     for (auto *const button : panel->findChildren<platform::Button *>()) {
-        button->loadImages(bundle);
+        platform::loadImages(*button, bundle);
         button->setAction([bar = content.get()](
                               platform::Button &sender) { bar->OnToolBarItemSelection(sender); });
     }

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "session/ToolPanelWindowController.h"
 
-#include "platform/OneShotTimer.h"
-#include "platform/WindowFlags.h"
-#include "platform/WorkArea.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/OneShotTimer.h"
+#include "platform/window/WindowFlags.h"
+#include "platform/window/WorkArea.h"
 #include "session/PanelClamp.h"
 #include "toolpanel/ToolPanelViewController.h"
 

@@ -2,7 +2,7 @@
 // The mark beside a text box that deletes it.
 #pragma once
 
-#include "platform/Button.h"
+#include "platform/view/Button.h"
 
 namespace penwick {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/TextBoxFont.h"
 
-#include "platform/OwnLook.h"
+#include "platform/view/OwnLook.h"
 
 #include <QFontDatabase>
 #include <QStringList>

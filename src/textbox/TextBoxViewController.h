@@ -2,7 +2,7 @@
 // The controller of a scene that holds a text box.
 #pragma once
 
-#include "platform/ViewController.h"
+#include "platform/view/ViewController.h"
 
 namespace penwick {
 

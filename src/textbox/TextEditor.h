@@ -2,8 +2,8 @@
 // The editor under a text box: plain text in one font and colour, with a caret of its own.
 #pragma once
 
-#include "platform/OwnLook.h"
-#include "platform/ViewOf.h"
+#include "platform/view/OwnLook.h"
+#include "platform/view/ViewOf.h"
 #include "textbox/EditorHiding.h"
 #include "textbox/PlacedSelection.h"
 #include "textbox/TextCaret.h"

@@ -5,14 +5,13 @@
 #include "appearance/ToolCursors.h"
 #include "appearance/ViewBorder.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/view/ViewHost.h"
 #include "textbox/TextBoxFont.h"
 #include "textbox/TextBoxLayout.h"
 #include "textbox/TextBoxNotice.h"
 #include "textbox/TextBoxPlace.h"
 #include "textbox/TextComposition.h"
 #include "textbox/TextEditing.h"
-
-#include <penwick/platform/Window.h>
 
 #include <QPainterPath>
 #include <QScrollBar>
@@ -188,14 +187,14 @@ void TnTextBox::mouseDown(const platform::MouseEvent &event)
         showDeleteTextButton();
         setNeedsDisplay();
     }
-    if (platform::Window *const ownWindow = window())
+    if (platform::ViewHost *const ownWindow = window())
         ownWindow->makeFirstResponder(this);
     TextEditor::mouseDown(event);
 }
 
 void TnTextBox::mouseUp(const platform::MouseEvent &)
 {
-    if (platform::Window *const ownWindow = window())
+    if (platform::ViewHost *const ownWindow = window())
         ownWindow->makeFirstResponder(this);
 }
 
@@ -213,7 +212,7 @@ void TnTextBox::mouseMoved(const platform::MouseEvent &)
 
 void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)
 {
-    platform::Window *const ownWindow = window();
+    platform::ViewHost *const ownWindow = window();
     if (!ownWindow)
         return;
     const Point location = gesture.locationIn(ownWindow->contentView());
@@ -236,7 +235,7 @@ void TnTextBox::keyUp(const platform::KeyEvent &event)
 
 void TnTextBox::endEditing()
 {
-    if (platform::Window *const ownWindow = window())
+    if (platform::ViewHost *const ownWindow = window())
         ownWindow->makeFirstResponder(superview());
 }
 

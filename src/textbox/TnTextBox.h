@@ -2,9 +2,9 @@
 // Text on a canvas: edited, placed, moved and deleted where it stands.
 #pragma once
 
-#include "platform/AttributedString.h"
-#include "platform/PanGestureRecognizer.h"
-#include "platform/WeakReference.h"
+#include "platform/foundation/WeakReference.h"
+#include "platform/view/AttributedString.h"
+#include "platform/view/PanGestureRecognizer.h"
 #include "textbox/DeleteTextBoxButton.h"
 #include "textbox/TextBoxDelegate.h"
 #include "textbox/TextEditor.h"

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "toolpanel/PopoverInterface.h"
 
-#include "platform/PlainView.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/scene/ButtonImages.h"
+#include "platform/view/PlainView.h"
 #include "toolpanel/PopoverView.h"
 #include "toolpanel/PopoverViewController.h"
 #include "toolpanel/ToolOptionsButton.h"
@@ -19,7 +20,7 @@ std::unique_ptr<PopoverView> taken(
     PopoverView &popover, PopoverViewController &owner, const platform::Bundle &bundle)
 {
     for (auto *const option : popover.findChildren<ToolOptionsButton *>()) {
-        option->loadImages(bundle);
+        platform::loadImages(*option, bundle);
         option->setAction(
             [&owner](platform::Button &sender) { owner.OnToolOptionSelection(sender); });
     }

@@ -2,7 +2,7 @@
 // The content of a popover.
 #pragma once
 
-#include "platform/ViewOf.h"
+#include "platform/view/ViewOf.h"
 
 #include <QWidget>
 

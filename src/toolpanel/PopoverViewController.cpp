@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "toolpanel/PopoverViewController.h"
 
-#include "platform/Bundle.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/scene/Bundle.h"
 #include "toolpanel/PopoverView.h"
 #include "toolpanel/ToolOptionsButton.h"
 

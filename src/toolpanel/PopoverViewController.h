@@ -3,8 +3,8 @@
 #pragma once
 
 #include "canvas/ToolSelectionDelegate.h"
-#include "platform/ViewController.h"
-#include "platform/WeakReference.h"
+#include "platform/foundation/WeakReference.h"
+#include "platform/view/ViewController.h"
 #include "toolpanel/ToolPanelOptionDelegate.h"
 
 #include <QPointer>

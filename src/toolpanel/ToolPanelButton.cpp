@@ -2,7 +2,7 @@
 #include "toolpanel/ToolPanelButton.h"
 
 #include "appearance/Theme.h"
-#include "platform/Workspace.h"
+#include "platform/view/Workspace.h"
 
 #include <QPainterPath>
 

@@ -2,8 +2,8 @@
 // A button of the tool bar.
 #pragma once
 
-#include "platform/Button.h"
-#include "platform/TrackingArea.h"
+#include "platform/view/Button.h"
+#include "platform/view/TrackingArea.h"
 
 #include <optional>
 

@@ -3,8 +3,8 @@
 #include "toolpanel/ToolPanelViewController.h"
 
 #include "canvas/DrawingCanvasView.h"
-#include "platform/View.h"
-#include "platform/ViewInput.h"
+#include "platform/view/View.h"
+#include "platform/view/ViewInput.h"
 #include "toolpanel/ToolKeys.h"
 #include "toolpanel/ToolPanelButton.h"
 
@@ -21,9 +21,10 @@ void ToolPanelViewController::followInput()
     connect(&input, &platform::ViewInput::keyPressed, this, &ToolPanelViewController::onKeyPressed);
 }
 
-bool ToolPanelViewController::isOwnWindow(const platform::Window *window) const
+bool ToolPanelViewController::isInOwnWindow(const platform::View &pressed) const
 {
-    return window && (window == view()->window() || window == m_popoverW.get());
+    const QWidget *const window = pressed.widget().window();
+    return window == view()->widget().window() || window == m_popoverW.get();
 }
 
 DrawingCanvasView *ToolPanelViewController::canvasIfAny() const
@@ -38,7 +39,7 @@ void ToolPanelViewController::onPressed(const platform::View &view)
     const DrawingCanvasView *const canvas = canvasIfAny();
     if (canvas && canvas->hasPlacedTextBox(view))
         m_keyRest.placedBoxPressed();
-    else if (isOwnWindow(view.window()) || (canvas && view.window() == canvas->window()))
+    else if (isInOwnWindow(view) || (canvas && view.window() == canvas->window()))
         m_keyRest.pointerPressed();
 }
 

@@ -7,13 +7,14 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
 #include "history/NotificationNames.h"
-#include "platform/OwnLook.h"
-#include "platform/PlainView.h"
-#include "platform/WindowFlags.h"
-#include "platform/WorkArea.h"
-#include "platform/Workspace.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/foundation/Placement.h"
 #include "platform/foundation/StandardOutput.h"
+#include "platform/view/OwnLook.h"
+#include "platform/view/PlainView.h"
+#include "platform/view/Workspace.h"
+#include "platform/window/WindowFlags.h"
+#include "platform/window/WorkArea.h"
 #include "toolpanel/PopoverView.h"
 #include "toolpanel/PopoverViewController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -62,7 +63,8 @@ ToolPanelButton *ToolPanelViewController::button(const QString &identifier) cons
 platform::Window &ToolPanelViewController::panelWindow() const
 {
     const platform::View *const root = require(view(), "the tool panel has no view");
-    return *require(root->window(), "the tool panel is in no window");
+    return *require(qobject_cast<platform::Window *>(root->widget().window()),
+        "the tool panel is in no window");
 }
 
 DrawingCanvasView &ToolPanelViewController::canvas() const

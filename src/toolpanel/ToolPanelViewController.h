@@ -4,8 +4,8 @@
 
 #include "canvas/ToolChooser.h"
 #include "canvas/ToolSelectionDelegate.h"
-#include "platform/ViewController.h"
-#include "platform/WeakReference.h"
+#include "platform/foundation/WeakReference.h"
+#include "platform/view/ViewController.h"
 #include "toolpanel/PopoverChoice.h"
 #include "toolpanel/ToolKeyRest.h"
 #include "toolpanel/ToolPanelOptionDelegate.h"
@@ -143,7 +143,7 @@ private:
     void showPopoverFor(const QString &identifier, const QString &toolBefore);
     void restoreSelection();
     bool performPopoverKey(const QKeyEvent &event);
-    [[nodiscard]] bool isOwnWindow(const platform::Window *window) const;
+    [[nodiscard]] bool isInOwnWindow(const platform::View &pressed) const;
     [[nodiscard]] platform::Window &panelWindow() const;
     [[nodiscard]] DrawingCanvasView *canvasIfAny() const;
     [[nodiscard]] DrawingCanvasView &canvas() const;

@@ -3,7 +3,7 @@
 #include "appearance/ViewBorder.h"
 
 #include "appearance/Theme.h"
-#include "platform/ViewOf.h"
+#include "platform/view/ViewOf.h"
 
 #include <QTest>
 #include <QWidget>

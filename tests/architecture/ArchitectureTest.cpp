@@ -112,8 +112,8 @@ TEST(Architecture, treeWasFound)
     EXPECT_EQ(tree().modules().count("foundation"), 1U);
     EXPECT_EQ(tree().modules().at("foundation").folder, "src/platform/foundation");
     EXPECT_EQ(tree().moduleOf("src/platform/foundation/FatalError.h"), "foundation");
-    EXPECT_EQ(tree().moduleOf("src/platform/View.h"), "platform");
-    EXPECT_EQ(tree().moduleOf("include/penwick/platform/Window.h"), "platform");
+    EXPECT_EQ(tree().moduleOf("src/platform/view/View.h"), "view");
+    EXPECT_EQ(tree().moduleOf("include/penwick/platform/Window.h"), "window");
     EXPECT_EQ(tree().moduleOf("include/penwick/platform/NotificationCenter.h"), "foundation");
     EXPECT_EQ(tree().moduleOf("include/penwick/Penwick.h"), "session");
 }
@@ -121,7 +121,7 @@ TEST(Architecture, treeWasFound)
 TEST(Architecture, foldersIncludeOnlyWhatTheyDependOn)
 {
     Findings findings;
-    for (const std::string &file : files({ "src" })) {
+    for (const std::string &file : files({ "src", "include" })) {
         const std::string own = tree().moduleOf(file);
         ASSERT_NE(own, "") << file << " belongs to no module";
         const Module &module = tree().modules().at(own);

@@ -62,12 +62,15 @@ void SourceTree::readModule(const std::string &file, const std::string &text)
     words >> module.name;
     module.folder = file.substr(0, file.rfind('/'));
     const std::set<std::string> keywords { "SOURCES", "QT", "DEPENDS", "LIBRARIES" };
+    const std::string fromRoot = "${PROJECT_SOURCE_DIR}/";
     std::string keyword;
     for (std::string word; words >> word;) {
         if (keywords.count(word))
             keyword = word;
         else if (keyword == "DEPENDS")
             module.depends.insert(word);
+        else if (keyword == "SOURCES" && startsWith(word, fromRoot + "include/"))
+            module.publicHeaders.insert(word.substr(fromRoot.size()));
     }
     m_modules.emplace(module.name, module);
 }
@@ -121,16 +124,10 @@ std::string SourceTree::resolved(const Include &include, const std::string &file
 
 std::string SourceTree::moduleOf(const std::string &file) const
 {
-    if (startsWith(file, "include/")) {
-        const std::string stem = fs::path(file).stem().string();
-        for (const auto &[name, text] : m_texts) {
-            if (startsWith(name, "src/") && fs::path(name).filename() == stem + ".cpp")
-                return moduleOf(name);
-        }
-        return {};
-    }
     const Module *nearest = nullptr;
     for (const auto &[name, module] : m_modules) {
+        if (module.publicHeaders.count(file))
+            return name;
         if (startsWith(file, module.folder + '/')
             && (!nearest || module.folder.size() > nearest->folder.size()))
             nearest = &module;

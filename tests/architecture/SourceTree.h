@@ -22,6 +22,7 @@ struct Module
     std::string name;
     std::string folder; ///< from the root, for example "src/platform/foundation"
     std::set<std::string> depends; ///< names of the modules whose headers it may include
+    std::set<std::string> publicHeaders; ///< those of include/ that its sources name
 };
 
 /// The text files of the project, read when it is made. Paths are from the root, with slashes.
@@ -41,8 +42,8 @@ public:
 
     /// All modules, by name.
     [[nodiscard]] const std::map<std::string, Module> &modules() const { return m_modules; }
-    /// Name of the module that `file` belongs to. A public header belongs to the module that has
-    /// its source file. Empty for what belongs to none.
+    /// Name of the module that `file` belongs to. A public header belongs to the module that
+    /// names it among its sources. Empty for what belongs to none.
     [[nodiscard]] std::string moduleOf(const std::string &file) const;
 
 private:

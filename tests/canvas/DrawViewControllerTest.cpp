@@ -4,7 +4,7 @@
 #include "canvas/CanvasFixture.h"
 
 #include "history/NotificationNames.h"
-#include "platform/ImageView.h"
+#include "platform/view/ImageView.h"
 
 #include <penwick/platform/NotificationCenter.h>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Resources by name.
-#include "platform/Bundle.h"
+#include "platform/scene/Bundle.h"
 
 #include "platform/SvgFile.h"
 

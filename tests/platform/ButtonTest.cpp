@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: MIT
 // A button: what it does when it is pressed and what it shows.
-#include "platform/Button.h"
+#include "platform/view/Button.h"
 
-#include "platform/Bundle.h"
 #include "platform/SvgFile.h"
 #include "platform/ViewFixture.h"
+#include "platform/scene/Bundle.h"
+#include "platform/scene/ButtonImages.h"
 
 #include <QAccessible>
 #include <QPixmap>
@@ -230,7 +231,7 @@ TEST_F(ButtonTest, imagesAreLoadedByTheirNames)
     m_button->setImageName(QStringLiteral("Artwork"));
     m_button->setAlternateImage(icon(Qt::blue));
 
-    m_button->loadImages(Bundle(artwork.folder()));
+    loadImages(*m_button, Bundle(artwork.folder()));
 
     EXPECT_EQ(picture().pixelColor(15, 10), QColor(Qt::red));
     EXPECT_EQ(picture().pixelColor(25, 10), QColor(Qt::white));

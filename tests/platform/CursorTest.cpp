@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A cursor's hot spot and pixels at each scale, and its identity.
-#include "platform/Cursor.h"
+#include "platform/view/Cursor.h"
 
 #include "platform/RecordingView.h"
 #include "platform/SvgFile.h"

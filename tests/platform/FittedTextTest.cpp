@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Texts in places that are too narrow for them.
-#include "platform/FittedText.h"
+#include "platform/view/FittedText.h"
 
-#include "platform/OwnLook.h"
+#include "platform/view/OwnLook.h"
 
 #include <QFontMetricsF>
 

@@ -2,7 +2,7 @@
 // A desktop of which a test says every word.
 #pragma once
 
-#include "platform/FrameNegotiation.h"
+#include "platform/window/FrameNegotiation.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Which of a window's movements are told, and in which order.
-#include "platform/FrameTracker.h"
+#include "platform/window/FrameTracker.h"
 
 #include <QCoreApplication>
 #include <QTest>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A still image in the corner from which drawings count.
-#include "platform/ImageView.h"
+#include "platform/view/ImageView.h"
 
 #include <QPainter>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Frames and pictures that keep a shape.
-#include "platform/KeptShape.h"
+#include "platform/foundation/KeptShape.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A layer's pixels.
-#include "platform/Layer.h"
+#include "platform/view/Layer.h"
 
 #include <QImage>
 #include <QPainter>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a host's style does to a view or a window is taken back.
-#include "platform/OwnLook.h"
-#include "platform/PlainView.h"
+#include "platform/view/OwnLook.h"
+#include "platform/view/PlainView.h"
 
 #include <penwick/platform/Window.h>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A drag told from a click, by the steps that it runs.
-#include "platform/PanGestureRecognizer.h"
+#include "platform/view/PanGestureRecognizer.h"
 
 #include "platform/ViewFixture.h"
 

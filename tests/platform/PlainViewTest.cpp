@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A view that only groups others.
-#include "platform/PlainView.h"
+#include "platform/view/PlainView.h"
 
 #include "platform/ViewFixture.h"
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Which events go on with a contact, and when a press is a drag.
-#include "platform/PointerContact.h"
+#include "platform/view/PointerContact.h"
 
 #include <gtest/gtest.h>
 

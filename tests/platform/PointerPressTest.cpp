@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What waits until the pointer is let go.
-#include "platform/PointerPress.h"
+#include "platform/view/PointerPress.h"
 
 #include "platform/ViewFixture.h"
 

@@ -2,7 +2,7 @@
 // A plain view that writes down what reaches it.
 #pragma once
 
-#include "platform/ViewOf.h"
+#include "platform/view/ViewOf.h"
 
 #include <QWidget>
 

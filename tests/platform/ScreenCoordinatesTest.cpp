@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Between Qt's desktop and points that count upwards, on two screens.
-#include "platform/ScreenCoordinates.h"
+#include "platform/window/ScreenCoordinates.h"
 
 #include <penwick/platform/Window.h>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Scenes by identifier: a missing one and one of another class.
-#include "platform/Storyboard.h"
+#include "platform/scene/Storyboard.h"
 
-#include "platform/Bundle.h"
+#include "platform/scene/Bundle.h"
 
 #include <QTimer>
 #include <QWindow>

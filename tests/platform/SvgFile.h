@@ -2,7 +2,7 @@
 // Artwork for tests, in a folder that goes with it.
 #pragma once
 
-#include "platform/SvgIconEngine.h"
+#include "platform/scene/SvgIconEngine.h"
 
 #include <QFile>
 #include <QIcon>

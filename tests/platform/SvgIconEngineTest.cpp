@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Artwork is rendered for the pixels it is asked for.
-#include "platform/SvgIconEngine.h"
+#include "platform/scene/SvgIconEngine.h"
 
 #include "platform/SvgFile.h"
 

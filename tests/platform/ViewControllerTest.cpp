@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A view controller, alone and as a window's content.
-#include "platform/ViewController.h"
+#include "platform/view/ViewController.h"
 
 #include "platform/RecordingView.h"
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // What is told of presses and keys before the view itself hears of them.
-#include "platform/ViewInput.h"
+#include "platform/view/ViewInput.h"
 
-#include "platform/Button.h"
-#include "platform/PlainView.h"
+#include "platform/view/Button.h"
+#include "platform/view/PlainView.h"
 
 #include <QTest>
 

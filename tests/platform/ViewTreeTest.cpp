@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Subviews: their order, who keeps them, and what happens when they leave.
 #include "platform/ViewFixture.h"
+#include "platform/view/ViewHost.h"
 
 #include <QPointer>
 
@@ -145,7 +146,7 @@ TEST_F(ViewTree, viewThatComesBackIsSeenAgainWhereItWas)
 
     EXPECT_TRUE(view->isVisible());
     EXPECT_EQ(view->geometry(), QRect(10, 40, 30, 40));
-    EXPECT_EQ(view->window(), &m_window);
+    EXPECT_EQ(view->window(), ViewHost::of(m_window));
     EXPECT_EQ(view->take(), (Log { "left", "came" }));
 }
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // A reference that its target may leave.
-#include "platform/WeakReference.h"
+#include "platform/foundation/WeakReference.h"
 
 #include <gtest/gtest.h>
 

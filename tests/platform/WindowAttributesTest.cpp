@@ -2,7 +2,7 @@
 // A window's attributes: kept as they are set, and what they do to the widget.
 #include "platform/WindowFixture.h"
 
-#include "platform/WindowFlags.h"
+#include "platform/window/WindowFlags.h"
 
 #include <QImage>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What each attribute of a window means in Qt's words.
-#include "platform/WindowFlags.h"
+#include "platform/window/WindowFlags.h"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // What becomes of a window that the user pulls out of its shape.
-#include "platform/WindowShape.h"
-#include "platform/FrameTracker.h"
+#include "platform/window/WindowShape.h"
 #include "platform/WindowFixture.h"
+#include "platform/window/FrameTracker.h"
 
 #include <QWindow>
 

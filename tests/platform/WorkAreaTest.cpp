@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Where a window that is shown stands: inside its screen's work area, beside what must stay free.
-#include "platform/WorkArea.h"
+#include "platform/window/WorkArea.h"
+
+#include "platform/foundation/Placement.h"
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 // A private bus with a portal in a process of its own, for the tests of the workspace.
 #pragma once
 
-#include "platform/Workspace.h"
+#include "platform/view/Workspace.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>

@@ -3,8 +3,8 @@
 #include "session/SessionFixture.h"
 
 #include "appearance/PenwickBundle.h"
-#include "platform/Bundle.h"
-#include "platform/ViewController.h"
+#include "platform/scene/Bundle.h"
+#include "platform/view/ViewController.h"
 #include "session/DrawingWindowScene.h"
 #include "session/ToolPanelScene.h"
 

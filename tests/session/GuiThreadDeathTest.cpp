@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Every public operation of the entry object, the controllers and the windows, called from another
 // thread than the application's: the process ends with a line that says so.
-#include "platform/ViewController.h"
+#include "platform/view/ViewController.h"
 #include "session/SessionFixture.h"
 
 #include <penwick/platform/WindowController.h>

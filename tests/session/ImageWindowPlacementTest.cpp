@@ -3,7 +3,7 @@
 #include "session/SessionFixture.h"
 
 #include "canvas/DrawViewController.h"
-#include "platform/View.h"
+#include "platform/view/View.h"
 #include "session/PictureFit.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"

@@ -2,7 +2,7 @@
 // The banner over a drawing window: what it looks like, when it comes and when it goes.
 #include "session/SessionFixture.h"
 
-#include "platform/View.h"
+#include "platform/view/View.h"
 
 #include <QPixmap>
 #include <QTest>

@@ -3,7 +3,7 @@
 #include "session/SessionFixture.h"
 
 #include "canvas/DrawViewController.h"
-#include "platform/View.h"
+#include "platform/view/View.h"
 #include "session/ToolPanelWindowController.h"
 
 #include <QElapsedTimer>

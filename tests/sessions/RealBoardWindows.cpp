@@ -2,7 +2,7 @@
 // The component's windows: shown, hidden, moved, and told what a desktop tells.
 #include "sessions/RealBoard.h"
 
-#include "platform/Clock.h"
+#include "platform/foundation/Clock.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelViewController.h"
 

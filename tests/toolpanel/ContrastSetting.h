@@ -2,7 +2,7 @@
 // The desktop's increase-contrast setting, in a test's hand.
 #pragma once
 
-#include "platform/Workspace.h"
+#include "platform/view/Workspace.h"
 
 #include <QDBusMessage>
 #include <QDBusVariant>

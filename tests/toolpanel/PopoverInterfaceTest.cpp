@@ -4,7 +4,7 @@
 
 #include "appearance/PenwickBundle.h"
 #include "appearance/Theme.h"
-#include "platform/PlainView.h"
+#include "platform/view/PlainView.h"
 
 #include <QAccessible>
 

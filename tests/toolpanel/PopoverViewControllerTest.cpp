@@ -2,7 +2,7 @@
 // A choice in a popover: who hears of it, in which order, and what stays selected.
 #include "toolpanel/ToolPanelFixture.h"
 
-#include "platform/PlainView.h"
+#include "platform/view/PlainView.h"
 
 namespace penwick::test {
 

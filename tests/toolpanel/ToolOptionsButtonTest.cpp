@@ -2,7 +2,7 @@
 // Option buttons: their colours, and one of many selected.
 #include "toolpanel/ToolOptionsButton.h"
 #include "appearance/Theme.h"
-#include "platform/PlainView.h"
+#include "platform/view/PlainView.h"
 #include "toolpanel/ButtonLook.h"
 #include "toolpanel/ContrastSetting.h"
 #include "toolpanel/PopoverView.h"

@@ -3,8 +3,8 @@
 #include "toolpanel/ToolPanelFixture.h"
 
 #include "appearance/PenwickBundle.h"
-#include "platform/Bundle.h"
-#include "platform/PlainView.h"
+#include "platform/scene/Bundle.h"
+#include "platform/view/PlainView.h"
 #include "session/ToolPanelScene.h"
 #include "toolpanel/PopoverInterface.h"
 

@@ -2,7 +2,7 @@
 // What a native window is to be sent, computed where every platform can test it.
 #pragma once
 
-#include <penwick/platform/Window.h>
+#include <penwick/platform/WindowAttributes.h>
 
 namespace penwick::platform {
 

@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: MIT
+// What a view may know of the window that it is in.
+#pragma once
+
+#include <QColor>
+#include <QObject>
+
+class QWidget;
+
+namespace penwick::platform {
+
+class View;
+
+/// A window as its views see it: who has the keys, and what they stand on. Each window that holds
+/// views has one, among its children. GUI thread only.
+class ViewHost : public QObject
+{
+    Q_OBJECT
+
+public:
+    /// Of the window that `widget` is in; null where that holds no views.
+    [[nodiscard]] static ViewHost *of(const QWidget &widget);
+
+    ~ViewHost() override;
+
+    /// The view that fills the window; null without one.
+    [[nodiscard]] virtual View *contentView() const = 0;
+    /// Who gets the keys. Null: the window itself. Kept while the window is not active.
+    [[nodiscard]] virtual View *firstResponder() const = 0;
+    /// Makes `view` (null: the window itself) the first responder after the present one resigned.
+    /// Answers whether it is the first responder now.
+    virtual bool makeFirstResponder(View *view) = 0;
+    /// Whether this is the window that gets the keys.
+    [[nodiscard]] virtual bool isKeyWindow() const = 0;
+    /// What the window shows where no view paints.
+    [[nodiscard]] virtual QColor backgroundColor() const = 0;
+    /// Closes the window, as its user would.
+    virtual void close() = 0;
+    /// `view` leaves the window, or is being destroyed.
+    virtual void forgetView(const View &view) = 0;
+
+protected:
+    /// `window` is the top-level widget; it has the new object among its children.
+    explicit ViewHost(QWidget &window);
+};
+
+} // namespace penwick::platform

@@ -1,0 +1,130 @@
+// SPDX-License-Identifier: MIT
+#include "platform/window/CaptureExclusion.h"
+
+#include "platform/foundation/GuiThread.h"
+#include "platform/native/NativeDesktop.h"
+#include "platform/native/NativeWindowValues.h"
+#include "platform/window/WindowPrivate.h"
+
+#include <QEvent>
+
+#include <algorithm>
+
+namespace penwick::platform {
+
+namespace {
+
+bool isNotToBeSeen(const Window &window)
+{
+    return nativeWindowValues(window.attributes()).isLeftOutOfCaptures;
+}
+
+} // namespace
+
+bool Window::isKeptOutOfCaptures() const
+{
+    requireGuiThread();
+    return isNotToBeSeen(*this) && NativeDesktop::instance().keepsWindowsOutOfCaptures();
+}
+
+std::vector<WId> Window::windowsToLeaveOutOfCaptures() const
+{
+    requireGuiThread();
+    return d->captures.identifiers();
+}
+
+void Window::expectChildWindow(Window &child)
+{
+    requireGuiThread();
+    d->captures.add(child.d->captures);
+}
+
+CaptureExclusion::CaptureExclusion(Window &window)
+    : m_window(window)
+{
+    window.installEventFilter(this);
+}
+
+void CaptureExclusion::add(CaptureExclusion &child)
+{
+    if (child.m_parent == this)
+        return;
+    if (CaptureExclusion *const former = child.m_parent) {
+        std::erase(former->m_children, &child);
+        child.disconnect(former);
+        child.m_parent = nullptr;
+        former->check();
+    }
+    child.m_parent = this;
+    m_children.emplace_back(&child);
+    connect(&child, &QObject::destroyed, this, &CaptureExclusion::onChildGone);
+    check();
+}
+
+void CaptureExclusion::onChildGone()
+{
+    std::erase_if(m_children, [](const auto &child) { return child.isNull(); });
+    check();
+}
+
+std::vector<Window *> CaptureExclusion::windows() const
+{
+    std::vector<Window *> windows;
+    if (isNotToBeSeen(m_window))
+        windows.push_back(&m_window);
+    for (const auto &child : m_children) {
+        const std::vector<Window *> above = child->windows();
+        windows.insert(windows.end(), above.begin(), above.end());
+    }
+    return windows;
+}
+
+std::vector<WId> CaptureExclusion::identifiers()
+{
+    std::vector<WId> identifiers;
+    std::vector<Known> known;
+    for (Window *const window : windows()) {
+        identifiers.push_back(window->winId());
+        known.push_back({ window, identifiers.back() });
+    }
+    m_known = std::move(known);
+    return identifiers;
+}
+
+// An identifier that nobody has asked for yet is no news.
+bool CaptureExclusion::isAsKnown(const std::vector<Known> &present) const
+{
+    return std::equal(present.begin(), present.end(), m_known.begin(), m_known.end(),
+        [](const Known &now, const Known &before) {
+            return now.window == before.window
+                && (before.identifier == 0 || now.identifier == before.identifier);
+        });
+}
+
+void CaptureExclusion::check()
+{
+    std::vector<Known> present;
+    for (const Window *const window : windows())
+        present.push_back({ window, window->internalWinId() });
+    const bool isNews = !isAsKnown(present);
+    m_known = std::move(present);
+    const QPointer<CaptureExclusion> parent = m_parent; // whoever is told may end the window
+    if (isNews)
+        Q_EMIT m_window.windowsToLeaveOutOfCapturesChanged();
+    if (parent)
+        parent->check();
+}
+
+bool CaptureExclusion::eventFilter(QObject *watched, QEvent *event)
+{
+    if (event->type() == QEvent::WinIdChange) {
+        // A native window that has just gone is not to be made anew before its end is over.
+        if (m_window.internalWinId() == 0)
+            QMetaObject::invokeMethod(this, &CaptureExclusion::check, Qt::QueuedConnection);
+        else
+            check();
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+} // namespace penwick::platform

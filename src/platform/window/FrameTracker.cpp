@@ -1,0 +1,208 @@
+// SPDX-License-Identifier: MIT
+#include "platform/window/FrameTracker.h"
+
+#include "platform/native/NativeDesktop.h"
+#include "platform/window/ScreenCoordinates.h"
+
+#include <QEvent>
+#include <QGuiApplication>
+#include <QPointer>
+#include <QScreen>
+#include <QWidget>
+
+#include <algorithm>
+#include <utility>
+
+namespace penwick::platform {
+
+FrameTracker::FrameTracker(QWidget &window)
+    : QObject(&window)
+    , m_window(window)
+    , m_negotiation(window.geometry(), originInDesktop())
+    , m_alarm(Clock::ofTheDesktop(), this)
+{
+    connect(&m_alarm, &Alarm::rang, this, &FrameTracker::look);
+    m_window.installEventFilter(this);
+    connect(
+        qGuiApp, &QGuiApplication::primaryScreenChanged, this, &FrameTracker::followPrimaryScreen);
+    followPrimaryScreen();
+}
+
+FrameTracker::~FrameTracker()
+{
+    NativeDesktop::instance().forgetFrame(m_followed);
+}
+
+Rect FrameTracker::frame() const
+{
+    return fromDesktop(m_negotiation.frame());
+}
+
+void FrameTracker::request(const Rect &frame)
+{
+    const QRectF wanted = toDesktopExactly(frame);
+    if (!m_window.isVisible()) {
+        m_negotiation.askUnseen(wanted);
+        // Nobody has decorated it yet, so its content may be laid out as if nobody will.
+        m_window.resize(rounded(wanted).size());
+        return;
+    }
+    carryOut(m_negotiation.ask(wanted, Clock::ofTheDesktop().now()));
+    lookSoon();
+}
+
+void FrameTracker::setOff(const Rect &target)
+{
+    carryOut(m_negotiation.setOff(toDesktopExactly(target), Clock::ofTheDesktop().now()));
+}
+
+void FrameTracker::step(const Rect &frame)
+{
+    place(m_negotiation.step(toDesktopExactly(frame)));
+}
+
+void FrameTracker::prepareToShow()
+{
+    // Or it would measure in another screen's points until it is there.
+    if (QScreen *const screen = QGuiApplication::screenAt(rounded(m_negotiation.frame()).center()))
+        m_window.setScreen(screen);
+    m_window.winId(); // the desktop can only be asked about a window that exists
+    QWindow &native = *m_window.windowHandle();
+    QMargins margins;
+    if (!m_window.windowFlags().testFlag(Qt::FramelessWindowHint)) {
+        const auto told = NativeDesktop::instance().frameMarginsBeforeShow(native);
+        margins = told ? *told / native.devicePixelRatio() : native.frameMargins();
+    }
+    const FrameEffects effects
+        = m_negotiation.appear(margins, native.devicePixelRatio(), Clock::ofTheDesktop().now());
+    followFrame();
+    carryOut(effects);
+    awaitNextLook();
+}
+
+// What a frame is measured from moves with it.
+void FrameTracker::followPrimaryScreen()
+{
+    if (const QScreen *const primary = QGuiApplication::primaryScreen()) {
+        connect(primary, &QScreen::geometryChanged, this, &FrameTracker::lookSoon,
+            Qt::UniqueConnection);
+    }
+    lookSoon();
+}
+
+void FrameTracker::followFrame()
+{
+    QWindow &native = *m_window.windowHandle();
+    const WId former = std::exchange(m_followed, native.winId());
+    if (former != m_followed)
+        NativeDesktop::instance().forgetFrame(former);
+    connect(&native, &QWindow::screenChanged, this, &FrameTracker::lookSoon, Qt::UniqueConnection);
+    NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
+        m_negotiation.hearCorner(corner, Clock::ofTheDesktop().now());
+        lookSoon();
+    });
+}
+
+bool FrameTracker::eventFilter(QObject *watched, QEvent *event)
+{
+    switch (event->type()) {
+    case QEvent::Move:
+    case QEvent::Resize:
+    case QEvent::Show:
+    case QEvent::WindowStateChange: // what the frame did while it was minimised was not looked at
+        if (watched == &m_window)
+            lookSoon();
+        break;
+    default:
+        break;
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+FrameObservation FrameTracker::observation() const
+{
+    const QWindow &native = *m_window.windowHandle();
+    FrameObservation seen;
+    seen.frame = native.frameGeometry();
+    seen.content = native.geometry();
+    seen.margins = native.frameMargins();
+    seen.screen = native.screen()->geometry().topLeft();
+    seen.origin = originInDesktop();
+    seen.scale = native.devicePixelRatio();
+    seen.isBorderless = m_window.windowFlags().testFlag(Qt::FramelessWindowHint);
+    seen.isMinimised = m_window.isMinimized();
+    seen.isArranged
+        = m_window.windowState().testAnyFlags(Qt::WindowMaximized | Qt::WindowFullScreen);
+    return seen;
+}
+
+// Events come one by one, and the frame is whole only after the last of them.
+void FrameTracker::lookSoon()
+{
+    if (m_window.isVisible())
+        m_alarm.set(Clock::ofTheDesktop().now());
+}
+
+void FrameTracker::look()
+{
+    if (!m_window.isVisible())
+        return;
+    const QPointer<FrameTracker> self(this); // whoever is told may end the window
+    carryOut(m_negotiation.look(observation(), Clock::ofTheDesktop().now()));
+    if (self)
+        awaitNextLook();
+}
+
+void FrameTracker::awaitNextLook()
+{
+    const auto next = m_negotiation.nextLook();
+    if (next && (!m_alarm.at() || *next < *m_alarm.at()))
+        m_alarm.set(*next);
+}
+
+void FrameTracker::carryOut(const FrameEffects &effects)
+{
+    const QPointer<FrameTracker> self(this);
+    for (const auto &effect : effects) {
+        if (!self)
+            return;
+        if (const auto *const placing = std::get_if<FramePlacing>(&effect))
+            place(*placing);
+        else
+            tell(std::get<FrameNews>(effect));
+    }
+}
+
+void FrameTracker::place(const FramePlacing &placing)
+{
+    Q_EMIT asking();
+    m_window.setGeometry(placing.content);
+}
+
+void FrameTracker::tell(const FrameNews &news)
+{
+    switch (news.kind) {
+    case FrameNews::Kind::Rescaled:
+        return Q_EMIT rescaled();
+    case FrameNews::Kind::Confirmed:
+        return Q_EMIT confirmed();
+    case FrameNews::Kind::Resized:
+        return Q_EMIT resized();
+    case FrameNews::Kind::ResizedByUser:
+        return Q_EMIT resizedByUser();
+    case FrameNews::Kind::ResizedByDesktop:
+        return Q_EMIT resizedByDesktop(fromDesktop(news.asked));
+    case FrameNews::Kind::MoveBegan:
+        return Q_EMIT moveBegan();
+    case FrameNews::Kind::Shifted:
+        return Q_EMIT shifted(news.delta);
+    case FrameNews::Kind::Moved:
+        return Q_EMIT moved();
+    case FrameNews::Kind::Settled:
+        if (m_negotiation.isAtRest()) // nobody who was told before has asked for something else
+            Q_EMIT settled();
+        return;
+    }
+}
+
+} // namespace penwick::platform

@@ -1,0 +1,20 @@
+// SPDX-License-Identifier: MIT
+// What a window's attributes mean in Qt's words.
+#pragma once
+
+#include <penwick/platform/WindowAttributes.h>
+
+#include <Qt>
+
+namespace penwick::platform {
+
+/// Level of the main menu: above every ordinary window and above docks.
+constexpr int mainMenuWindowLevel = 24;
+
+/// Whether the window may get the keys: only one that has a title bar, hidden or not.
+[[nodiscard]] bool canBecomeKey(const WindowAttributes &attributes);
+
+/// The window flags, its type included, that `attributes` ask for.
+[[nodiscard]] Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes);
+
+} // namespace penwick::platform

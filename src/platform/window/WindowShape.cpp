@@ -1,0 +1,121 @@
+// SPDX-License-Identifier: MIT
+#include "platform/window/WindowShape.h"
+
+#include <penwick/platform/Window.h>
+
+#include "platform/foundation/KeptShape.h"
+#include "platform/native/NativeDesktop.h"
+#include "platform/window/FrameTracker.h"
+#include "platform/window/ScreenCoordinates.h"
+
+#include <cmath>
+#include <utility>
+
+namespace penwick::platform {
+
+namespace {
+
+constexpr Clock::Time restTime { 200 };
+constexpr double tolerance = 2.0; // points, of rounding by the desktop
+
+double heightFor(double width, const Size &ratio)
+{
+    return width * ratio.height / ratio.width;
+}
+
+bool hasShape(const Size &size, const Size &ratio)
+{
+    return std::abs(heightFor(size.width, ratio) - size.height) <= tolerance;
+}
+
+} // namespace
+
+WindowShape::WindowShape(Window &window, FrameTracker &tracker)
+    : QObject(&tracker)
+    , m_window(window)
+    , m_tracker(tracker)
+{
+    connect(&m_rest, &Alarm::rang, this, &WindowShape::rest);
+    connect(&tracker, &FrameTracker::asking, this, &WindowShape::update);
+    connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
+    connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
+    connect(&tracker, &FrameTracker::resizedByDesktop, this, [this](const Rect &asked) {
+        if (isKept() && hasShape(asked.size(), *m_window.attributes().aspectRatio))
+            await(false);
+    });
+    connect(&tracker, &FrameTracker::settled, this, &WindowShape::rememberFrame);
+}
+
+bool WindowShape::isKept() const
+{
+    const WindowAttributes &attributes = m_window.attributes();
+    return attributes.aspectRatio && (attributes.styleMask & StyleMask::resizable);
+}
+
+// Some desktops hold what is asked for against a hint that is still that of another content.
+void WindowShape::update()
+{
+    if (!m_window.windowHandle())
+        return;
+    const Rect frame = m_tracker.frame();
+    const bool hasRatio = isKept()
+        && std::abs(heightFor(frame.width, *m_window.attributes().aspectRatio) - frame.height)
+            < 1.0;
+    // Of the content, because that is what a desktop constrains, and of this exact frame's, so
+    // that asking for the frame itself stays possible.
+    const QSize content = toDesktop(frame).marginsRemoved(m_tracker.margins()).size();
+    NativeDesktop::instance().keepContentRatio(
+        *m_window.windowHandle(), hasRatio ? content : QSize());
+}
+
+// Where the desktop says what size the window has. What it had before comes back afterwards.
+bool WindowShape::isArranged() const
+{
+    return m_window.isMaximized() || m_window.isFullScreen();
+}
+
+void WindowShape::rememberFrame()
+{
+    if (std::exchange(m_isAnswering, false))
+        m_rest.cancel(); // what it granted instead is no pull by the user
+    if (!m_rest.at() && !isArranged())
+        m_before = m_tracker.frame();
+}
+
+void WindowShape::await(bool isPulled)
+{
+    m_isPulled = isPulled;
+    awaitRest();
+}
+
+void WindowShape::awaitRest()
+{
+    m_rest.set(Clock::ofTheUser().now() + restTime);
+}
+
+// A window that changed under the hand would be pulled from another size than its user sees.
+void WindowShape::rest()
+{
+    if (NativeDesktop::instance().isPointerHeld())
+        return awaitRest();
+    correct();
+    if (!m_isAnswering)
+        rememberFrame();
+}
+
+void WindowShape::correct()
+{
+    if (!isKept() || isArranged())
+        return;
+    const Rect pulled = m_window.frame();
+    const Size ratio = *m_window.attributes().aspectRatio;
+    const bool isChanged = m_before != Rect() && m_before.size() != pulled.size();
+    if (hasShape(pulled.size(), ratio) || (m_isPulled && !isChanged))
+        return;
+    const double height = heightFor(pulled.width, ratio);
+    m_window.setFrame(m_isPulled ? shapedAfterPull(m_before, pulled, ratio)
+                                 : Rect { pulled.x, pulled.maxY() - height, pulled.width, height });
+    m_isAnswering = true;
+}
+
+} // namespace penwick::platform

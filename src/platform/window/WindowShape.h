@@ -1,0 +1,45 @@
+// SPDX-License-Identifier: MIT
+// Keeps a window's shape while the user resizes it.
+#pragma once
+
+#include <penwick/platform/Geometry.h>
+
+#include "platform/foundation/Clock.h"
+
+#include <QObject>
+
+namespace penwick::platform {
+
+class FrameTracker;
+class Window;
+
+/// Has the desktop keep the aspect ratio of a window's attributes, where the window's frame has
+/// it, and brings a frame that the user gave another one to it, where the desktop did not.
+/// A window that the user cannot resize is left alone.
+class WindowShape final : public QObject
+{
+    Q_OBJECT
+
+public:
+    /// Borrows both; `tracker` follows `window` and owns this object.
+    WindowShape(Window &window, FrameTracker &tracker);
+
+private:
+    void update();
+    void await(bool isPulled);
+    void awaitRest();
+    void rest();
+    void correct();
+    void rememberFrame();
+    [[nodiscard]] bool isKept() const;
+    [[nodiscard]] bool isArranged() const;
+
+    Window &m_window;
+    FrameTracker &m_tracker;
+    Rect m_before; // the frame that the user began to pull; empty before the first one
+    bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
+    bool m_isAnswering = false; // the desktop, to the frame that a pull was corrected to
+    Alarm m_rest { Clock::ofTheUser(), this }; // set while the user may still be pulling
+};
+
+} // namespace penwick::platform
