@@ -35,8 +35,9 @@ public:
     /// What the tool bar does: a drawing tool, or "clear", "undo", "redo".
     void choose(const QString &tool);
 
-    /// The pointer comes over the canvas. Its shape is the process's: with two boards, each would
-    /// give it its own again at every event, as no pointer makes them do.
+    /// The pointer comes over the canvas, which sets its cursor. The process has one cursor: of two
+    /// boards that are measured in turn, each would otherwise set its own again at every event,
+    /// which no real pointer makes them do.
     void takePointer();
     /// The pointer; nothing is painted before paintMarked().
     void press(platform::Point point);

@@ -54,8 +54,8 @@ Figure missFigure()
         turns.of(onEmpty), { 5.0, 3.0 });
 }
 
-/// How many pixels of a picture are written when the stroke at `index` goes: those that do not
-/// have a colour any more which no stroke has.
+/// How many pixels of a picture are written when the stroke at `index` is removed. Before that all
+/// pixels are given a colour that no stroke has; those that have lost it were written.
 double pixelsPaintedWithout(const Board &board, int index, const QRect &area)
 {
     const QSize size = QSize(canvasWidth, canvasHeight) * board.scale();
@@ -64,8 +64,8 @@ double pixelsPaintedWithout(const Board &board, int index, const QRect &area)
     picture.update(size, board.scale());
     constexpr QRgb untouched = 0x01010101;
     const QImage &image = picture.pixels().image();
-    // The picture gives nobody its pixels to write to. Lines of an image that nobody shares may
-    // be written all the same.
+    // The picture lets nobody write to its pixels. As nobody else shares the image, its lines can
+    // be written past the picture.
     for (int y = 0; y < image.height(); ++y) {
         auto *const line = reinterpret_cast<QRgb *>(const_cast<uchar *>(image.constScanLine(y)));
         std::fill_n(line, image.width(), untouched);

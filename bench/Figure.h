@@ -10,8 +10,8 @@
 
 namespace penwick::bench {
 
-/// At most so much; where both are there, one of them is enough. Without either, there is no
-/// target.
+/// The most that a figure may be. If both limits are there, to keep one of them is enough; without
+/// either there is no target.
 struct Target
 {
     std::optional<double> most; ///< in the figure's own unit

@@ -24,7 +24,7 @@ constexpr int rounds = 12;
 constexpr int stepsOfARound = 5; // as many as the tool bar offers
 constexpr int clears = 7;
 
-// The frame is promised for scale 1; with more pixels the same is told, and nothing promised.
+// One frame is the target at scale 1. At larger scales the figure is printed without a target.
 Target oneFrame(const Board &board)
 {
     constexpr double frame = 8'000.0; // us

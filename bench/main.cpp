@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Measures what people feel of a drawing program, and holds it against what is to be reached.
+// Measures what people feel of a drawing program, and compares it with targets.
 #include "Accuracy.h"
 #include "FigureTable.h"
 #include "Growth.h"
@@ -45,7 +45,8 @@ void prepareScreen(QTemporaryFile &file, int scale)
     qputenv("QT_SCALE_FACTOR", QByteArray::number(scale));
 }
 
-/// Without the screen plug-in's word, for each window, that it raises none.
+/// Prints the toolkit's warnings and errors, but for one: the offscreen platform warns for each
+/// window that it cannot raise it.
 void printProblem(QtMsgType type, const QMessageLogContext &, const QString &message)
 {
     if (type != QtDebugMsg && type != QtInfoMsg && !message.contains(QLatin1String("raise()")))
