@@ -90,7 +90,7 @@ INSTANTIATE_TEST_SUITE_P(TnhColors, ThemeColor,
             218, 10 }),
     nameOf);
 
-// The desktop's own grey and black are half of white and nothing.
+// The desktop's own grey is half of white; its black is 0.
 INSTANTIATE_TEST_SUITE_P(Interface, ThemeColor,
     testing::Values(
         NamedColor { "toolPanelBorderColor", ToolPanelUI::toolPanelBorderColor, 128, 128, 128, 10 },
@@ -105,7 +105,8 @@ TEST(Theme, toolPanelHasRoundCornersOfFourPoints)
     EXPECT_EQ(ToolPanelUI::toolPanelBorderRadius, 4.0);
 }
 
-// What the compiler knows is not made while the library is loaded.
+// This compiles only if the colours are constants at compile time, so that loading the library runs
+// no code for them.
 [[maybe_unused]] constexpr std::array known { TnhColors::borderGreenColor,
     TnhColors::textBoxEditBorderColor, TnhColors::textBoxNormalBorderColor, TnhColors::redColor,
     ToolPanelUI::toolPanelColor, TextBoxParams::defaultTextFontColor };

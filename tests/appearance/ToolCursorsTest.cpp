@@ -20,7 +20,7 @@ namespace {
 
 const auto artwork = QStringLiteral(":/penwick/images");
 
-/// With the component's artwork; without a bundle again afterwards.
+/// Sets a bundle with the component's artwork, and none again afterwards.
 class ToolCursors : public testing::Test
 {
 protected:

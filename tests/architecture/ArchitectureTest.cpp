@@ -60,7 +60,7 @@ Findings linesLike(
     return findings;
 }
 
-/// Every step of one walk along `next` from `start` that leads back to where the walk has been.
+/// Walks along `next` from `start` and finds every step that leads back to where the walk has been.
 class CircleFinder
 {
 public:
@@ -280,7 +280,7 @@ TEST(Architecture, everyFileSaysItsLicenceAndItsPurposeFirst)
 TEST(Architecture, noFileIsLongerThanWasAgreed)
 {
     constexpr int limit = 400;
-    // File and why it is longer. Past 600 lines there is no why.
+    // Files that may be longer, each with the reason. No reason allows more than 600 lines.
     const std::set<std::string> agreed {};
     Findings findings;
     for (const std::string &file :

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What observers were added to, in order.
+// The names of the notifications that observers were added for, in order.
 // Nobody can see from outside in which order an object observes notifications of different names,
 // so the linker leads every call of addObserver() in this program through here.
 #pragma once

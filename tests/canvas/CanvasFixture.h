@@ -172,7 +172,8 @@ protected:
         return id;
     }
 
-    /// The same, and left: its text keeps it, its delete button is a hidden subview from now on.
+    /// The same, and then left. The box stays because it has text; its delete button is a hidden
+    /// subview from then on.
     std::int64_t placedTextBox(Point point)
     {
         const std::int64_t id = writtenTextBox(point);

@@ -65,7 +65,7 @@ class DrawingCanvasModelTest : public ::testing::Test
 protected:
     DrawingCanvasModelTest()
     {
-        // A text box brings its delete button with it, and that its pictures.
+        // A text box makes its delete button, which needs its pictures.
         setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         history->setDrawingCanvasModel(model);
         model->setUndoRedoManager(history);
@@ -85,7 +85,7 @@ protected:
         return model->textBoxArray().last().textId;
     }
 
-    /// Leaves one undone stroke on the redo stack, and nobody told.
+    /// Leaves one undone stroke on the redo stack; what that posted is not in `recorder` any more.
     void makeSomethingRedoable()
     {
         drawLine({ 0, 500 });

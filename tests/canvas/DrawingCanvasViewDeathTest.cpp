@@ -11,7 +11,7 @@ const QString text = QStringLiteral("text");
 class DrawingCanvasViewDeathTest : public CanvasFixture
 {
 protected:
-    /// A delegate that hands no text box to the canvas, and none at all is it the owner of.
+    /// A delegate that hands no text box to the canvas and is not the owner of text boxes.
     class Idle : public QObject, public DrawingCanvasDelegate
     {
     public:

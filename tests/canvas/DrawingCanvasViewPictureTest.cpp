@@ -72,7 +72,8 @@ TEST_F(DrawingCanvasViewPictureTest, twoStrokesThatCrossAreDarkerThere)
     const QImage picture = onScreen();
     EXPECT_EQ(greyAt(picture, { 70, 100 }), ink);
     EXPECT_EQ(greyAt(picture, { 100, 70 }), ink);
-    // 0.7 of 41 over 105 would be 60; the pixels in between are whole numbers too.
+    // 0.7 of 41 over 105 would be 60. But the strokes are first laid over each other in a
+    // transparent picture, whose pixels are rounded too.
     EXPECT_EQ(greyAt(picture, { 100, 100 }), 61);
 }
 

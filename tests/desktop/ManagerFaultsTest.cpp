@@ -25,7 +25,7 @@ protected:
         : FaultTest(std::get<WindowManager>(GetParam()))
     { }
 
-    /// Where the server shows what the windows show.
+    /// Where the contents of the host's windows are, as the server has them.
     [[nodiscard]] std::vector<QRect> contents()
     {
         std::vector<QRect> contents;
@@ -34,7 +34,7 @@ protected:
         return contents;
     }
 
-    /// For longer than the component waits for a window manager's answer.
+    /// Watches for longer than the component waits for a window manager's answer.
     void expectFrameStays(const QRect &frame)
     {
         constexpr std::chrono::milliseconds longerThanPatience { 500 };

@@ -71,7 +71,7 @@ protected:
         image.fill(Qt::yellow);
         ASSERT_TRUE(image.save(QString::fromStdString(file)));
         start({ "--window", "imageAnnotation", "--image", file });
-        m_window = window(); // which is looked for where the log says that it stands
+        m_window = window(); // kept: the log says late where to look for it
         ASSERT_EQ(frameOnScreen().size(), size);
     }
 
@@ -190,7 +190,7 @@ TEST_P(Resizing, toolBarKeepsItsPlaceFromTheBottomLeftCornerOrIsPulledInside)
     QPoint seen;
     EXPECT_TRUE(waitUntil([&] {
         const QRect frame = windows.outerFrame(board); // it may still move by a few pixels
-        // What is above the bottom edge by so much has not enough room in a lower board.
+        // In a board that has become lower, the tool bar stands no higher than it has room for.
         const int highest = frame.height() - titleAllowance - toolBar().frame.height();
         wanted = { before.x(), -std::min(-before.y(), highest) };
         seen = toolBar().frame.bottomLeft() - frame.bottomLeft();
@@ -221,8 +221,8 @@ TEST_P(PulledImage, outwardIsNeverSmallerAndHoldsWhatWasPulled)
     expectOtherEdgesKept(before);
 }
 
-// There the window manager keeps the shape under the hand, and says which of the two ways of a
-// corner counts.
+// A window that has the shape already is kept in it by the window manager while it is pulled, which
+// also decides whether the width or the height of a pulled corner counts.
 TEST_P(PulledImage, outwardIsNeverSmallerWhereItHasTheShapeAlready)
 {
     startOn({ 640, 360 });

@@ -42,7 +42,7 @@ protected:
             - QPoint(m_size.width() / 4, 0); // beside its text
     }
 
-    /// It shows its last button where that is with `scale` pixels a point.
+    /// The tool bar shows its last button where it has to be with `scale` pixels a point.
     void expectWholeToolBar(int scale)
     {
         constexpr int inset = 20; // points
@@ -55,7 +55,7 @@ protected:
             = [&] { return desktop().screen().pixel(bar().topLeft() + m_beforeEnd * scale); };
         EXPECT_TRUE(waitUntil([&] { return color().red() > 200 && color().green() < 120; }))
             << color().name().toStdString();
-        // So does the program believe; its log may be later.
+        // The program believes so too; its log may be later.
         EXPECT_TRUE(
             waitUntil([&] { return host().window(QStringLiteral("toolPanel")).frame == bar(); }));
     }
@@ -108,13 +108,14 @@ protected:
         startKind(kind, { "--screen", "1" }, { "QT_SCREEN_SCALE_FACTORS=1;2" });
     }
 
-    /// To two points, which are two pixels each: the title bar's borders are half a point.
+    /// Two points, which are two pixels each, may be missing: the title bar's borders are half a
+    /// point.
     void expectFrame(const QRect &wanted)
     {
         const WindowId board = desktop().windows().ofProcess(host().processId()).front();
         const auto frame = [&] { return desktop().windows().outerFrame(board); };
         const auto isNear = [](int one, int other) { return std::abs(one - other) <= 4; };
-        // At rest, for longer than it takes to answer a user's pull at an edge.
+        // Waits until the frame has rested for longer than the answer to a user's pull takes.
         QRect seen;
         do {
             seen = frame();

@@ -55,7 +55,7 @@ TEST_P(ScreenLost, leavesAWindowThatIsDrawnOnAndEnds)
 
     desktop().splitInto({ first });
     if (std::get<WindowManager>(GetParam())
-        == WindowManager::Openbox) { // it fetches what is outside
+        == WindowManager::Openbox) { // brings back windows from outside
         EXPECT_TRUE(waitUntil([this] { return places().front().intersects(first); }));
     }
     expectInk();

@@ -83,7 +83,8 @@ TEST_F(Surroundings, withADecimalCommaTakeSevenAndAHalfAsThicknessWithOne)
 
     drag({ { 200, 100 }, { 300, 100 } });
 
-    // Ten rows around the line: seven whole ones, and a part of one on either side.
+    // The line lies between two rows of pixels. On each side of it three rows are wholly covered,
+    // and three quarters of a fourth: eight rows in all.
     waitForLevel({ 250, 100 }, inkOnWhite);
     int rows = 0;
     for (int y = 90; y < 110; ++y)

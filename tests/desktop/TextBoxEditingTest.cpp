@@ -145,7 +145,7 @@ TEST_P(TextBoxOtherButton, inABoxDrawsNothingAndEndsNothing)
     drag({ corner + QPoint(150, 10), corner + QPoint(150, -60) }, GetParam());
     if (GetParam() == MouseButton::Right) {
         ASSERT_TRUE(waitUntil([&] { return darkest(pictureOf(belowOf(corner))) < 255; }));
-        desktop().keyboard().press("Escape"); // the menu, and not the editing
+        desktop().keyboard().press("Escape"); // closes the menu, ends no editing
         ASSERT_TRUE(waitUntil([&] { return darkest(pictureOf(belowOf(corner))) == 255; }));
     }
     type(corner, "mm");

@@ -39,7 +39,7 @@ public:
             std::vector<std::string> { "DBUS_SESSION_BUS_ADDRESS=" + m_desktop.sessionBus(),
                 "QT_SCALE_FACTOR=" + std::to_string(m_scale) });
         m_bar = m_host->waitForWindow(QStringLiteral("toolPanel"));
-        // Where it is, is the server's word.
+        // The server is asked where the window is; the log may be late.
         const Windows &windows = m_desktop.windows();
         for (const WindowId window : windows.ofProcess(m_host->processId())) {
             const QRect frame = windows.outerFrame(window);

@@ -172,7 +172,7 @@ TEST_F(ToolBar, undoIsOffAfterFiveStepsAndOnAgainAfterARedo)
     open();
     EXPECT_TRUE(turnsEnabled("undo", false));
     EXPECT_TRUE(turnsEnabled("redo", false));
-    for (int y = 60; y <= 360; y += 50) // seven
+    for (int y = 60; y <= 360; y += 50) // seven times
         drag({ { 200, y }, { 300, y } });
     waitForLevel({ 298, 360 }, inkOnWhite);
     EXPECT_TRUE(turnsEnabled("undo", true));

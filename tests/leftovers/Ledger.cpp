@@ -28,11 +28,11 @@ void settleDisplay()
         XSync(x11->display(), False);
 }
 
-/// Whether it stands for the whole screen; the toolkit makes one when a pointer first enters a
-/// window.
+/// Whether `widget` is the toolkit's stand-in for the whole screen, which the toolkit makes when a
+/// pointer first enters a window.
 bool isToolkitsOwn(const QWidget *widget)
 {
-    // Nobody else is to use the flag any more, but the toolkit does.
+    // The flag is deprecated, but the toolkit itself still sets it.
     QT_WARNING_PUSH
     QT_WARNING_DISABLE_DEPRECATED
     return widget->windowType() == Qt::Desktop;

@@ -19,13 +19,14 @@ struct Ledger
 
     /// All widgets but the toolkit's stand-in for the desktop, which it makes once and keeps.
     [[nodiscard]] static QWidgetList widgetsThatAre();
-    /// Now. Everything left to the event loop to delete must have been deleted.
+    /// What the process holds now. What was left to the event loop to delete must have been
+    /// deleted.
     [[nodiscard]] static Ledger taken();
 };
 
-/// What `after` holds more than `before`, one line each; empty if nothing. `sessions` is how many
-/// there were between: memory counts as left behind from less than the smallest block that the
-/// allocator gives, in each session.
+/// What `after` holds more than `before`, one line each; empty if nothing. `sessions` is the number
+/// of sessions between the two: memory counts as left behind if it grew by more than 24 bytes for
+/// each, which is less than the smallest block that the allocator gives.
 [[nodiscard]] QString leftBehind(const Ledger &before, const Ledger &after, int sessions);
 
 /// Makes the allocator count exactly: starts the program anew if it has to, with `arguments`.

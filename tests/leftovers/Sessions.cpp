@@ -77,7 +77,7 @@ QWidget &toolButton(const char *name)
     qFatal("the tool bar has no button %s", name);
 }
 
-// Always false.
+// Writes `what` about session `number` to standard error. Always returns false.
 bool complain(int number, const char *what)
 {
     std::fprintf(stderr, "penwick-sessions: session %d: %s\n", number, what);
@@ -195,7 +195,8 @@ void Sessions::open(WindowType kind)
         ->showWindow(nullptr);
 }
 
-// A stroke, a text box, every button's state.
+// Draws a stroke, takes it back and draws it again, and makes a text box. Every second session also
+// erases, and clears the canvas.
 void Sessions::use(int number)
 {
     m_hand.press(canvas(), { 150, 100 });

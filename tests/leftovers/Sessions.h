@@ -22,7 +22,8 @@ public:
     /// How many there are until each route was taken with each kind of window.
     [[nodiscard]] static int wholeRound();
 
-    /// What it writes down of `count` sessions has its memory from the beginning.
+    /// Reserves the memory for its notes on `count` sessions, which would otherwise look as if the
+    /// sessions left it behind.
     explicit Sessions(int count);
     ~Sessions();
     Sessions(const Sessions &) = delete;

@@ -19,7 +19,8 @@ using penwick::platform::NotificationCenter;
 
 namespace {
 
-// The windowless platform says at every window that it cannot bring it to the front.
+// Prints what the toolkit says, but for one line: the offscreen platform says of every window that
+// it cannot bring it to the front.
 void passOn(QtMsgType, const QMessageLogContext &, const QString &message)
 {
     if (message != QLatin1String("This plugin does not support raise()"))
@@ -48,8 +49,8 @@ void sayCosts(const Sessions &sessions)
     }
 }
 
-// An observer that a session had left would use what is gone, or take the last one for its own and
-// stop the process.
+// An observer that a session had left behind would act on these notifications, and use objects that
+// are gone. The last one carries no operation, which stops the process of any canvas that hears it.
 void postWhatNoLiveCanvasTakes()
 {
     const QString &end = penwick::penwickSessionEndNotificationKey();
@@ -100,7 +101,7 @@ int main(int argumentCount, char **arguments)
     TimedApplication application(argumentCount, arguments);
     QApplication::setQuitOnLastWindowClosed(false);
 
-    // What is filled once in a process.
+    // The first round fills what is filled only once in a process, and is not counted.
     if (Sessions warming(Sessions::wholeRound()); !warming.run() || !comeToRest())
         return EXIT_FAILURE;
     static_cast<void>(application.takeLongestBlock());

@@ -24,7 +24,7 @@ public:
     /// Borrows both.
     Monkey(Desktop &desktop, MonkeyHost &host, std::uint64_t seed);
 
-    /// Does one thing, and answers of how many events it was made.
+    /// Does one thing, and returns how many events it took.
     int act();
     /// Lets go of every button that is held down.
     void letGo();

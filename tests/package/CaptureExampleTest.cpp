@@ -137,7 +137,8 @@ protected:
     {
         return find([](const QRect &area) { return area.size() == bannerSize; });
     }
-    // Neither of the others.
+    // The shown window that is neither the board nor its tool bar nor the banner; 0 if there is
+    // none.
     [[nodiscard]] WindowId popover()
     {
         const std::vector<WindowId> others { board(), toolBar(), banner() };

@@ -21,7 +21,7 @@ struct Scale
     QSize pixels; // of an image of 20 x 10 points
 };
 
-/// Counts how often its icon is made a picture of.
+/// Counts how often its icon is rendered.
 class CountingEngine final : public QIconEngine
 {
 public:

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A desktop of which a test says every word.
+// A desktop for tests of the negotiation: the test decides everything that it shows and says.
 #pragma once
 
 #include "platform/window/FrameNegotiation.h"
@@ -40,7 +40,7 @@ inline std::string inWords(const FrameNews &news)
     return name;
 }
 
-/// A desktop of which a test says every word: what it shows of the window, and when. What the
+/// A desktop of which a test decides what it shows of the window, what it says, and when. What the
 /// negotiation does and tells is kept, in order.
 class Desk
 {
@@ -87,7 +87,8 @@ public:
         m_now = end;
     }
 
-    /// As above, where the window has been put in its place and everybody has come to rest.
+    /// Like show(), and then lets the window come to rest at `frame`; nothing of that is in the
+    /// log.
     void settle(const QRect &frame, const QMargins &margins, double scale = 1.0)
     {
         show(frame, margins, scale);
@@ -103,7 +104,7 @@ public:
 private:
     void keep(const FrameEffects &effects)
     {
-        // Said at each look at rest, and worth a word only where something else was said.
+        // Settled comes with each look at a window at rest. It is noted only together with others.
         if (effects == FrameEffects { FrameNews { FrameNews::Kind::Settled } })
             return;
         for (const auto &effect : effects) {

@@ -8,7 +8,7 @@
 namespace penwick::platform {
 
 /// The process's own workspace, each time in a process of its own, since there is only one.
-/// What is said there ends on standard error; a warning of Qt's would stand beside it.
+/// The child process reports on standard error, where a warning of Qt's would spoil the report.
 class SharedWorkspaceDeathTest : public WorkspaceTest
 {
 protected:

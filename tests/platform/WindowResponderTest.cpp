@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Who gets the keys: one view a window, by our own word and not by the focus.
+// Who gets the keys: one view of each window, which the window decides and not Qt's focus.
 #include "platform/ViewFixture.h"
 
 namespace penwick::platform {

@@ -75,7 +75,7 @@ struct Slow
 {
     std::vector<int> taken;
     std::vector<int> events;
-    bool isClear = true; // that one: no stroke is grazed, or met right at an end
+    bool isClear = true; // the answer is certain: no stroke is grazed, or met right at an end
 };
 
 Slow erasedSlowly(const std::vector<PlainStroke> &drawing, Point from, Point to)
@@ -163,7 +163,8 @@ RC_GTEST_PROP(FastEraser, takesWhatASlowOneTakesInThatOrder, ())
     const std::vector<int> fast = Board(drawing).erased(from, to);
 
     RC_ASSERT(fast.size() == slow.taken.size());
-    // Two that a slow eraser meets within an event or two of each other are told apart no better.
+    // The order need not be the same for strokes that a slow eraser meets within a few events: it
+    // takes only one at each event.
     for (std::size_t place = 0; place < fast.size(); ++place) {
         const auto found = std::ranges::find(slow.taken, fast[place]);
         RC_ASSERT(found != slow.taken.end());

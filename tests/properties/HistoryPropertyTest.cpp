@@ -57,7 +57,7 @@ class Session
 public:
     Session()
     {
-        // A text box brings its delete button with it, and that its pictures.
+        // A text box makes its delete button, which needs its pictures.
         setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         m_history->setDrawingCanvasModel(m_model);
         m_model->setUndoRedoManager(m_history);

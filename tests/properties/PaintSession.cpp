@@ -100,7 +100,7 @@ std::string PaintSession::release()
     return "release";
 }
 
-// Tools wait for the pointer to be released.
+// Chooses a tool; while the pointer is pressed it is released instead.
 std::string PaintSession::chooseAnything()
 {
     if (m_isPressed)

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What stands beside a window that is on its way, and follows it.
+// Windows that stand beside a gliding window and follow it.
 #include "session/SessionFixture.h"
 
 #include "session/ToolPanelWindowController.h"

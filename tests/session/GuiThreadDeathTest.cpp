@@ -189,9 +189,9 @@ const Operation operations[] {
     OF_WINDOW(orderFront),
     OF_WINDOW(orderOut),
     { "Window", "setVisible", [](Subject &s) { s.window.setVisible(true); } },
-    // The toolkit's own, by which a host ends a session.
+    // QWidget has this one too; a host ends a session by it.
     OF_WINDOW(close),
-    // The toolkit's own, by another way.
+    // QWidget's close() reaches the window by its close event.
     { "Window", "closeEvent", [](Subject &s) { s.window.QWidget::close(); } },
 };
 

@@ -67,7 +67,7 @@ public:
     }
 };
 
-/// One way in which a host looks, and how it comes to.
+/// One look that a host may have, and what sets it.
 struct HostLook
 {
     const char *name;

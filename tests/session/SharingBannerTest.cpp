@@ -31,7 +31,7 @@ protected:
         return m_controller->findChildren<QTimer *>(QString(), Qt::FindDirectChildrenOnly);
     }
 
-    /// Lets the time of `timer` come now.
+    /// Lets `timer` fire now.
     static void fire(QTimer &timer)
     {
         ASSERT_TRUE(timer.isActive());

@@ -166,7 +166,7 @@ void PlainBoard::pressPanel()
 
 void PlainBoard::showPopover(const std::string &kind)
 {
-    // Put into the window for the first time it comes up only where its panel is.
+    // A popover that is newly put into the window comes up only while the panel is on the screen.
     const bool isSame = m_popover == kind;
     m_popover = kind;
     if (isSame || m_isPanelVisible)

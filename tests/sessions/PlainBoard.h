@@ -43,7 +43,7 @@ public:
     void commit(const std::string &whole);
     void dropOn(const std::string &target, const std::string &dropped);
     void copyElsewhere(const std::string &text) { m_clipboard = text; }
-    /// What the step has left to the editor is taken over, where it may be that.
+    /// Takes over what a step has left to the editor, if the step may leave that.
     void adopt(const std::string &box, const std::string &now, const std::string &composed);
     void adoptFrame(const std::string &box, Spot corner, Spot boxSize, Spot canvasSize);
     void adoptSize(Spot canvasSize) { m_canvas.adoptSize(canvasSize); } ///< after the frames
@@ -130,8 +130,8 @@ private:
     std::string m_menu; // of this box
     bool m_isMenuOfResponder = false; // it had the keys
     std::string m_clipboard;
-    std::optional<std::string> m_copiedFrom; // a text; until it is known which part of it
-    std::string m_copied; // the box that it was
+    std::optional<std::string> m_copiedFrom; // the whole text, until it is known what was copied
+    std::string m_copied; // the box whose text that is
     bool m_isCut = false;
 
     std::string m_held; // what the left button is held down on

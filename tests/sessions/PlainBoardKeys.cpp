@@ -95,8 +95,8 @@ void PlainBoard::adoptFrame(const std::string &box, Spot corner, Spot boxSize, S
     m_canvas.adoptFrame(box, corner, boxSize, canvasSize);
 }
 
-// What was selected is the editor's to know: a copy is some part of the text, and what is cut the
-// very part that is gone from it.
+// Only the editor knows what was selected. What was copied is some part of the text; what was cut
+// is the part that the text has lost.
 void PlainBoard::adoptClipboard(const std::string &now)
 {
     if (!m_copiedFrom)

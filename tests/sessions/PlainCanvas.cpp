@@ -275,7 +275,7 @@ void PlainCanvas::showButton(const std::string &name)
 void PlainCanvas::paint()
 {
     m_isPainted = true;
-    turn(); // what is painted is never without an earlier stroke
+    turn(); // painting takes the content anew, so that no earlier stroke is missing
     for (const std::string &name : boxes)
         putOn(name);
     for (const std::string &view : std::vector(views)) {
@@ -284,7 +284,7 @@ void PlainCanvas::paint()
     }
 }
 
-// What lies below a box is painted with it where the box has moved, and takes the content anew.
+// Where a box has moved, the canvas below it is painted too, and then takes the content anew.
 void PlainCanvas::adoptShown(std::size_t count)
 {
     if (std::exchange(m_isPainted, false) && m_hasDropped && count == m_drawing.strokes().size())

@@ -23,7 +23,7 @@ struct PlainBox
     PlainText text;
     double x = 0.0;
     double top = 0.0;
-    Spot size { 200, 30 }; ///< its fonts' business: taken over
+    Spot size { 200, 30 }; ///< depends on fonts, so it is taken over
 };
 
 /// The canvas view, its controller and the text boxes, as one plain machine.
@@ -110,15 +110,15 @@ private:
     Spot m_start;
     Spot m_pressedAt; // on the canvas
     Spot m_cameFrom; // the eraser
-    bool m_isFar = false; // from where the canvas was pressed; a click before
+    bool m_isFar = false; // the pointer has been so far from its press that this is no click
     bool m_isDragged = false;
     bool m_hasDropped = false;
-    bool m_isPainted = false; // some of it, since this was asked last
-    bool m_canPan = false; // of the box that is held down
+    bool m_isPainted = false; // some of the canvas, since adoptShown()
+    bool m_canPan = false; // the box that is held down can be dragged
     bool m_isPanning = false;
     Spot m_pressed;
     Spot m_size; // of the canvas
-    bool m_wasResized = false; // since then
+    bool m_wasResized = false; // since m_size was taken over
     Spot m_grabbed; // the box's place when it was pressed
 };
 

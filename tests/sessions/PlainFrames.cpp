@@ -73,7 +73,7 @@ void PlainFrames::restAt(const PlainFrame &frame)
 {
     PlainFrame kept = reshaped();
     const bool isReshaped = kept.width != board.width || kept.height != board.height;
-    // Where they were asked to is what counts.
+    // A frame that was granted counts as it was asked for, not as it was rounded.
     const bool isGranted = haveSameCorner(frame, kept);
     // A desktop may be out by the width of the border that it draws.
     if (!isGranted && std::abs(frame.x - kept.x) < border && std::abs(frame.y - kept.y) < border) {

@@ -59,7 +59,7 @@ void PlainText::commit(const std::string &whole)
     if (whole.empty() && m_composed.empty())
         return;
     replace(whole);
-    m_now += whole; // until it is known where: a box with something in it is not empty
+    m_now += whole; // at the end until its place is known, because the box is not empty any more
     m_composed.clear();
 }
 

@@ -13,9 +13,10 @@ namespace penwick::sessions {
 
 namespace {
 
-// Until what was asked for is granted, or what stands there is taken for the answer.
+// After this time the component has been granted its request, or takes what is there for the
+// answer.
 constexpr platform::Clock::Time patience { 300 };
-// Until the hand that has moved a window, or pulled at its edges, counts as gone.
+// After this time a user's move, or pull at an edge, counts as over.
 constexpr platform::Clock::Time longestRest { 1000 };
 
 /// While it lives, a window does not hear that it is, or is not any more, the active one.
@@ -33,7 +34,7 @@ public:
 
 void RealBoard::paint()
 {
-    // Twice: what came to the canvas while it was painted is painted next.
+    // Painted twice: what came to the canvas while it was painted is painted the second time.
     for (int pass = 0; pass < 2; ++pass) {
         QEvent update(QEvent::UpdateRequest);
         QCoreApplication::sendEvent(&window(), &update);

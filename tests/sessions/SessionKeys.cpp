@@ -32,7 +32,8 @@ void Session::key(const Step &step)
         m_real.key(name);
         return m_plain->closeMenu();
     }
-    // The editor has an undo of its own; and the end is rare.
+    // While a box is edited, keys with Ctrl are its editor's, which has an undo of its own. C-w
+    // ends the session, so it is let through only seldom.
     const bool isEditors = isEditing && name.starts_with("C-") && name != "C-w";
     if (!canPoint() || isMenuOpen() || !m_plain->isKey() || isEditors
         || (name == "C-w" && step.b > 80))

@@ -64,7 +64,7 @@ enum class Kinds
 
 std::ostream &operator<<(std::ostream &stream, const Step &step);
 
-/// Up to as many steps as the size is large.
+/// Steps at random, no more than the generator's size.
 [[nodiscard]] rc::Gen<Steps> anySteps(Kinds kinds = Kinds::All);
 /// The `count` steps that belong to `seed`, and what they can be made shorter to.
 [[nodiscard]] rc::Shrinkable<Steps> stepsOf(

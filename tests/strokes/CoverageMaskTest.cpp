@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Coverage against a finely sampled reference, and that it does not matter how it came about.
+// Coverage against a finely sampled reference; and that order, repetition and division do not
+// matter.
 #include "strokes/CoverageMask.h"
 
 #include <gtest/gtest.h>
@@ -189,7 +190,7 @@ RC_GTEST_PROP(CoverageMaskProperties, everyLineIsCloseToWhatSamplingItFinelyGive
 
     // The ends of thin lines are the worst: there the edge bends within a pixel.
     RC_ASSERT(errors.largest <= (radius < 1.0 ? 0.35 : 0.16));
-    constexpr int many = 60; // then it is not the ends alone that are inside the area
+    constexpr int many = 60; // then more than a line's ends is inside the area
     if (errors.crossed >= many)
         RC_ASSERT(errors.mean <= 0.01);
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where a straight way comes upon a stroke, and against many points along it.
+// Where a straight way meets a stroke, also compared with many points along the way.
 #include "strokes/StrokeCrossing.h"
 
 #include "StrokeFixture.h"

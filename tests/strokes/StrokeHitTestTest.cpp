@@ -72,7 +72,7 @@ TEST(StrokeHitTest, endsAreRound)
 
     EXPECT_TRUE(strokeContains(path, { 32.5, 10 }));
     EXPECT_TRUE(strokeContains(path, { 7.5, 10 }));
-    EXPECT_TRUE(strokeContains(path, { 31.5, 12 })); // 1.5, 2, 2.5
+    EXPECT_TRUE(strokeContains(path, { 31.5, 12 })); // 1.5 along and 2 across: 2.5 away
     EXPECT_FALSE(strokeContains(path, { 32, 12 })); // inside a square end
     EXPECT_FALSE(strokeContains(path, { 7.4999999, 10 }));
 }

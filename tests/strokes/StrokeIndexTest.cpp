@@ -80,7 +80,7 @@ TEST(StrokeIndex, meetingPointsAreInTheOrderOfTheWayAndOldestFirstWhereStrokesAr
 
     const std::vector<Point> up = index.meetingsOn({ { 20, 0 }, { 20, 93 } }).places;
 
-    ASSERT_EQ(up.size(), 4U); // the one that ends the way is not on it
+    ASSERT_EQ(up.size(), 4U); // the stroke at 95 is met only at the end
     EXPECT_NEAR(up[0].y, 28, 1e-5);
     EXPECT_EQ(up[1], up[0]);
     EXPECT_NEAR(up[2].y, 48, 1e-5);

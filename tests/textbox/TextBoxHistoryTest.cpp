@@ -253,8 +253,9 @@ TEST_F(TextBoxHistoryTest, redoOfAClearAfterABoxWasAddedTakesTheNewBoxOutOfTheMo
     ASSERT_EQ(idsOf(model().textBoxArray()), (Ids { cleared->hash(), added->hash() }));
     redo();
 
-    // The last one in the model goes; the view that is named goes, but the model still has it, so
-    // that the next repaint brings it back; the view of the one that went is left behind.
+    // Redo takes the last box out of the model, which is the added one, but names the cleared one.
+    // The cleared box's view goes and comes back with the next repaint, because the model still has
+    // the box. The added box's view stays behind.
     EXPECT_EQ(idsOf(model().textBoxArray()), Ids { cleared->hash() });
     EXPECT_EQ(boxes(), (Views { added.get(), cleared.get() }));
 }

@@ -92,8 +92,8 @@ TEST_F(TextCompositionTest, thatIsCutShortKeepsItsLook)
         = [&](int number) { return std::pair(cut[number].start, cut[number].length); };
     EXPECT_EQ(placesOf(0), std::pair(1, 2));
     EXPECT_EQ(placesOf(1), std::pair(3, 0));
-    EXPECT_EQ(placesOf(2), std::pair(3, 1)); // shown or not: no stretch
-    EXPECT_EQ(placesOf(3), std::pair(9, 2)); // in the text
+    EXPECT_EQ(placesOf(2), std::pair(3, 1)); // its length says whether it is seen
+    EXPECT_EQ(placesOf(3), std::pair(9, 2)); // counts in the text
 }
 
 TEST_F(TextCompositionTest, keepsABoxThatHasNothingElseFromBeingDeleted)

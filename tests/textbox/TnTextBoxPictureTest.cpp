@@ -223,8 +223,8 @@ TEST_F(TnTextBoxPictureTest, caretIsInTheTextsColourAndOnlyWhileEditing)
     EXPECT_EQ(pictureOf(*box).pixelColor(end), QColor(Qt::white));
 }
 
-// The editor's own, which inverts what is below it, is as wide as nothing; yet between whole scales
-// the toolkit paints it as a hairline.
+// The editor's own caret, which inverts what is below it, has the width 0. Yet at scales between
+// whole numbers the toolkit would paint it as a hairline.
 TEST_F(TnTextBoxPictureTest, noOtherCaretIsPaintedAtAnyScale)
 {
     canvas->setBrushColor(TnhColors::redColor);
@@ -266,7 +266,7 @@ TEST_F(TnTextBoxPictureTest, caretIsPaintedOnlyWhereTheKeysGo)
     ASSERT_EQ(pictureOf(*box).pixelColor(caret), TnhColors::redColor);
 
     box->clearFocus();
-    QFocusEvent in(QEvent::FocusIn, Qt::OtherFocusReason); // said to come, and gone again
+    QFocusEvent in(QEvent::FocusIn, Qt::OtherFocusReason); // tells of a focus that is gone
     QCoreApplication::sendEvent(box.get(), &in);
     ASSERT_FALSE(box->hasFocus());
     settle();
@@ -276,7 +276,8 @@ TEST_F(TnTextBoxPictureTest, caretIsPaintedOnlyWhereTheKeysGo)
 
 TEST_F(TnTextBoxPictureTest, shorterDirtyRectangleDrawsNoDashedBorder)
 {
-    // Below the rule of draw(), which always asks for the whole: half of it is no border.
+    // drawBorder() is called directly, because draw() always asks for the whole border. For half of
+    // the height it draws none.
     class HalfBorder final : public QObject
     {
     public:

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The tool bar for who does not use the pointer: names, descriptions, and the press action.
+// The tool bar for people who do not use a pointer: names, descriptions, and the press action.
 #include "toolpanel/ToolPanelFixture.h"
 
 #include <QAccessible>

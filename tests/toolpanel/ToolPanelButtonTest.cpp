@@ -260,7 +260,8 @@ TEST_F(EndButton, takesTheOrdinaryColoursWhenToggled)
     EXPECT_EQ(look(), (ButtonLook { hoveredContrast, Shown::AlternateImage, whiteTriangle }));
 }
 
-// (30, 30), (30, 24) and (24, 30): what is right of its slope is full, what lies on it is half.
+// The corners are (30, 30), (30, 24) and (24, 30): pixels right of the slope are wholly covered,
+// those on it by half.
 TEST_P(ButtonWithOptions, hasATriangleInItsLowerRightCorner)
 {
     m_button.assignArrowColor(Qt::black);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A white board with its tool bar, open before nobody's eyes.
+// A white board with its tool bar, open without a screen.
 #pragma once
 
 #include "canvas/DrawViewController.h"

@@ -45,8 +45,8 @@ protected:
     /// The screen's place of a place on the board.
     [[nodiscard]] QPoint onScreen(QPoint place) { return canvas().topLeft() + place; }
 
-    /// The tool bar on the screen. It stands on the board, 20 points from its left edge. Where it
-    /// is, is the server's word; the log knows where its buttons are in it.
+    /// The tool bar on the screen. It stands on the board, 20 points from its left edge. The server
+    /// is asked for its place; where its buttons are in it is known from the log.
     [[nodiscard]] WindowState toolBar();
     /// The tool bar's window, which must be on the screen.
     [[nodiscard]] WindowId toolBarWindow();

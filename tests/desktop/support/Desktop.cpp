@@ -52,7 +52,8 @@ Desktop::~Desktop()
 
 std::vector<std::string> Desktop::environment() const
 {
-    // A bus that is not there, said outright: without an address one would be started, and stay.
+    // The address of a bus that does not exist: without any address a program would start a bus,
+    // which would stay.
     return environmentWithBus("unix:path=" + file("no-bus"));
 }
 
@@ -162,7 +163,7 @@ void Desktop::startWindowManager()
     const std::vector<std::string> command = m_kindOfManager == WindowManager::Openbox
         ? std::vector<std::string> { "openbox", "--sm-disable" }
         : std::vector<std::string> { "xfwm4", "--compositor=off" };
-    // Xfwm4 reads its settings over a bus, or does not start.
+    // Xfwm4 reads its settings over a bus, and does not start without one.
     m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command { command,
         m_kindOfManager == WindowManager::Xfwm4 ? environmentWithBus(sessionBus()) : environment(),
         file("window-manager.log") });

@@ -24,7 +24,7 @@ ChildProcess::Command hostCommand(const Desktop &desktop, const std::string &err
     command.arguments.insert(command.arguments.end(), arguments.begin(), arguments.end());
     command.environment.emplace_back("QT_QPA_PLATFORM=xcb");
     for (const std::string &variable : variables) {
-        // Of two with one name the first would count.
+        // If a variable were there twice, the first would count.
         const std::string name = variable.substr(0, variable.find('=') + 1);
         std::erase_if(command.environment,
             [&name](const std::string &other) { return other.starts_with(name); });

@@ -7,10 +7,11 @@ namespace penwick::desktop {
 
 namespace {
 
-// Beside every image, and inside the end button, which is the smallest.
+// From the middle of any button to a place beside its image, but still inside the button; the end
+// button is the smallest.
 const QPoint beside(-15, -11);
 
-// An image's darkest tone; one that is disabled is lighter than half.
+// The darkest level of a button's image is below this; that of a disabled button's is above.
 constexpr int halfway = 100;
 
 } // namespace

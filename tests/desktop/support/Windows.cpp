@@ -128,8 +128,8 @@ std::vector<WindowId> Windows::ofProcess(int processId) const
 
 bool Windows::areManaged() const
 {
-    // The window that one announces itself by names itself too; what it said of the desktop before
-    // may outlive it.
+    // A window manager names a window of its own on the root, and that window names itself. When
+    // the window manager has ended, the root's word may still be there, but not the window's.
     const char *const announcement = "_NET_SUPPORTING_WM_CHECK";
     const std::vector<unsigned long> check = numbers(root(), announcement);
     return check.size() == 1 && numbers(check.front(), announcement) == check

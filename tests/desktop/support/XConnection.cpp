@@ -60,7 +60,8 @@ void XConnection::setMonitors(const std::vector<QRect> &monitors) const
         monitor.height = area.height();
         monitor.mwidth = area.width() / 4; // about 96 pixels an inch
         monitor.mheight = area.height() / 4;
-        // The first takes the server's only output away from the monitor that it had been.
+        // The first monitor gets the server's only output, which ends the monitor that had it
+        // before.
         monitor.noutput = isFirst ? 1 : 0;
         monitor.outputs = resources->outputs;
         XRRSetMonitor(m_display, root(), &monitor);
@@ -87,8 +88,8 @@ void XConnection::finish() const
 
 void XConnection::awaitWindowManager()
 {
-    // It announces itself before it looks at its events, and what came in between may lie there
-    // until something else comes: so it is asked again and again.
+    // A window manager announces itself before it handles events, and a question that comes in
+    // between may wait until another event comes. So it is asked again and again.
     const Window firstProbe = makeProbe();
     require(
         [this, firstProbe] {
@@ -105,7 +106,7 @@ void XConnection::finishWithWindowManager() const
     finish();
     if (!m_probe)
         return;
-    // It takes its events in their order, so that its answer to this one comes after the others.
+    // The window manager handles its events in order, so its answer to this one comes last.
     askWindowManager(m_probe);
     require([this] { return hasAnswered(m_probe); }, "the window manager to answer");
 }
