@@ -29,8 +29,8 @@ QPointF toQt(Point point)
     return { point.x, point.y };
 }
 
-// A QPainterPath leaves out a line or curve that leads nowhere, or hardly anywhere. One that leads
-// far away may be moved back afterwards, and stays.
+// A QPainterPath leaves out a line or curve that ends where it began, or very near. So its end is
+// first put to this other place, and then moved to where it belongs.
 QPointF farFrom(QPointF point)
 {
     return { point.x() > 0.0 ? -1.0 : 1.0, point.y() };

@@ -7,7 +7,7 @@ namespace penwick::platform {
 
 Clock &Clock::ofTheDesktop()
 {
-    // Never ended: a host may keep windows for longer than anything that is made here.
+    // Never destroyed, because a host may keep windows until the very end of the process.
     static Clock &clock = *new Clock;
     return clock;
 }

@@ -19,9 +19,9 @@ class Clock final
 public:
     using Time = std::chrono::milliseconds; ///< since some moment, the same for all clocks
 
-    /// What a desktop is given to answer in.
+    /// The clock by which the desktop's answers are awaited.
     [[nodiscard]] static Clock &ofTheDesktop();
-    /// What a user is given to go on in.
+    /// The clock by which is told whether the user goes on.
     [[nodiscard]] static Clock &ofTheUser();
 
     [[nodiscard]] Time now() const;
@@ -46,16 +46,16 @@ class Alarm final : public QObject
     Q_OBJECT
 
 public:
-    /// Borrows `clock`, which all alarms end before.
+    /// Borrows `clock`, which must outlive the alarm.
     explicit Alarm(Clock &clock, QObject *parent = nullptr);
     ~Alarm() override;
 
-    /// In place of the time that was set before. A time that has passed rings with the next turn of
-    /// the event loop.
+    /// Sets the alarm to `at`, in place of the time before. For a time that has passed it rings
+    /// with the next turn of the event loop.
     void set(Clock::Time at);
     void cancel();
     [[nodiscard]] std::optional<Clock::Time> at() const { return m_at; }
-    /// At once, and not again until it is set again.
+    /// Rings at once, and not again until it is set again.
     void ring();
 
 Q_SIGNALS:

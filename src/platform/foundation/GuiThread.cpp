@@ -26,7 +26,7 @@ void requireGuiThread()
 {
     const QCoreApplication *const application = QCoreApplication::instance();
     if (!application && QCoreApplication::closingDown())
-        return; // what a host still holds is let go of now, by way of these very operations
+        return; // a host may still hold objects of ours, and lets go of them now
     if (!application)
         fatalError(noApplication);
     if (!isThreadOf(*application))
@@ -36,7 +36,7 @@ void requireGuiThread()
 void requireApplication()
 {
     requireGuiThread();
-    // By name: this half of the platform knows nothing of widgets.
+    // The class is asked for by its name, because this folder does not link Widgets.
     if (!QCoreApplication::instance()->inherits("QApplication"))
         fatalError(applicationWithoutWidgets);
 }

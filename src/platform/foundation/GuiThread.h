@@ -1,19 +1,21 @@
 // SPDX-License-Identifier: MIT
-// Who may call the public operations: the application's own thread, and where there is one.
+// Checks that a public operation runs on the application's own thread, and that there is an
+// application.
 #pragma once
 
 namespace penwick::platform {
 
-/// A fatal error unless this is the thread of the application object. Each public operation of the
-/// entry object, of the controllers and of the windows asks first; it costs one comparison. Content
-/// once the application object has been and is gone: objects of ours may outlive it and end then.
+/// A fatal error unless this is the thread of the application object. Each public operation of
+/// Penwick, of the controllers and of the windows calls it first; it costs one comparison. Passes
+/// once the application object is destroyed, because objects of ours may outlive it.
 void requireGuiThread();
 
-/// The same, and a fatal error too unless the application object is one that has widgets. What
-/// constructs the first object of ours asks, before the toolkit says so in words of its own.
+/// Like requireGuiThread(), and also a fatal error unless the application object has widgets. The
+/// constructors of the first objects of ours call it, so that the process ends with a line of ours
+/// and not with one of the toolkit's.
 void requireApplication();
 
-/// What a destructor asks: like requireGuiThread(), but content where the application is gone.
+/// For destructors: like requireGuiThread(), but passes where there is no application.
 void requireGuiThreadAtEnd();
 
 } // namespace penwick::platform

@@ -10,7 +10,8 @@ namespace penwick::platform {
 
 namespace {
 
-// Places and sizes are rounded apart, and a desktop may be out by the border that it draws.
+// An edge that moved by less than this was not pulled: places and sizes are rounded separately, and
+// a desktop may be wrong by the width of a border.
 constexpr double samePlace = 2.5; // points
 
 // By how much `size` shrinks to fit into `room`; never grows.

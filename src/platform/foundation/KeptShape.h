@@ -14,10 +14,10 @@ namespace penwick::platform {
 /// each way; never larger than `picture`.
 [[nodiscard]] Size scaledDownInto(const Size &picture, const Size &room);
 
-/// The frame in the shape of `ratio` for one that the user has pulled from `before` to `pulled`:
-/// where an edge was pulled outward, the smallest that holds what was pulled, so that no such pull
-/// makes a window smaller; otherwise the largest that fits into it. The edges that were not pulled
-/// stay, the top and left ones where none was.
+/// The frame in the shape of `ratio` for one that the user has pulled from `before` to `pulled`. If
+/// an edge was pulled outward, it is the smallest that holds `pulled`, so that no such pull makes a
+/// window smaller; otherwise the largest that fits into `pulled`. Edges that were not pulled stay;
+/// if that decides nothing, the top and the left edge do.
 [[nodiscard]] Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio);
 
 } // namespace penwick::platform

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Something that is done once, later, unless its owner is gone by then.
-// The toolkit's own one-shots outlive the object that they were to call, and fire into nothing.
+// A QTimer::singleShot() would live on after the object that it was to call.
 #pragma once
 
 #include <QTimer>

@@ -7,7 +7,7 @@ namespace penwick::platform {
 
 namespace {
 
-// The low end of `length` from `start` on, within `room` from `low` on.
+// Where something of `length` begins, as near to `start` as possible, within `room` from `low` on.
 double within(double start, double length, double low, double room)
 {
     return std::max(low, std::min(start, low + room - length));

@@ -13,14 +13,14 @@ enum class KeptEdge
     Bottom
 };
 
-/// `frame` moved by as little as brings it inside `area`; never resized. One that is wider than
-/// `area` keeps its left edge in it, one that is higher the edge that `edge` names.
+/// `frame` moved into `area`, no farther than it must be, and never resized. A frame that is wider
+/// than `area` keeps its left edge inside, one that is higher the edge that `edge` names.
 [[nodiscard]] Rect broughtInside(
     const Rect &frame, const Rect &area, KeptEdge edge = KeptEdge::Top);
 
-/// The same, beside `free`, which is to stay uncovered: where `frame` cannot be on its own side of
-/// it, it stands on the other one at the same distance, or nearer where there is no room for that,
-/// or else above or below. Only where there is room on no side at all does it cover `free`.
+/// Like broughtInside(), but leaves `free` uncovered. If `frame` cannot be on its own side of
+/// `free`, it goes to the other side, at the same distance or nearer if there is less room, or else
+/// above or below. It covers `free` only if there is room on no side.
 [[nodiscard]] Rect broughtInsideBeside(const Rect &frame, const Rect &area, const Rect &free);
 
 } // namespace penwick::platform
