@@ -8,7 +8,7 @@ namespace penwick::platform {
 
 NativeDesktop &NativeDesktop::instance()
 {
-    // One for each application: the connection to the desktop goes with it.
+    // One for each application object, because the connection to the desktop ends with it.
     static QPointer<QObject> application;
     static std::unique_ptr<NativeDesktop> desktop;
     if (!desktop || application != qApp) {

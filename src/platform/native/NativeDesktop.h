@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What only the desktop's own protocol can do with a window: one file a desktop behind it.
+// What only the desktop's own protocol can do with a window. Each desktop implements it in a file
+// of its own.
 #pragma once
 
 #include "platform/native/NativeWindowValues.h"
@@ -18,8 +19,8 @@ namespace penwick::platform {
 class NativeDesktop
 {
 public:
-    /// The one that this process was started on; one that does nothing where there is no protocol
-    /// to speak.
+    /// The desktop that this process runs on; one whose operations do nothing where no desktop is
+    /// known.
     static NativeDesktop &instance();
 
     virtual ~NativeDesktop() = default;
@@ -33,26 +34,28 @@ public:
     /// nothing while the window has no frame of the window manager's.
     using FrameListener = std::function<void(std::optional<QPoint> corner)>;
 
-    /// Calls `listener` from now on whenever the window manager moves `window`'s frame, also where
-    /// it tells the window itself only at the end, and keeps the window's being dragged by its
-    /// title bar from looking like another window's taking over. Replaces an earlier listener of
-    /// the same window. Does nothing where the desktop, or the host, leaves no way to know.
+    /// Calls `listener` from now on whenever the window manager moves the frame of `window`, even
+    /// if the window itself is told only at the end of a drag. Also hides from the toolkit the
+    /// change of focus during a drag by the title bar, which looks as if another window became
+    /// active. Replaces an earlier listener of the same window. Does nothing where the desktop, or
+    /// the host, leaves no way to know.
     virtual void followFrame(QWindow &window, FrameListener listener);
-    /// Ends it; `window` may be gone.
+    /// Ends followFrame() for `window`, which may be gone.
     virtual void forgetFrame(WId window);
 
-    /// Whether a window that is to be left out of captures of the screen is, once it is shown.
+    /// Whether the desktop itself can keep a window out of captures of the screen.
     [[nodiscard]] virtual bool keepsWindowsOutOfCaptures() const;
     /// Whether a button of the pointer is held down, over whatever program's window; false where
-    /// the desktop does not tell. Asks the desktop: not for the path of a pointer event.
+    /// the desktop does not tell. Waits for the desktop's answer, so it must not be called for each
+    /// event of the pointer.
     [[nodiscard]] virtual bool isPointerHeld() const;
     /// Whether transparent pixels of a window show what is below it.
     [[nodiscard]] virtual bool isCompositing() const;
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that
-    /// is empty. Wears off when the window is created anew.
+    /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);
-    /// What can be done of `attributes` once `window` is on the screen: on every virtual desktop,
-    /// out of captures of the screen.
+    /// Applies what the desktop can do of `values` once `window` is on the screen, such as showing
+    /// it on every virtual desktop or keeping it out of captures.
     virtual void applyAttributes(QWindow &window, const NativeWindowValues &values);
 };
 

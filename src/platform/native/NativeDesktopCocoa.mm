@@ -15,7 +15,7 @@ class NativeDesktopCocoa final : public NativeDesktop
 public:
     [[nodiscard]] bool keepsWindowsOutOfCaptures() const override
     {
-        // The system's newer way of capturing heeds the sharing type no longer.
+        // From macOS 15 on, captures of the screen ignore the sharing type.
         return QOperatingSystemVersion::current()
             < QOperatingSystemVersion(QOperatingSystemVersion::MacOS, 15);
     }
@@ -24,7 +24,7 @@ public:
     {
         NSWindow *const native = nativeWindow(window);
         if (content.isEmpty())
-            native.resizeIncrements = NSMakeSize(1.0, 1.0); // which lifts the ratio
+            native.resizeIncrements = NSMakeSize(1.0, 1.0); // which removes the ratio
         else
             native.contentAspectRatio = NSMakeSize(content.width(), content.height());
     }

@@ -20,11 +20,11 @@ namespace penwick::platform {
 
 namespace {
 
-// A window manager answers within a millisecond; one that does not is not waited for.
+// Window managers usually answer within a millisecond. Nobody waits longer than this for one.
 constexpr int longestWait = 50; // ms
 
 constexpr std::uint32_t allDesktops = 0xFFFFFFFF;
-constexpr std::uint32_t fromApplication = 1; // and not from a pager
+constexpr std::uint32_t fromApplication = 1; // the request is not a pager's
 
 class NativeDesktopX11 final : public NativeDesktop
 {
@@ -48,7 +48,7 @@ public:
         if (!windowManagerSupports(m_requestFrameExtents))
             return std::nullopt;
         const auto id = static_cast<xcb_window_t>(window.winId());
-        // What an earlier showing left behind would be taken for the answer.
+        // Otherwise what is left from an earlier showing would be taken for the answer.
         xcb_delete_property(m_connection, id, m_frameExtents);
         askToRoot(id, m_requestFrameExtents);
         QElapsedTimer clock;
@@ -120,8 +120,9 @@ private:
         return values;
     }
 
-    // What a window manager has written on the root outlives it; its own window does not. Whoever
-    // has written nothing is not known.
+    // Whether there was a window manager that has ended. What it wrote on the root window outlives
+    // it; the window of its own that it named there does not. If nothing was written, nothing is
+    // known, and the answer is no.
     [[nodiscard]] bool hasManagerEnded() const
     {
         const auto announced = numbers(m_root, m_managerCheck, XCB_ATOM_WINDOW, 1);
@@ -167,8 +168,8 @@ private:
 
 std::unique_ptr<NativeDesktop> makeNativeDesktop()
 {
-    // Qt's windowless platform has this interface too: without a connection, or with one on which
-    // none of our windows is.
+    // Qt's offscreen platform offers this interface too, without a connection, or with one that
+    // none of our windows is on.
     if (QGuiApplication::platformName() != QStringLiteral("xcb"))
         return nullptr;
     auto *const x11 = qGuiApp->nativeInterface<QNativeInterface::QX11Application>();

@@ -6,8 +6,7 @@
 
 namespace penwick::platform {
 
-/// The raw values that a native window of the desktop that the component was designed on takes,
-/// and what they come to on the others.
+/// The raw values that a window of AppKit's takes, and what follows from them on other desktops.
 struct NativeWindowValues
 {
     unsigned long styleMask = 0;

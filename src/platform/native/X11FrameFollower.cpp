@@ -75,8 +75,8 @@ bool X11FrameFollower::nativeEventFilter(const QByteArray &eventType, void *mess
     }
 }
 
-// A window manager that drags a window grabs the keyboard, which looks as if another window had
-// taken over until the user lets go.
+// A window manager that drags a window grabs the keyboard. The toolkit would take that for another
+// window becoming active, until the user lets go.
 bool X11FrameFollower::isFocusOfAGrab(const xcb_focus_in_event_t &event)
 {
     return (event.mode == XCB_NOTIFY_MODE_GRAB || event.mode == XCB_NOTIFY_MODE_UNGRAB)
@@ -93,9 +93,9 @@ void X11FrameFollower::onReparented(const xcb_reparent_notify_event_t &event)
         followed->listener(std::nullopt);
         return;
     }
-    const std::uint32_t mask = XCB_EVENT_MASK_STRUCTURE_NOTIFY; // ours alone: masks are per client
+    const std::uint32_t mask = XCB_EVENT_MASK_STRUCTURE_NOTIFY; // each client has its own
     xcb_change_window_attributes(m_connection, followed->frame, XCB_CW_EVENT_MASK, &mask);
-    // Where it went before we listened.
+    // The frame may have moved before this connection listened.
     const auto cookie = xcb_get_geometry(m_connection, followed->frame);
     const auto reply = owned(xcb_get_geometry_reply(m_connection, cookie, nullptr));
     if (reply)
@@ -149,7 +149,7 @@ void X11FrameFollower::writeContentRatio(const Followed &followed) const
             wanted[place + 1] = static_cast<std::uint32_t>(followed.contentRatio.height());
         }
     }
-    if (wanted == hints) // ours already: this is what the news was about
+    if (wanted == hints) // the event told of our own change
         return;
     xcb_change_property(m_connection, XCB_PROP_MODE_REPLACE, followed.window,
         XCB_ATOM_WM_NORMAL_HINTS, XCB_ATOM_WM_SIZE_HINTS, 32, sizeHintsLength, wanted.data());

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Follows the frames that a window manager puts around windows.
-// Some tell a window that is dragged by its title bar nothing until it is let go; the frame itself
-// always knows.
+// Some window managers tell a window that is dragged by its title bar nothing until it is let go.
+// The frame, a window of the window manager's own, moves at once and tells so.
 #pragma once
 
 #include "platform/native/NativeDesktop.h"
@@ -15,8 +15,8 @@
 
 namespace penwick::platform {
 
-/// Listens on the application's own connection. A host that runs without native event filters
-/// hears nothing, and the windows are followed by what the toolkit tells.
+/// Listens on the application's own connection. In a host whose event loop calls no native event
+/// filters it hears nothing; the windows are then followed by the toolkit's events alone.
 class X11FrameFollower final : public QAbstractNativeEventFilter
 {
 public:
@@ -25,8 +25,9 @@ public:
 
     void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
     void forget(xcb_window_t window);
-    /// Puts the shape that a window's content keeps into its hints, and again whenever the toolkit
-    /// writes them without it; an empty `content` takes it out. Only for a followed window.
+    /// Writes the shape that the content of `window` keeps into the window's hints, and again
+    /// whenever the toolkit writes them without it; an empty `content` takes it out. Only for a
+    /// followed window.
     void keepContentRatio(xcb_window_t window, const QSize &content);
 
     bool nativeEventFilter(const QByteArray &eventType, void *message, qintptr *result) override;
