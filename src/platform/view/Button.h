@@ -14,7 +14,7 @@
 namespace penwick::platform {
 
 /// An image (or a title where there is none) in the middle of a coloured background. It never
-/// takes the keys. Its own coordinates run downwards, as text does.
+/// takes the keys. Its own y axis points downwards, as text runs.
 class Button : public ViewOf<QPushButton>
 {
     Q_OBJECT
@@ -59,16 +59,17 @@ public:
     [[nodiscard]] const QColor &backgroundColor() const { return m_backgroundColor; }
     void setBackgroundColor(const QColor &color);
     [[nodiscard]] const AttributedString &attributedTitle() const { return m_attributedTitle; }
-    /// One that is too long for the button is shown smaller, or shortened, and whole as tool tip.
+    /// A title that is too long for the button is shown smaller, or shortened, and whole in its
+    /// tool tip.
     void setAttributedTitle(const AttributedString &title);
 
     void draw(const Rect &dirtyRect) override;
     [[nodiscard]] QSize sizeHint() const override;
 
 protected:
-    /// A disabled button takes presses without doing anything, but is pressed all the same.
+    /// A disabled button does nothing when it is pressed, but ViewInput tells of the press.
     bool event(QEvent *event) override;
-    /// The whole of it, whatever the style thinks a button's middle is.
+    /// The whole button can be pressed; a style may say that only a part of it can.
     [[nodiscard]] bool hitButton(const QPoint &position) const override;
 
 private:

@@ -98,7 +98,7 @@ void Cursor::set(View &view) const
 {
     current() = *this;
     const QCursor shown = forScale(view.widget().devicePixelRatioF());
-    // Set again, it would go to the desktop again: too much for every move of a pointer.
+    // Each setCursor() goes to the desktop, which is too much for every move of the pointer.
     if (!view.surface().testAttribute(Qt::WA_SetCursor) || view.surface().cursor() != shown)
         view.surface().setCursor(shown);
     lastSet() = { &view.surface(), shown };
@@ -106,7 +106,7 @@ void Cursor::set(View &view) const
 
 Cursor Cursor::currentCursor()
 {
-    // A host reaches the component's widgets, too.
+    // The host may have given the widget another cursor meanwhile.
     const SetCursor &last = lastSet();
     return last.widget && last.widget->cursor() != last.shown ? arrow() : current();
 }

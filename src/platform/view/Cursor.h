@@ -28,7 +28,7 @@ public:
     [[nodiscard]] Point hotSpot() const;
     [[nodiscard]] QIcon image() const; ///< null for arrow()
 
-    /// The cursor for a window of `devicePixelRatio`. The image is rendered once for each.
+    /// The cursor for a window with `devicePixelRatio`. The image is rendered once for each ratio.
     [[nodiscard]] QCursor forScale(double devicePixelRatio) const;
 
     /// Shows this cursor now over `view`, until the pointer next enters a view with a cursor of

@@ -35,7 +35,8 @@ QRectF ImageView::imagePlace() const
     return { 0.0, height() - size.height, size.width, size.height };
 }
 
-// Strokes over the image have it painted again and again, and a painter scales less well.
+// The scaled image is kept, because each stroke over it has it painted again, and because a painter
+// scales less well.
 const QImage &ImageView::scaledTo(QSize pixels)
 {
     if (m_scaled.size() != pixels)

@@ -38,7 +38,7 @@ private:
     [[nodiscard]] const QImage &scaledTo(QSize pixels);
 
     QImage m_image;
-    QImage m_scaled; // as last shown where it is smaller; null until then
+    QImage m_scaled; // m_image as it was last scaled down; null until then
     ImageFrameStyle m_imageFrameStyle = ImageFrameStyle::None;
 };
 

@@ -33,7 +33,7 @@ void Layer::paintBorder(QPainter &painter, const QRectF &bounds) const
         return;
     const double inset = borderWidth / 2;
     const double radius = cornerRadius > inset ? cornerRadius - inset : 0.0;
-    // A square border has no edge between pixels to soften unless its width is odd in pixels.
+    // Smooth edges change a square border only where its edges do not lie between two pixels.
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(QPen(borderColor, borderWidth, Qt::SolidLine, Qt::SquareCap,
         radius > 0.0 ? Qt::RoundJoin : Qt::MiterJoin));

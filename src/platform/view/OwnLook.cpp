@@ -20,8 +20,7 @@ constexpr QColor selection { 48, 140, 198 };
 
 } // namespace
 
-// A widget that is polished while it comes to the screen hears of nothing afterwards but that it is
-// shown.
+// A widget that a style polishes on its way to the screen hears of it by no event but Show.
 bool isAboutLook(const QEvent &event)
 {
     return event.type() == QEvent::Polish || event.type() == QEvent::StyleChange
@@ -55,20 +54,20 @@ QFont ownFont(double size, QFont font)
 
 OwnEditorLook::OwnEditorLook(QTextEdit &editor)
 {
-    QPalette colors(ground); // whole: nothing of it is the application's
+    QPalette colors(ground); // sets all colours, so that none is the application's
     colors.setColor(QPalette::Text, editor.palette().color(QPalette::Text));
     colors.setColor(QPalette::Highlight, selection);
     colors.setColor(QPalette::HighlightedText, Qt::white);
     editor.setPalette(colors);
-    // What is selected is painted in the sheet's colours even so, unless a nearer sheet has others.
+    // An application's style sheet still colours the selection, unless the editor's own sheet does.
     editor.setStyleSheet(
         QStringLiteral("QTextEdit { selection-background-color: %1; selection-color: white; }")
             .arg(selection.name()));
     editor.installEventFilter(this);
 }
 
-// The editor takes its document's font and its text's colours from the widget's whenever those
-// change, and a style sheet's are the widget's, whatever the widget was given.
+// At these events a QTextEdit takes the widget's font and colours for its text. With a style sheet
+// they are the sheet's, whatever the widget was given. So the editor does not hear of them.
 bool OwnEditorLook::eventFilter(QObject *watched, QEvent *event)
 {
     static_cast<void>(watched);

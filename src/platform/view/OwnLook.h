@@ -10,21 +10,22 @@ class QWidget;
 
 namespace penwick::platform {
 
-/// Whether `event` follows upon what a style has done to a widget.
+/// Whether `event` is one after which a style may have changed a widget's look.
 [[nodiscard]] bool isAboutLook(const QEvent &event);
 
-/// Takes back what the application's style has done to `widget`. Answers whether it had made the
-/// widget larger or smaller than it may be.
+/// Takes back what the application's style has done to `widget`. Returns whether there were limits
+/// on the size of `widget`, which may have resized it.
 ///
 /// An application's style sheet cannot be kept from a widget: the toolkit wraps whatever style the
 /// widget is given in one that applies the sheet, and a sheet of the widget's own overrides only
-/// the properties that it thinks of. So views do not ask their style for anything, and what a style
-/// does to a widget by itself, when it polishes it, is undone: sizes below or above which it may
-/// not go, and backgrounds painted behind it.
+/// the properties that it names. So views do not ask their style for anything, and what a style
+/// does to a widget by itself, when it polishes it, is undone: limits on its size, and backgrounds
+/// painted behind it.
 bool keepOwnLook(QWidget &widget);
 
-/// The desktop's own font, whatever the application's is, `size` points of the screen's logical
-/// pixels high. Nothing of it is left to the widget or the painter that it is used with.
+/// The desktop's own font, whatever the application's is, `size` points high, which are logical
+/// pixels of the screen. All its properties are set, so that no widget or painter that it is used
+/// with fills in others.
 [[nodiscard]] QFont ownFont(double size);
 
 /// The same with another font than the desktop's.

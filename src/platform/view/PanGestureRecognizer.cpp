@@ -9,7 +9,7 @@ namespace penwick::platform {
 
 namespace {
 
-// A hand that clicks is not that steady.
+// A click may move by less than this, because no hand is quite steady.
 constexpr double slop = 3.0; // points
 
 } // namespace
@@ -38,7 +38,7 @@ void PanGestureRecognizer::dragged(Point location)
         const Point way = location - m_pressLocation;
         if (std::hypot(way.x, way.y) < slop)
             return;
-        // From where it was pressed, so that what lies under the pointer stays under it.
+        // The drag begins at the press, so that what was taken hold of stays under the pointer.
         enter(State::Began, m_pressLocation);
     }
     enter(State::Changed, location);

@@ -23,7 +23,7 @@ bool PointerContact::isContinuedBy(const QPointerEvent &event) const
     return m_isOn && wayOf(event) == m_way;
 }
 
-// A device that is gone, unplugged in the middle of a contact, would exclude all others for ever.
+// A device that was unplugged in the middle of a contact must not exclude all others for ever.
 bool PointerContact::excludes(const QPointerEvent &press) const
 {
     return m_isOn && wayOf(press) != m_way && m_device;

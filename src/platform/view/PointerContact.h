@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// One pointer at a time works on a view, and what it does is a click until it has gone far enough.
+// One pointer at a time works on a view, and its press is a click until it has moved far enough.
 #pragma once
 
 #include "platform/view/View.h"
@@ -15,28 +15,31 @@ namespace penwick::platform {
 /// The contact of a pointer with one view, from the press to the release.
 ///
 /// The toolkit may tell the same contact of a pen twice, as the pen's own events and as a mouse's;
-/// and a mouse may be pressed while a pen is down. Only what began the contact goes on with it.
+/// and a mouse may be pressed while a pen is down. Only events of the kind that began the contact
+/// continue it.
 class PointerContact
 {
 public:
-    /// Whether there is one.
+    /// Whether there is a contact.
     [[nodiscard]] bool isOn() const { return m_isOn; }
-    /// Whether `event` goes on with it: it comes the way that the press came.
+    /// Whether `event` continues the contact: it is told in the same way as the press was.
     [[nodiscard]] bool isContinuedBy(const QPointerEvent &event) const;
-    /// Whether a press may not begin one, because another pointer that is still there has.
+    /// Whether `press` must not begin a contact, because another pointer, which is still there, has
+    /// one.
     [[nodiscard]] bool excludes(const QPointerEvent &press) const;
-    /// Whether `hover`, which holds no button, tells that it is over though no release was heard: a
-    /// pen that is down does not hover.
+    /// Whether `hover`, a move without a button, shows that the contact is over although no release
+    /// was heard: a pointer that is down does not hover.
     [[nodiscard]] bool isBeliedBy(const QPointerEvent &hover) const;
 
-    /// A press at `location`, in the window, begins one, in the place of one that was not ended.
+    /// Begins a contact with a press at `location`, in the window. An earlier contact that was not
+    /// ended is forgotten.
     void begin(const QPointerEvent &press, Point location, int clickCount);
-    /// Ends it; answers whether there was one.
+    /// Ends the contact; returns whether there was one.
     bool end();
 
     [[nodiscard]] int clickCount() const { return m_clickCount; } ///< of the press
-    /// Whether it is a drag now that it is at `location`: it has once been at least `distance`
-    /// away from the press, along both axes together.
+    /// Whether the contact is a drag, now that its pointer is at `location`: the pointer has once
+    /// been at least `distance` points away from the press, both axes added up.
     [[nodiscard]] bool isDrag(Point location, double distance);
 
 private:
@@ -56,10 +59,11 @@ private:
     int m_clickCount = 0;
 };
 
-/// Which end of a pen `event` is of, in whichever way the toolkit tells it.
+/// Which end of a pen `event` is of, whether the toolkit tells it as a pen's or as a mouse's.
 [[nodiscard]] PenEnd penEndOf(const QPointerEvent &event);
-/// Whether a pen's press may be taken as it is. While a menu or a dialog is open it goes to the
-/// toolkit, which makes a mouse's of it: only those close menus and stop at dialogs.
+/// Whether a view may take a pen's press itself. While a menu or a dialog is open the press is left
+/// to the toolkit, which turns it into a mouse's: only a mouse's press closes menus and is held
+/// back by dialogs.
 [[nodiscard]] bool mayTakePress(const QTabletEvent &event);
 
 } // namespace penwick::platform

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Whether the pointer is being held down on a view, for what must not happen meanwhile.
+// Knows whether the pointer is held down on a view, and puts off what must not happen meanwhile.
 #pragma once
 
 #include <QObject>
@@ -8,9 +8,9 @@
 
 namespace penwick::platform {
 
-/// A view was pressed; what afterPointerIsReleased() gets from now on waits.
+/// A view was pressed: from now on what afterPointerIsReleased() is given waits.
 void pointerWasPressed();
-/// It was let go, or will not be heard of again: what has waited runs, in order.
+/// The pointer was let go, or its release will never be heard: what has waited runs, in order.
 void pointerWasReleased();
 
 /// Runs `action` at once, or, while the pointer is held down on a view, as soon as it is let go.

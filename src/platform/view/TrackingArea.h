@@ -6,8 +6,8 @@
 
 namespace penwick::platform {
 
-/// Kept as it is set, for whoever asks for it: every widget is told of the pointer by itself, over
-/// the whole of its bounds as they are then.
+/// Kept as it is set, but without effect: every widget is told of the pointer anyway, over the
+/// whole of its present bounds.
 struct TrackingArea
 {
     static constexpr unsigned mouseEnteredAndExited = 0x01;

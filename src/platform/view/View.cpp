@@ -36,7 +36,7 @@ View::~View()
         detachFrom(*m_superview);
     for (const Subview &subview : m_subviews) {
         subview.view->m_superview = nullptr;
-        // Who else holds it decides when it dies, not the widget tree.
+        // A subview that somebody else holds must not be destroyed together with this widget.
         if (subview.strong)
             subview.view->m_widget.setParent(nullptr);
     }
@@ -192,7 +192,7 @@ void View::setSubviews(const std::vector<View *> &views)
 {
     for (View *const present : subviews()) {
         const bool isKept = std::find(views.begin(), views.end(), present) != views.end();
-        // An earlier one may have taken others with it as it resigned.
+        // A view that was removed before this one may have removed this one as it resigned.
         if (!isKept && present->m_superview == this)
             present->removeFromSuperview();
     }
@@ -338,7 +338,7 @@ void View::setNeedsDisplay()
 
 void View::setNeedsDisplay(const Rect &rect)
 {
-    // Within the view, so that no size, however absurd, is too large for whole numbers.
+    // Only what lies inside the view: a rectangle may be too large for whole numbers.
     surface().update(toSurface(rect).intersected(surface().rect()).toAlignedRect());
 }
 

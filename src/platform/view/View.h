@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// A widget with a view's meaning: frames from the bottom left, ordered subviews that are shared
-// rather than owned, an optional layer, and events by the names under which classes override them.
-// What turns a widget class into a view is ViewOf.h.
+// A widget as a view: frames are counted from the bottom left, subviews are ordered and shared
+// rather than owned, there may be a layer, and events come by the names under which classes
+// override them. ViewOf.h makes a view of a widget class.
 #pragma once
 
 #include <penwick/platform/Geometry.h>
@@ -44,8 +44,8 @@ struct MouseEvent
 /// One key going down or up.
 struct KeyEvent
 {
-    /// Backspace or Delete, into which other keyboards split what is one key on some. Alone: with
-    /// modifiers held it is no such key.
+    /// Backspace or Delete, which are one key on some keyboards and two on others; without
+    /// modifiers.
     static constexpr int backspaceKeyCode = 51;
 
     int keyCode = 0; ///< 0 for every key that no view asks about
@@ -85,9 +85,11 @@ public:
     [[nodiscard]] Rect bounds() const { return { 0.0, 0.0, m_frame.width, m_frame.height }; }
     /// Whether the view's own coordinates run downwards from its top left corner.
     [[nodiscard]] virtual bool isFlipped() const { return false; }
-    /// `point`, of this view's coordinates, in those of `view`; of the window where it is null.
+    /// Converts `point` from this view's coordinates to those of `view`; to the window's if `view`
+    /// is null.
     [[nodiscard]] Point convertTo(Point point, const View *view) const;
-    /// `point`, of the coordinates of `view` (of the window where it is null), in this view's.
+    /// Converts `point` from the coordinates of `view`, or from the window's if `view` is null, to
+    /// this view's.
     [[nodiscard]] Point convertFrom(Point point, const View *view) const;
 
     // The tree.
@@ -124,29 +126,29 @@ public:
     /// Shows `cursor` while the pointer is over `rect`. Only the whole bounds are supported.
     void addCursorRect(const Rect &rect, const Cursor &cursor);
 
-    /// Lets `recognizer` follow the pointer over this view, the press being handled included. One
-    /// that does already goes on. Borrowed.
+    /// Lets `recognizer` follow the pointer over this view; a press that is being handled is its
+    /// first. A recognizer that was added before stays. Borrowed.
     void addGestureRecognizer(PanGestureRecognizer &recognizer);
     void removeGestureRecognizer(PanGestureRecognizer &recognizer);
 
     // What classes override.
 
-    /// How far from its press the pointer has to go before that is a drag, in points along both
-    /// axes together; 0 makes one of every move. Asked at every move until it is one: the first
-    /// mouseDragged() is the move that got there, at its own place, and then every move is one,
-    /// back at the press too. Gestures have a distance of their own.
+    /// How far the pointer has to move from its press before that is a drag, in points, both axes
+    /// added up; with 0 every move is a drag. Asked at every move until one is far enough. That one
+    /// is the first mouseDragged(), and from then on every move is one, even back at the place of
+    /// the press. Gesture recognizers have a distance of their own.
     [[nodiscard]] virtual double dragDistance() const { return 0.0; }
-    /// Whether the view takes a pen's own events, which know fractions of a pixel. Else the toolkit
-    /// makes a mouse's of them. One that does has to override all of mouseDown(), mouseDragged()
-    /// and mouseUp().
+    /// Whether the view takes a pen's own events, which have fractions of a pixel. Otherwise the
+    /// toolkit turns them into a mouse's. A view that takes them has to override all of
+    /// mouseDown(), mouseDragged() and mouseUp().
     [[nodiscard]] virtual bool takesPens() const { return false; }
 
     /// Paints the content; `dirtyRect` is in the view's own coordinates.
     virtual void draw(const Rect &dirtyRect) = 0;
     /// Paints what belongs to the picture of the drawing and nothing else: no layer, no border, no
-    /// mark of being edited. Nothing unless a class says otherwise. `painter` counts in points from
-    /// the view's top left corner, y down, and is clipped to the view. Also called while the view
-    /// is not on the screen.
+    /// mark of being edited. Paints nothing unless a class overrides it. `painter` is in points
+    /// from the view's top left corner, y down, and is clipped to the view. Also called while the
+    /// view is not on the screen.
     virtual void drawContent(QPainter &painter);
     virtual void mouseDown(const MouseEvent &event) = 0;
     virtual void mouseDragged(const MouseEvent &event) = 0; ///< only after a mouseDown()
@@ -161,15 +163,15 @@ public:
     virtual void awakeFromScene() { }
     /// The view came into a window or left one.
     virtual void viewDidMoveToWindow() { }
-    /// The superview has another size than `former`, its size before.
+    /// The size of the superview has changed; it was `former`.
     virtual void superviewDidResize(Size /*former*/) { }
-    /// Answers whether the view gives the first responder up; its controller's answer where the
-    /// view has one.
+    /// Asks the view to stop being the first responder; returns whether it does. A view with a
+    /// controller returns the controller's answer.
     virtual bool resignFirstResponder();
 
     /// Paints the view as content, and above it its subviews, the lowest first, each in its place;
-    /// `painter` counts in points from the top left corner of what is around the view. A view that
-    /// was hidden paints nothing.
+    /// `painter` is in points from the top left corner of the widget around the view, y down. A
+    /// view for which setHidden(true) was called paints nothing.
     void paintContent(QPainter &painter);
     /// Makes views of the widgets that a scene built below this one: takes the frames from the
     /// widgets' places and enters them as subviews, the lowest first.
@@ -190,9 +192,10 @@ protected:
     void pointerEntered();
     /// The recognizers that follow the pointer now; a copy, because an action may change them.
     [[nodiscard]] std::vector<PanGestureRecognizer *> gestureRecognizers() const;
-    /// `position`, of the surface's pixels from its top left corner, in window coordinates.
+    /// The place (x, y), in points from the surface's top left corner, y down, in the window's
+    /// coordinates.
     [[nodiscard]] Point locationInWindow(double x, double y) const;
-    /// The widget's area that `rect` covers, as Qt counts.
+    /// `rect`, of this view's coordinates, in those of the surface, y down.
     [[nodiscard]] QRectF toSurface(const Rect &rect) const;
     [[nodiscard]] Rect fromSurface(const QRectF &rect) const;
 

@@ -25,10 +25,11 @@ public:
 
     /// The view has been loaded.
     virtual void viewDidLoad() { }
-    /// The window whose content the view is was asked to come to the screen; not again when it
-    /// only comes back together with the window that it belongs to.
+    /// The window whose content the view is was asked to come to the screen. Not called when the
+    /// window only comes back together with its parent window.
     virtual void viewWillAppear() { }
-    /// Answers whether the view, which has the keys and knows nothing better, gives them up.
+    /// Asks, for a view whose class does not decide this itself, whether it stops being the first
+    /// responder.
     virtual bool resignFirstResponder() { return true; }
 
 private:

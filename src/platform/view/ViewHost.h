@@ -11,24 +11,25 @@ namespace penwick::platform {
 
 class View;
 
-/// A window as its views see it: who has the keys, and what they stand on. Each window that holds
-/// views has one, among its children. GUI thread only.
+/// A window as its views see it: which view gets the keys, and the background below the views. Each
+/// window that holds views has a ViewHost among its children. GUI thread only.
 class ViewHost : public QObject
 {
     Q_OBJECT
 
 public:
-    /// Of the window that `widget` is in; null where that holds no views.
+    /// The host of the window that `widget` is in; null if that window holds no views.
     [[nodiscard]] static ViewHost *of(const QWidget &widget);
 
     ~ViewHost() override;
 
     /// The view that fills the window; null without one.
     [[nodiscard]] virtual View *contentView() const = 0;
-    /// Who gets the keys. Null: the window itself. Kept while the window is not active.
+    /// The view that gets the keys; null: the window itself does. Kept while the window is not
+    /// active.
     [[nodiscard]] virtual View *firstResponder() const = 0;
-    /// Makes `view` (null: the window itself) the first responder after the present one resigned.
-    /// Answers whether it is the first responder now.
+    /// Makes `view` (null: the window itself) the first responder, after the present one has
+    /// resigned. Returns whether it is the first responder now.
     virtual bool makeFirstResponder(View *view) = 0;
     /// Whether this is the window that gets the keys.
     [[nodiscard]] virtual bool isKeyWindow() const = 0;

@@ -19,16 +19,16 @@
 
 namespace penwick::platform {
 
-/// `Base` as a view. What a class does not override does what `Base` does; a plain widget then
-/// hands the event on to the view around it.
+/// `Base` as a view. An operation that a class does not override does what `Base` does; a plain
+/// widget hands the event on to the view around it.
 ///
-/// Only the left button is the pointer here. The others are taken and ignored, so that a press of
-/// the wheel in the middle of a stroke neither draws nor reaches what lies below.
+/// Only the left button counts as the pointer. Presses of the others are taken and ignored, so that
+/// a press of the wheel in the middle of a stroke neither draws nor reaches what lies below.
 template <class Base>
 class ViewOf : public Base, public View
 {
 public:
-    // Where both have the word, the view's meaning is meant.
+    // The widget has functions of these names too; here they are the view's.
     using View::isHidden;
     using View::setHidden;
     using View::window;
@@ -37,7 +37,7 @@ public:
         : Base(parent)
         , View(static_cast<QWidget &>(*this))
     {
-        this->setFocusPolicy(Qt::NoFocus); // only makeFirstResponder() moves the keys
+        this->setFocusPolicy(Qt::NoFocus); // only makeFirstResponder() moves the focus
         surface().setMouseTracking(true);
     }
 
@@ -82,14 +82,14 @@ protected:
 
     bool event(QEvent *event) override
     {
-        // What surrounds the content of a scrolling widget is the style's to paint: its frame.
+        // Outside of its viewport a scrolling widget would paint nothing but a style's frame.
         if (scrolls && event->type() == QEvent::Paint)
             return true;
         if (event->type() == QEvent::KeyPress)
             keyIsComing();
         const bool changesLook = isAboutLook(*event);
         const bool isHandled = Base::event(event);
-        if (!changesLook) // other events may have been the view's last
+        if (!changesLook) // any other event may have destroyed the view
             return isHandled;
         if (keepOwnLook(this->View::widget()))
             place();
@@ -129,7 +129,8 @@ protected:
 
     void mousePressEvent(QMouseEvent *event) override
     {
-        // A class without a meaning for double clicks makes another press of one.
+        // A `Base` that does not handle double clicks calls this function for one, from
+        // mouseDown().
         if (event == m_mouseEvent)
             Base::mousePressEvent(event);
         else
@@ -201,7 +202,8 @@ protected:
     {
         if (event->isAutoRepeat()) // the key is still down
             return;
-        // The modifiers of a chord may be let go first.
+        // When keys held together are let go, the modifiers may be let go first. So the press
+        // decides whether the key was alone.
         const bool isErasing = (event->key() == Qt::Key_Backspace || event->key() == Qt::Key_Delete)
             && !isOfChord(*event) && event->key() != m_keyOfChord;
         m_keyEvent = event;
@@ -209,7 +211,7 @@ protected:
         m_keyEvent = nullptr;
     }
 
-    // A plain widget would paint itself again whenever the keys come or go.
+    // A plain widget would paint itself again whenever it gets or loses the focus.
     void focusInEvent(QFocusEvent *event) override
     {
         if constexpr (!std::is_same_v<Base, QWidget>)
@@ -237,8 +239,8 @@ private:
 
     static constexpr bool scrolls = std::is_base_of_v<QAbstractScrollArea, Base>;
 
-    // The frame and the padding that a style wants around it are not ours: margins that take them
-    // back stand every layout that follows.
+    // A style may put a frame and padding around the viewport. Margins below zero take that room
+    // back, and stay when the widget is laid out again.
     void fillWithSurface()
     {
         const QRect whole = this->View::widget().rect();
@@ -262,7 +264,7 @@ private:
     bool pressPen(const QTabletEvent &event)
     {
         if (m_contact.excludes(event))
-            return true; // or it would come again
+            return true; // otherwise it would come again, as a mouse's press
         const bool isOnSubview = surface().childAt(event.position().toPoint());
         if (isOnSubview || !mayTakePress(event))
             return false;
@@ -326,7 +328,7 @@ private:
     QMouseEvent *m_mouseEvent = nullptr;
     QKeyEvent *m_keyEvent = nullptr;
     PointerContact m_contact;
-    int m_keyOfChord = 0; // the last one pressed, if it was together with others
+    int m_keyOfChord = 0; // the key that was pressed last, if a modifier was held with it
 };
 
 } // namespace penwick::platform
