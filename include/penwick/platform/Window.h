@@ -26,7 +26,7 @@ class PENWICK_EXPORT WindowDelegate
 {
 public:
     virtual ~WindowDelegate();
-    virtual void windowWillAppear() { } ///< asked to the screen, where it is not yet
+    virtual void windowWillAppear() { } ///< it is asked to come to the screen
     virtual void windowWillMove() { } ///< the user has begun to move it
     virtual void windowDidMove() { }
     virtual void windowDidResize() { } ///< before windowDidMove() where both changed
@@ -34,8 +34,8 @@ public:
     virtual void windowWillClose() { }
 };
 
-/// How the pixels of a window are kept, with the values that the word has elsewhere. The toolkit
-/// buffers every window, whatever is asked.
+/// How the pixels of a window are kept. The values are fixed, but have no effect: the toolkit
+/// buffers every window.
 enum class BackingStore
 {
     Retained = 0,
@@ -52,8 +52,8 @@ enum class Animate
 /// A window whose frame is its outer one, title bar included, in points, y up, from the primary
 /// screen's bottom left corner. Inside it, views have frames from the content's bottom left.
 ///
-/// It never ends the host by being the last one closed. GUI thread only: anywhere else, and where
-/// there is no QApplication, these operations stop the process.
+/// It never ends the host by being the last one closed. GUI thread only: on another thread, or
+/// without a QApplication, these operations stop the process.
 class PENWICK_EXPORT Window : public QWidget
 {
     Q_OBJECT
@@ -67,10 +67,11 @@ public:
 
     // Frame
 
-    /// Where the window is; what was asked last, until the desktop has granted something else.
+    /// Where the window is. After a request it is what was asked for, unless the desktop grants
+    /// something else.
     [[nodiscard]] Rect frame() const;
     /// Asks for `frame` and returns at once. With Animate::Yes a window on the screen glides
-    /// there; frame() answers the target meanwhile.
+    /// there; frame() returns the target meanwhile.
     void setFrame(const Rect &frame, Animate animate = Animate::No);
     void setFrameOrigin(Point origin);
 
@@ -80,8 +81,8 @@ public:
     void setAttributes(const WindowAttributes &attributes);
     /// Whether what lies below the window can be seen where the window is transparent. On a
     /// desktop that cannot, a transparent layer over the screen shows a picture of what was below
-    /// it when it was shown; told each time that it is shown, at the information level, to the
-    /// logging category "penwick.desktop".
+    /// it when it was shown. Each time, this is written to the logging category "penwick.desktop"
+    /// at the information level.
     [[nodiscard]] bool showsWhatIsBelow() const;
 
     // Captures of the screen
@@ -93,14 +94,15 @@ public:
     /// The native identifiers (QWidget::winId()) of the windows that are not to be seen by a
     /// capture, their sharing type being 0: this one, and those that stand above it or will when
     /// they are shown; of a drawing window the tool bar, its popover and the banner, however often
-    /// they come and go. On X11 a window manager puts a window into a frame of its own. Native
-    /// windows that were not there are made. Tool tips and menus are the toolkit's and not in it.
+    /// they come and go. On X11 a window manager puts a window into a frame of its own, which then
+    /// has to be left out. Native windows that do not exist yet are made. Tool tips and menus are
+    /// the toolkit's and not in the list.
     [[nodiscard]] std::vector<WId> windowsToLeaveOutOfCaptures() const;
 
     // Child windows
 
-    /// Tells that `child` will be added before it is shown. Until then it is no child, but has its
-    /// part in windowsToLeaveOutOfCaptures(). One that is a child already stays what it is.
+    /// Tells that `child` will be added before it is shown. Until then it is no child, but counts
+    /// in windowsToLeaveOutOfCaptures(). A window that is a child already stays one.
     void expectChildWindow(Window &child);
     /// Makes `child` stand above this window: it moves with it, stays where it is when this one is
     /// resized, and is on the screen only while this one is. Puts it on the screen if it can be
@@ -136,10 +138,11 @@ public:
 
     // Responders
 
-    /// Who gets the keys. Null: the window itself. Kept while the window is not active.
+    /// The view that gets the keys; null: the window itself does. Kept while the window is not
+    /// active.
     [[nodiscard]] View *firstResponder() const;
-    /// Makes `view` (null: the window itself) the first responder after the present one resigned.
-    /// Answers whether it is the first responder now.
+    /// Makes `view` (null: the window itself) the first responder, after the present one has
+    /// resigned. Returns whether it is the first responder now.
     bool makeFirstResponder(View *view);
     /// Whether this is the window that gets the keys.
     [[nodiscard]] bool isKeyWindow() const;
@@ -156,18 +159,18 @@ public:
     /// Takes the window and its children off the screen without closing it.
     void orderOut();
     /// Tells the delegate that the window closes and takes it off the screen. The window stays
-    /// what it is, its native identifier included, and may be shown again. Answers whether it has
-    /// closed, as it always has.
+    /// what it is, its native identifier included, and may be shown again. Returns true.
     bool close();
 
     void setVisible(bool visible) override;
 
 Q_SIGNALS:
-    /// windowsToLeaveOutOfCaptures() is another list than when it was last asked for, or told of.
-    /// The list may be asked for from the slot. Not sent for windows that go with their session.
+    /// windowsToLeaveOutOfCaptures() has changed since it was last asked for, or since this was
+    /// last sent. The slot may ask for the list. Not sent when windows go because their session
+    /// ends.
     void windowsToLeaveOutOfCapturesChanged();
-    /// The desktop has answered, and nothing glides: frame() and the size of the content are what
-    /// is on the screen. Sent after the delegate was told, also where nothing has changed.
+    /// The desktop has answered, and the window does not glide: frame() and the size of the content
+    /// are what is on the screen. Sent after the delegate was told, also if nothing has changed.
     void frameSettled();
 
 protected:

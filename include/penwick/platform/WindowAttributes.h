@@ -20,8 +20,8 @@ constexpr unsigned unifiedTitleAndToolbar = 4096;
 constexpr unsigned fullSizeContentView = 32768;
 } // namespace StyleMask
 
-/// What a window is like. Each value is kept as it is set; what the desktop has no notion of has
-/// no effect there.
+/// What a window is like. Each value is kept as it is set; a value that the desktop does not know
+/// has no effect there.
 struct WindowAttributes
 {
     unsigned styleMask = StyleMask::titled | StyleMask::closable | StyleMask::miniaturizable;

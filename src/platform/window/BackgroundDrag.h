@@ -10,7 +10,7 @@ namespace penwick::platform {
 
 class Window;
 
-/// One drag of a window by its background. Places are of Qt's desktop.
+/// One drag of a window by its background. Places are in Qt's desktop coordinates, y down.
 class BackgroundDrag
 {
 public:

@@ -91,7 +91,7 @@ std::vector<WId> CaptureExclusion::identifiers()
     return identifiers;
 }
 
-// An identifier that nobody has asked for yet is no news.
+// A window whose identifier nobody has asked for yet may get one without news.
 bool CaptureExclusion::isAsKnown(const std::vector<Known> &present) const
 {
     return std::equal(present.begin(), present.end(), m_known.begin(), m_known.end(),
@@ -118,7 +118,8 @@ void CaptureExclusion::check()
 bool CaptureExclusion::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::WinIdChange) {
-        // A native window that has just gone is not to be made anew before its end is over.
+        // The native window is being destroyed. Who is told now might ask for its identifier, which
+        // would make it anew in the middle of that.
         if (m_window.internalWinId() == 0)
             QMetaObject::invokeMethod(this, &CaptureExclusion::check, Qt::QueuedConnection);
         else

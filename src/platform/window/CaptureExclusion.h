@@ -12,8 +12,8 @@ namespace penwick::platform {
 
 class Window;
 
-/// One window's part in that: itself, if it is not to be seen by a capture, and what stands above
-/// it or will. Held by the window.
+/// Knows, for one window, which windows these are: the window itself, if it is not to be seen, and
+/// of the windows above it, or expected above it, those that are not. Held by the window.
 class CaptureExclusion final : public QObject
 {
 public:
@@ -24,7 +24,8 @@ public:
     /// The native identifiers of those that are not to be seen, the window itself first; makes the
     /// native windows that are not there yet.
     [[nodiscard]] std::vector<WId> identifiers();
-    /// Something may have changed: tells so, here and in the windows below, if it has.
+    /// To be called when something may have changed. If it has, the window's signal tells so, and
+    /// the windows below check too.
     void check();
 
     bool eventFilter(QObject *watched, QEvent *event) override;
@@ -43,7 +44,7 @@ private:
     Window &m_window;
     QPointer<CaptureExclusion> m_parent;
     std::vector<QPointer<CaptureExclusion>> m_children; // in the order of adding
-    std::vector<Known> m_known; // what the window's own news is held against
+    std::vector<Known> m_known; // as it was last asked for or told of
 };
 
 } // namespace penwick::platform

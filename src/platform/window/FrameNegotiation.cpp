@@ -13,16 +13,17 @@ namespace {
 using Kind = FrameNews::Kind;
 using Time = FrameNegotiation::Time;
 
-// How often, and after what time each, a request that was not granted is looked at again before
-// what stands there is taken for the answer. The desktop does not announce every step of its own.
+// How many looks there are, and how far apart, before what is seen counts as the desktop's answer
+// to a request that it did not grant. They are needed because a desktop does not announce each
+// step.
 constexpr int looks = 6;
 constexpr Time lookInterval { 50 };
-constexpr int looksBeforeAskingAgain = 3; // of those that are left
+constexpr int looksBeforeAskingAgain = 3; // how many are left when the desktop is asked again
 
 // Steps of one move by the user follow each other faster than this.
 constexpr Time longestRest { 500 };
 
-// How long after it was shown, or framed anew, a window is still being put in its place.
+// For how long after a window was shown or framed anew a window manager may still be placing it.
 constexpr Time newness { 2000 };
 
 } // namespace
@@ -53,8 +54,8 @@ FrameEffects FrameNegotiation::ask(const QRectF &frame, Time now)
     return { placing() };
 }
 
-// Told before anybody asks where the window is: who stands beside it and follows it would otherwise
-// be put where it will be, and then be taken along the way as well.
+// The whole move is told at once, and its steps are not. Meanwhile other windows are placed beside
+// the target; if they followed the steps as well, they would be moved twice.
 FrameEffects FrameNegotiation::setOff(const QRectF &target, Time now)
 {
     askUnseen(target);
@@ -82,17 +83,16 @@ FrameEffects FrameNegotiation::appear(const QMargins &margins, double scale, Tim
     return { placing() };
 }
 
-// The window manager that ends takes its frames along, and the one that comes back builds them
-// elsewhere before it puts them in their place. Neither is a move by the user, unless the window
-// comes to rest elsewhere.
+// When a window manager ends, its frames go; the next one makes new frames elsewhere before it puts
+// them in their places. Neither is a move by the user, unless the window comes to rest elsewhere.
 void FrameNegotiation::hearCorner(std::optional<QPoint> corner, Time now)
 {
     const bool hadFrame = std::exchange(m_corner, corner).has_value();
     if (hadFrame == corner.has_value())
         return;
     m_framing = corner ? Framing::There : Framing::Lost;
-    // The window manager was slow, and the toolkit believes in a place inside a frame in the
-    // making.
+    // The window manager was slow: the looks were over before it had framed the window, and the
+    // place that was then seen was inside an unfinished frame. So the request holds again.
     if (corner && m_askedBeforeFrame)
         m_frame = *m_askedBeforeFrame;
     m_askedBeforeFrame.reset();
@@ -106,7 +106,7 @@ FrameEffects FrameNegotiation::look(const FrameObservation &seen, Time now)
         m_userRestsAt.reset();
     if (m_phase == Phase::Gliding)
         return lookOnTheWay(seen);
-    if (seen.isMinimised) { // nobody answers meanwhile
+    if (seen.isMinimised) { // no desktop answers for a minimised window
         if (m_phase != Phase::Settled)
             m_phase = m_phase == Phase::Granted ? Phase::Settled : Phase::Suspended;
         return {};
@@ -130,16 +130,16 @@ FrameEffects FrameNegotiation::look(const FrameObservation &seen, Time now)
         believe(outer, seen, wasAsked ? Cause::Desktop : Cause::User, now, effects);
     else if (isTimeToAskAgain && m_framing != Framing::Lost && !seen.isArranged)
         effects.emplace_back(placing());
-    // Elsewhere it is not believed until the looks are over; after an answer either, because where
-    // requests go back and forth it may be the answer to an older one, and those in between come
-    // later.
+    // A window seen elsewhere is not believed until the looks are over, not even after it was seen
+    // as asked: when several requests were made in a row, that may have been the answer to an older
+    // one, and other answers are still to come.
     return effects;
 }
 
 void FrameNegotiation::grant(
     const FrameObservation &seen, bool wasAsked, Time now, FrameEffects &effects)
 {
-    const bool isGranted = wasAsked || m_phase == Phase::Asked; // by another scale meanwhile
+    const bool isGranted = wasAsked || m_phase == Phase::Asked; // adoptScale() may ask anew
     if (m_phase == Phase::Asked)
         m_phase = Phase::Granted;
     remindToolkit(seen, now, effects);
@@ -161,7 +161,8 @@ void FrameNegotiation::believe(
     effects.emplace_back(FrameNews { Kind::Settled });
 }
 
-// What it is to be on another screen, or inside other borders, is for the next step to mind.
+// While the window glides, another scale and other borders are only taken over; the next step
+// places the window by them.
 FrameEffects FrameNegotiation::lookOnTheWay(const FrameObservation &seen)
 {
     FrameEffects effects;
@@ -180,10 +181,10 @@ void FrameNegotiation::await(Time now)
     m_lookAt = now + lookInterval;
 }
 
-// Only looks that were due count: many may be taken at once because something happened. Says
-// whether this is the one at which to ask again. A window manager that is busy with a new window
-// may answer an older request, or hold this one against the limits of an older one; one that
-// refuses does so twice.
+// Counts a look that was due; early looks, which are taken because something happened, do not
+// count. Returns whether the desktop is to be asked again at this look. A window manager that is
+// busy with a new window may still answer an older request, or measure this one by older size
+// limits; one that refuses will refuse again.
 bool FrameNegotiation::countLook(Time now)
 {
     if ((m_phase != Phase::Asked && m_phase != Phase::Granted) || now < m_lookAt)
@@ -194,8 +195,8 @@ bool FrameNegotiation::countLook(Time now)
     return m_phase == Phase::Asked && m_looksLeft == looksBeforeAskingAgain;
 }
 
-// On a screen of another scale the same window and the same title bar measure other points. What
-// the program has asked for in points still holds.
+// On a screen of another scale the same window and the same title bar have other sizes in points.
+// What the program has asked for in points still holds.
 void FrameNegotiation::adoptScale(const FrameObservation &seen, FrameEffects &effects)
 {
     const double before = std::exchange(m_scale, seen.scale);
@@ -205,8 +206,9 @@ void FrameNegotiation::adoptScale(const FrameObservation &seen, FrameEffects &ef
         m_margins = m_margins * (before / seen.scale);
     else if (!seen.isBorderless)
         m_margins = seen.margins;
-    // A toolkit that answers before the desktop has done so may grant what is not there yet.
-    // Without more looks: what is asked for may itself bring the window to the screen and back.
+    // The toolkit may have reported as granted what the desktop had not done yet, so a granted
+    // request is open again. It gets no new looks, because the request itself may be what moves the
+    // window to and fro between two screens.
     if (m_phase == Phase::Granted)
         m_phase = Phase::Asked;
     if (m_phase == Phase::Asked)
@@ -221,7 +223,7 @@ void FrameNegotiation::adoptScale(const FrameObservation &seen, FrameEffects &ef
 bool FrameNegotiation::isDecoratedAnew(const FrameObservation &seen) const
 {
     if (seen.isBorderless || m_framing == Framing::Lost || seen.isArranged)
-        return false; // whatever the toolkit makes of a frame that is still being built
+        return false; // the toolkit's margins mean nothing then
     return seen.margins != m_margins && !(m_phase == Phase::Asked && seen.margins.isNull());
 }
 
@@ -230,7 +232,7 @@ QRect FrameNegotiation::outerFrame(const FrameObservation &seen) const
     QRect outer = seen.frame;
     if (seen.isBorderless)
         outer = seen.content;
-    else if (m_framing == Framing::Lost) // the next window manager puts it around what is there
+    else if (m_framing == Framing::Lost) // the next window manager frames the content where it is
         outer = seen.content.marginsAdded(m_margins);
     if (m_corner) {
         // The toolkit keeps a screen's corner in device pixels and scales what lies inside it.
@@ -239,7 +241,8 @@ QRect FrameNegotiation::outerFrame(const FrameObservation &seen) const
     return outer;
 }
 
-// Borders of a pixel cannot be told in points where a point is more than that.
+// Where a point has more than one pixel, a border of a single pixel is no whole number of points,
+// so a difference of one point is allowed.
 bool FrameNegotiation::isWhereItBelongs(const QRect &outer) const
 {
     const QRect frame = rounded(m_frame);
@@ -259,10 +262,11 @@ bool FrameNegotiation::isUserMoving(Time now) const
     return m_userRestsAt && now < *m_userRestsAt;
 }
 
-// A window manager may move a frame without a word to its window right after it has decorated it;
-// the toolkit then holds a place that was true for a moment. It is told the true one as soon as the
-// window moves again; asking for where it stands anyway would move nothing. Later on, and while the
-// user drags the window, the toolkit may well lag behind.
+// Right after a window manager has framed a window, it may move the frame without telling the
+// window. The toolkit then keeps a place that was true only for a moment. It learns the true place
+// when the window moves, so the window is moved by a point and back; a request for the place where
+// it is would move nothing. At other times, and while the user drags the window, the toolkit is
+// only a little late.
 void FrameNegotiation::remindToolkit(const FrameObservation &seen, Time now, FrameEffects &effects)
 {
     QRect believed = rounded(m_frame);
@@ -288,8 +292,9 @@ void FrameNegotiation::tellUserMove(Time now, FrameEffects &effects)
         effects.emplace_back(FrameNews { Kind::MoveBegan });
 }
 
-// The window keeps its pixels, so its size in points is another one. The move comes before the
-// size here, so that whatever keeps its distance from the window's corner does so in points.
+// On a screen of another scale the window keeps its size in pixels, so its size in points changes.
+// Here the move is told before the size, so that whoever keeps a distance from the window's corner
+// keeps it in points.
 void FrameNegotiation::tellRescaled(QPoint delta, bool hasResized, Time now, FrameEffects &effects)
 {
     if (!delta.isNull()) {

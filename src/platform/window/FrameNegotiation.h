@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What is asked of a desktop for one window's frame, what the desktop makes of it, and what follows
-// from that: the whole of it as a value, with no window, no timer and no desktop inside.
+// The negotiation with the desktop over one window's frame: what was asked for, what is seen, and
+// what follows from both. It is a value, with no window, no timer and no desktop inside.
 #pragma once
 
 #include <QMargins>
@@ -23,7 +23,7 @@ struct FrameObservation
     QRect content;
     QMargins margins; ///< of title bar and borders, as the toolkit believes them
     QPoint screen; ///< the top left corner of the window's screen
-    QPoint origin; ///< the primary screen's bottom left corner, from which frames are told
+    QPoint origin; ///< the primary screen's bottom left corner, where frames are counted from
     double scale = 1.0; ///< device pixels a point
     bool isBorderless = false; ///< and never has a frame
     bool isMinimised = false;
@@ -41,11 +41,11 @@ struct FrameNews
         Confirmed, ///< the desktop has granted what was asked for
         Resized,
         ResizedByUser,
-        ResizedByDesktop, ///< which has made another size of `asked`
+        ResizedByDesktop, ///< which gave another size than `asked`
         MoveBegan, ///< by the user, once for each move however many steps it has
         Shifted, ///< moved as a whole, by `delta`
-        Moved, ///< its top left corner is elsewhere, or is counted from elsewhere
-        Settled ///< nothing is open: the frame is what stands on the screen
+        Moved, ///< its top left corner has moved, or the origin that it is counted from
+        Settled ///< nothing is awaited: the frame is what is on the screen
     };
 
     Kind kind;
@@ -68,22 +68,22 @@ using FrameEffects = std::vector<std::variant<FramePlacing, FrameNews>>;
 
 /// The negotiation over one window's outer frame.
 ///
-/// | phase     | means                                  | is left                               |
+/// | phase     | means                                  | ends                                  |
 /// |-----------|----------------------------------------|---------------------------------------|
-/// | Settled   | the frame is what was seen last        | by asking: to Asked                   |
-/// | Asked     | the frame is what was asked; what is   | seen there: to Granted; after the     |
-/// |           | seen elsewhere is not believed         | last look: to Settled; minimised: to  |
-/// |           |                                        | Suspended                             |
-/// | Granted   | the frame was seen where it was asked; | after the last look, or minimised: to |
-/// |           | elsewhere it may be seen on behalf of  | Settled; by asking: to Asked          |
-/// |           | an older request                       |                                       |
-/// | Suspended | asked of a window that is minimised,   | restored: to Asked                    |
-/// |           | for which nobody answers               |                                       |
-/// | Gliding   | the frame is where the window will be; | by asking, at the end or before: to   |
-/// |           | what is seen on the way is not told    | Asked                                 |
+/// | Settled   | the frame is what was seen last        | by a request: in Asked                |
+/// | Asked     | the frame is what was asked for; the   | when seen as asked: in Granted; after |
+/// |           | window seen elsewhere is not believed  | the last look: in Settled; when       |
+/// |           |                                        | minimised: in Suspended               |
+/// | Granted   | the window was seen as asked; seen     | after the last look, or when          |
+/// |           | elsewhere, it may be by an answer to   | minimised: in Settled; by a request:  |
+/// |           | an older request                       | in Asked                              |
+/// | Suspended | asked for a window that is minimised,  | when restored: in Asked               |
+/// |           | for which no desktop answers           |                                       |
+/// | Gliding   | the frame is where the window will be; | by a request, at the end of the way   |
+/// |           | what is seen on the way is not told    | or before: in Asked                   |
 ///
-/// Each asking gives the desktop six looks' time to answer, half of them to the first time of
-/// asking and half to a second; then what stands there is the answer.
+/// After a request the desktop has the time of six looks to grant it. After three of them it is
+/// asked once more; after the sixth, what is seen counts as its answer.
 class FrameNegotiation
 {
 public:
@@ -119,18 +119,18 @@ public:
     [[nodiscard]] FrameEffects ask(const QRectF &frame, Time now);
     /// The window on the screen sets off to `target`, and counts as being there.
     [[nodiscard]] FrameEffects setOff(const QRectF &target, Time now);
-    /// The next place on the way.
+    /// The placing for the next step of a glide, at `frame`.
     [[nodiscard]] FramePlacing step(const QRectF &frame) const;
     /// The window is about to be shown, with borders that are `margins` as far as can be known.
     [[nodiscard]] FrameEffects appear(const QMargins &margins, double scale, Time now);
     /// The desktop says that the frame around the window on the screen has its top left corner at
     /// `corner`, in device pixels; nothing: it has no frame.
     void hearCorner(std::optional<QPoint> corner, Time now);
-    /// Draws the conclusions from what is seen of the window on the screen.
+    /// Says what follows from what is seen of the window on the screen.
     [[nodiscard]] FrameEffects look(const FrameObservation &seen, Time now);
 
 private:
-    // Who has put a frame around the window, as far as the desktop says so.
+    // Whether a window manager has put a frame around the window, as far as the desktop says so.
     enum class Framing : std::uint8_t
     {
         Unknown, // nobody yet, or nobody tells
@@ -138,7 +138,7 @@ private:
         Lost // the window manager has ended; m_margins are its frame's
     };
 
-    // Whether the toolkit was told a place that it had not noticed.
+    // Whether the toolkit was told where the frame is, because it believed in another place.
     enum class Reminder : std::uint8_t
     {
         NotNeeded,
@@ -150,7 +150,7 @@ private:
     {
         Program,
         User,
-        Desktop // it has made something else of what was asked for
+        Desktop // it gave another frame than was asked for
     };
 
     struct Told
@@ -186,11 +186,11 @@ private:
     bool m_isScaleUntold = false;
     Framing m_framing = Framing::Unknown;
     std::optional<QPoint> m_corner;
-    std::optional<Time> m_framedAt; // or shown
-    std::optional<QRectF> m_askedBeforeFrame; // given up before the window manager had framed it
+    std::optional<Time> m_framedAt; // when the window was last shown or framed
+    std::optional<QRectF> m_askedBeforeFrame; // a request given up before the window was framed
     std::optional<Time> m_userRestsAt; // when a move by the user is over, if it does not go on
     Reminder m_reminder = Reminder::NotNeeded;
-    Told m_told; // by the last news
+    Told m_told; // what the listeners know
 };
 
 } // namespace penwick::platform

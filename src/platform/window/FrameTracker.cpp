@@ -43,7 +43,7 @@ void FrameTracker::request(const Rect &frame)
     const QRectF wanted = toDesktopExactly(frame);
     if (!m_window.isVisible()) {
         m_negotiation.askUnseen(wanted);
-        // Nobody has decorated it yet, so its content may be laid out as if nobody will.
+        // The window has no borders yet, so its content is laid out as if it will have none.
         m_window.resize(rounded(wanted).size());
         return;
     }
@@ -63,7 +63,7 @@ void FrameTracker::step(const Rect &frame)
 
 void FrameTracker::prepareToShow()
 {
-    // Or it would measure in another screen's points until it is there.
+    // Otherwise the window would have another screen's scale until it is shown.
     if (QScreen *const screen = QGuiApplication::screenAt(rounded(m_negotiation.frame()).center()))
         m_window.setScreen(screen);
     m_window.winId(); // the desktop can only be asked about a window that exists
@@ -80,7 +80,8 @@ void FrameTracker::prepareToShow()
     awaitNextLook();
 }
 
-// What a frame is measured from moves with it.
+// Frames are counted from the primary screen's corner, so another primary screen, or another size
+// of it, changes them.
 void FrameTracker::followPrimaryScreen()
 {
     if (const QScreen *const primary = QGuiApplication::primaryScreen()) {
@@ -136,7 +137,7 @@ FrameObservation FrameTracker::observation() const
     return seen;
 }
 
-// Events come one by one, and the frame is whole only after the last of them.
+// The toolkit tells of one change in several events; only after the last do all values agree.
 void FrameTracker::lookSoon()
 {
     if (m_window.isVisible())
@@ -199,7 +200,7 @@ void FrameTracker::tell(const FrameNews &news)
     case FrameNews::Kind::Moved:
         return Q_EMIT moved();
     case FrameNews::Kind::Settled:
-        if (m_negotiation.isAtRest()) // nobody who was told before has asked for something else
+        if (m_negotiation.isAtRest()) // a listener may have asked for another frame meanwhile
             Q_EMIT settled();
         return;
     }

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Follows a window's outer frame on the real desktop: the toolkit's events and the desktop's words
-// into the negotiation, and what comes out of it to the toolkit and to whoever listens.
+// Follows a window's outer frame on the real desktop. It hands the toolkit's events and what the
+// desktop says to the FrameNegotiation, and carries out and reports what comes of it.
 #pragma once
 
 #include <penwick/platform/Geometry.h>
@@ -19,8 +19,9 @@ namespace penwick::platform {
 ///
 /// Frames are in points, y up, from the primary screen's bottom left corner. A decorated window
 /// has no true frame until the desktop has answered, which may be after the first paint; until
-/// then frame() is what was asked. While the window manager that has framed a window is gone, the
-/// frame counts as if it were still there, since the next one puts one there. GUI thread only.
+/// then frame() is what was asked. While there is no window manager, the frame that the last one
+/// put around the window counts as if it were still there, because the next one will put one there.
+/// GUI thread only.
 class FrameTracker final : public QObject
 {
     Q_OBJECT
@@ -36,10 +37,10 @@ public:
     [[nodiscard]] QMargins margins() const { return m_negotiation.margins(); }
     /// Asks for `frame` and returns at once. The desktop may grant something else.
     void request(const Rect &frame);
-    /// The window on the screen sets off to `target`. Whoever follows it is told here that it is
-    /// there, and of the steps nothing; a request ends the way.
+    /// The window on the screen begins to glide to `target`. Listeners are told at once that it is
+    /// there, and nothing of its steps. request() ends the glide.
     void setOff(const Rect &target);
-    /// The next place on the way.
+    /// Moves the gliding window on to `frame`.
     void step(const Rect &frame);
     /// Places the window, which is about to be shown, so that its outer frame is right at once.
     void prepareToShow();
@@ -58,19 +59,20 @@ Q_SIGNALS:
     /// The window was moved by `delta` of Qt's desktop and kept its size, or has come to a screen
     /// of another scale. Sent before moved().
     void shifted(QPoint delta);
-    /// The same, because the user pulled at its edges. Sent after resized().
+    /// The window was resized because the user pulled at its edges. Sent after resized().
     void resizedByUser();
-    /// The same, because the desktop has made another size of `asked`.
+    /// The window was resized because the desktop gave it another size than `asked`. Sent after
+    /// resized().
     void resizedByDesktop(const penwick::platform::Rect &asked);
     /// The desktop has granted the frame that was asked for, or put a frame of its own around the
     /// window in the same place.
     void confirmed();
-    /// The window's top left corner is somewhere else, on the desktop or from the primary screen.
+    /// The window's top left corner has moved, or the primary screen that it is counted from.
     void moved();
-    /// Nothing is open: the frame is what stands on the screen. Sent after all others.
+    /// Nothing is awaited: the frame is what is on the screen. Sent after all others.
     void settled();
     /// The window has come to a screen with another number of device pixels a point. Sent before
-    /// all others, of which shifted() and moved() come before resized() then.
+    /// all others; shifted() and moved() are then sent before resized().
     void rescaled();
 
 private:

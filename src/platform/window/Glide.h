@@ -27,9 +27,10 @@ public:
     [[nodiscard]] bool isUnderWay() const { return m_at.has_value(); }
     /// Sets off from where the window is seen now, in place of a movement under way.
     void start(const Rect &target);
-    /// Leaves the window where it is seen now, which is its frame then. For who takes hold of it.
+    /// Ends the movement where the window is seen now, and asks for that place as its frame; for a
+    /// user who takes hold of the window.
     void halt();
-    /// Forgets the way, for who asks for another frame.
+    /// Ends the movement and asks for nothing; for a caller who then asks for another frame.
     void stop();
 
 private:

@@ -8,18 +8,17 @@
 
 namespace penwick::platform {
 
-/// The primary screen's bottom left corner in Qt's desktop. Another one when screens
-/// come and go.
+/// The primary screen's bottom left corner in Qt's desktop. It changes when screens come and go.
 [[nodiscard]] QPoint originInDesktop();
 
 /// `rect` of Qt's desktop as a rectangle with y up.
 [[nodiscard]] Rect fromDesktop(const QRectF &rect);
-/// The other way.
+/// `rect` with y up as a rectangle of Qt's desktop.
 [[nodiscard]] QRectF toDesktopExactly(const Rect &rect);
 /// The whole pixels nearest to `rect` of Qt's desktop. Place and size are rounded apart, so that a
 /// window that only moves keeps its size.
 [[nodiscard]] QRect rounded(const QRectF &rect);
-/// Both at once.
+/// rounded() of toDesktopExactly().
 [[nodiscard]] QRect toDesktop(const Rect &rect);
 
 } // namespace penwick::platform

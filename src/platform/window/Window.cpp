@@ -15,7 +15,8 @@ namespace penwick::platform {
 
 namespace {
 
-// Asked before the toolkit would end the process in words of its own.
+// Checks before QWidget's constructor does, which would end the process with a line of the
+// toolkit's.
 QWidget *checked(QWidget *parent)
 {
     requireApplication();
@@ -57,7 +58,7 @@ Window::Window(const Rect &contentRect, unsigned styleMask, BackingStore, bool)
 Window::~Window()
 {
     requireGuiThreadAtEnd();
-    // A view that goes down with the window has nobody left to resign to.
+    // A view that is destroyed together with its window does not resign.
     m_firstResponder = nullptr;
     for (Window *const child : childWindows())
         child->hide();
@@ -167,7 +168,7 @@ void Window::setContentViewController(std::unique_ptr<ViewController> controller
     requireGuiThread();
     d->contentViewController = std::move(controller);
     if (d->contentViewController) {
-        d->contentViewController->setParent(this); // found by introspection
+        d->contentViewController->setParent(this); // so that findChild() finds it
         setContentView(d->contentViewController->view());
     }
 }
@@ -242,13 +243,15 @@ bool Window::makeFirstResponder(View *view)
     requireGuiThread();
     if (view != m_firstResponder) {
         View *const previous = m_firstResponder;
-        // Nobody is, while it resigns: it may take itself out of the window as it does.
+        // There is no first responder while the previous one resigns, because it may remove itself
+        // from the window.
         m_firstResponder = nullptr;
         if (previous && !previous->resignFirstResponder()) {
             m_firstResponder = previous;
             return false;
         }
-        // Whom it chose instead of itself, as it did, comes before nobody.
+        // The previous one may have made another view first responder. That one stays, if no other
+        // is wanted.
         if (view || !m_firstResponder)
             m_firstResponder = view && view->window() == &d->content ? view : nullptr;
     }
@@ -307,7 +310,7 @@ void Window::showFamily()
     for (Window *const child : childWindows()) {
         if (!child->d->family.isOrderedIn() || child->isVisible())
             continue;
-        // Some desktops had minimised it together with this one before it was hidden.
+        // Some desktops have minimised the child together with this window before it was hidden.
         child->setWindowState(child->windowState() & ~Qt::WindowMinimized);
         child->show();
     }
@@ -359,7 +362,8 @@ void Window::setVisible(bool visible)
     if (visible && !isVisible()) {
         d->backdrop.prepare(*this);
         d->tracker->prepareToShow();
-        // Not a widget's child: a window outlives the one it stands above.
+        // Only the native windows are joined. A widget's child would be destroyed with its parent,
+        // but a window may outlive the one that it stands above.
         windowHandle()->setTransientParent(
             parentWindow() ? parentWindow()->windowHandle() : nullptr);
     }

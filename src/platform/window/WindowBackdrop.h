@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What stands for what is below a transparent window on a desktop that cannot show it.
+// Stands in for what should be seen through a transparent window, on a desktop that cannot show it.
 #pragma once
 
 #include <QPixmap>
@@ -15,8 +15,8 @@ class Window;
 class WindowBackdrop
 {
 public:
-    /// Makes ready for `window`, which has its frame and is about to be shown. Says each time that
-    /// it takes a picture that the desktop is one that cannot.
+    /// Prepares the showing of `window`, which has its frame. Each time that it takes a picture, it
+    /// tells the log why.
     void prepare(Window &window);
     /// Cuts off the corners of `window` again, which has come to a screen of another scale.
     static void rescale(Window &window);

@@ -8,7 +8,7 @@ namespace penwick::platform {
 
 class Window;
 
-/// Hands on to a window what its views ask. Held by the window.
+/// Passes on to a window what its views ask of it. Held by the window.
 class WindowContent final : public ViewHost
 {
 public:

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a window makes of the toolkit's events, and of those that no view has taken.
+// How a window handles the toolkit's events, those that no view has taken among them.
 #include <penwick/platform/Window.h>
 
 #include "platform/foundation/GuiThread.h"
@@ -19,7 +19,7 @@ bool Window::event(QEvent *event)
 {
     const bool changesLook = isAboutLook(*event);
     const bool isHandled = QWidget::event(event);
-    if (changesLook && keepOwnLook(*this)) // other events may have been the window's last
+    if (changesLook && keepOwnLook(*this)) // any other event may have destroyed the window
         setFrame(frame());
     return isHandled;
 }
@@ -30,17 +30,17 @@ void Window::changeEvent(QEvent *event)
     if (event->type() == QEvent::ActivationChange && std::exchange(d->isMain, isActiveWindow())
         && !isActiveWindow())
         tellDelegate(&WindowDelegate::windowDidResignMain);
-    // Not every desktop takes along what is on all its virtual desktops.
+    // Not every desktop minimises, with this window, a child that is on all virtual desktops.
     if (std::exchange(d->isMinimised, isMinimized()) != isMinimized() && isVisible())
         isMinimized() ? hideFamily() : showFamily();
 }
 
-// Not the toolkit's: that lets go of the native window, and whoever captures the screen would leave
-// out one that is gone when the window is shown again.
+// QWidget::close() would destroy the native window. When the window is shown again, a host that
+// captures the screen would still leave out the old one.
 bool Window::close()
 {
     requireGuiThread();
-    const QPointer<Window> closing = this; // whoever is told may end it
+    const QPointer<Window> closing = this; // a listener may destroy it
     QCloseEvent event;
     QCoreApplication::sendEvent(this, &event);
     if (closing)
@@ -71,7 +71,7 @@ void Window::mousePressEvent(QMouseEvent *event)
     event->accept();
     if (event->button() != Qt::LeftButton)
         return;
-    d->glide->halt(); // where the user sees it is where it is taken hold of
+    d->glide->halt(); // the window stops where the user takes hold of it
     d->drag.begin(*this, event->globalPosition().toPoint());
     if (d->windowController)
         d->windowController->mouseDown();

@@ -38,8 +38,8 @@ private:
     bool m_isOrderedIn = false;
 };
 
-/// Brings what stands above `window` to the front again, after `window` itself was brought there: a
-/// window manager keeps the order anyway, without one nobody else does.
+/// Brings the windows above `window` to the front again, after `window` itself was brought there. A
+/// window manager keeps this order by itself; where there is none, nobody else does.
 void raiseChildrenOf(const Window &window);
 
 } // namespace penwick::platform

@@ -52,7 +52,8 @@ bool WindowShape::isKept() const
     return attributes.aspectRatio && (attributes.styleMask & StyleMask::resizable);
 }
 
-// Some desktops hold what is asked for against a hint that is still that of another content.
+// The hint is written before the desktop is asked for a frame, because some desktops measure what
+// is asked for by a hint that is still that of another size.
 void WindowShape::update()
 {
     if (!m_window.windowHandle())
@@ -61,14 +62,14 @@ void WindowShape::update()
     const bool hasRatio = isKept()
         && std::abs(heightFor(frame.width, *m_window.attributes().aspectRatio) - frame.height)
             < 1.0;
-    // Of the content, because that is what a desktop constrains, and of this exact frame's, so
-    // that asking for the frame itself stays possible.
+    // The hint is about the content, because that is what a desktop constrains. It has the very
+    // size of this frame's content, so that the frame itself can still be asked for.
     const QSize content = toDesktop(frame).marginsRemoved(m_tracker.margins()).size();
     NativeDesktop::instance().keepContentRatio(
         *m_window.windowHandle(), hasRatio ? content : QSize());
 }
 
-// Where the desktop says what size the window has. What it had before comes back afterwards.
+// Whether the desktop decides the window's size. The size before comes back afterwards.
 bool WindowShape::isArranged() const
 {
     return m_window.isMaximized() || m_window.isFullScreen();
@@ -77,7 +78,7 @@ bool WindowShape::isArranged() const
 void WindowShape::rememberFrame()
 {
     if (std::exchange(m_isAnswering, false))
-        m_rest.cancel(); // what it granted instead is no pull by the user
+        m_rest.cancel(); // another size than the correction's is the desktop's, not a pull
     if (!m_rest.at() && !isArranged())
         m_before = m_tracker.frame();
 }
@@ -93,7 +94,8 @@ void WindowShape::awaitRest()
     m_rest.set(Clock::ofTheUser().now() + restTime);
 }
 
-// A window that changed under the hand would be pulled from another size than its user sees.
+// While the button is held nothing is corrected: the user would go on pulling from another size
+// than the one that is seen.
 void WindowShape::rest()
 {
     if (NativeDesktop::instance().isPointerHeld())

@@ -13,9 +13,9 @@ namespace penwick::platform {
 class FrameTracker;
 class Window;
 
-/// Has the desktop keep the aspect ratio of a window's attributes, where the window's frame has
-/// it, and brings a frame that the user gave another one to it, where the desktop did not.
-/// A window that the user cannot resize is left alone.
+/// Asks the desktop to keep the aspect ratio of a window's attributes, while the window's frame has
+/// it. Where the desktop does not, and the user has given the frame another shape, the frame is
+/// corrected. A window that the user cannot resize is left alone.
 class WindowShape final : public QObject
 {
     Q_OBJECT
@@ -38,7 +38,7 @@ private:
     FrameTracker &m_tracker;
     Rect m_before; // the frame that the user began to pull; empty before the first one
     bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
-    bool m_isAnswering = false; // the desktop, to the frame that a pull was corrected to
+    bool m_isAnswering = false; // the desktop has still to answer a correction
     Alarm m_rest { Clock::ofTheUser(), this }; // set while the user may still be pulling
 };
 
