@@ -7,7 +7,7 @@ namespace penwick::platform {
 class Bundle;
 class Button;
 
-/// Gives `button` its images from `bundle`, where a scene has named them.
+/// Gives `button` those of its two images from `bundle` that a scene has named.
 void loadImages(Button &button, const Bundle &bundle);
 
 } // namespace penwick::platform
