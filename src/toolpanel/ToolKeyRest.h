@@ -4,9 +4,9 @@
 
 namespace penwick {
 
-/// Plain letters and digits work the tool bar only if the pointer was used on board or bar after
-/// the last edit of a text. Somebody who goes on typing when an edit has ended means text, and must
-/// not choose tools by it: the keys rest. Keys with Ctrl, and Escape, never rest.
+/// Plain letters and digits work the tool bar, but rest after an edit of a text: somebody who goes
+/// on typing when the edit has ended means text, and must not choose tools by it. They work again
+/// once the pointer is used on board or bar. Keys with Ctrl, and Escape, never rest.
 class ToolKeyRest
 {
 public:
