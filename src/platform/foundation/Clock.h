@@ -21,7 +21,7 @@ public:
 
     /// The clock by which the desktop's answers are awaited.
     [[nodiscard]] static Clock &ofTheDesktop();
-    /// The clock by which is told whether the user goes on.
+    /// The clock by which a user's move or pull counts as over when it does not go on.
     [[nodiscard]] static Clock &ofTheUser();
 
     [[nodiscard]] Time now() const;

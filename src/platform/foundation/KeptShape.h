@@ -16,8 +16,9 @@ namespace penwick::platform {
 
 /// The frame in the shape of `ratio` for one that the user has pulled from `before` to `pulled`. If
 /// an edge was pulled outward, it is the smallest that holds `pulled`, so that no such pull makes a
-/// window smaller; otherwise the largest that fits into `pulled`. Edges that were not pulled stay;
-/// if that decides nothing, the top and the left edge do.
+/// window smaller; otherwise the largest that fits into `pulled`. Of the left and the right edge
+/// the one that was not pulled stays, and the left one if neither or both were; likewise of the top
+/// and the bottom edge, with the top one if neither or both were.
 [[nodiscard]] Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio);
 
 } // namespace penwick::platform

@@ -20,7 +20,7 @@ namespace penwick::platform {
 
 namespace {
 
-// Window managers usually answer within a millisecond. Nobody waits longer than this for one.
+// Window managers usually answer within a millisecond. One that does not is given up after this.
 constexpr int longestWait = 50; // ms
 
 constexpr std::uint32_t allDesktops = 0xFFFFFFFF;

@@ -51,8 +51,9 @@ QDBusConnection joinSessionBus()
     if (!address.isEmpty() && !address.contains("autolaunch:"))
         return QDBusConnection::sessionBus();
 
-    // Without an address the bus library would run dbus-launch, which starts a bus of its own: a
-    // guest in somebody's process starts none. So the one other place is named outright.
+    // Without an address the bus library would run dbus-launch, which starts a bus of its own. A
+    // guest in somebody's process must not start one, so the only other place where a bus may be is
+    // named here.
     const QString userBus = address.isEmpty() ? userBusAddress() : QString();
     if (userBus.isEmpty())
         return QDBusConnection(QString());
@@ -129,7 +130,7 @@ void Workspace::listenTo(const QDBusConnection &bus)
         return;
     *m_bus = bus;
 
-    // A portal that starts or restarts may have another opinion.
+    // A portal that starts or restarts may have another value.
     auto *watcher = new QDBusServiceWatcher(
         portalService, *m_bus, QDBusServiceWatcher::WatchForOwnerChange, this);
     connect(watcher, &QDBusServiceWatcher::serviceOwnerChanged, this,
@@ -151,7 +152,8 @@ void Workspace::listenTo(const QDBusConnection &bus)
 
 void Workspace::askWhoThePortalIs()
 {
-    // Asked outright: a reply tells its sender under Qt 6.4, and no longer under 6.8.
+    // The bus is asked who owns the name, because a reply of the portal's tells its sender under Qt
+    // 6.4, but no longer under 6.8.
     const auto bus = QStringLiteral("org.freedesktop.DBus");
     auto call = QDBusMessage::createMethodCall(
         bus, QStringLiteral("/org/freedesktop/DBus"), bus, QStringLiteral("GetNameOwner"));
@@ -183,7 +185,8 @@ void Workspace::onContrastRead(QDBusPendingCallWatcher *call)
 
 void Workspace::onSettingChanged(const QDBusMessage &message)
 {
-    // Changes sent before it is known who the portal is are in its answer, which comes later.
+    // A change that is sent before the portal is known is ignored here. The portal's answer to
+    // readContrast(), which comes later, has it.
     if (message.service() == m_portal)
         setContrastIncreased(asksForContrast(message.arguments().value(2)));
 }

@@ -56,7 +56,7 @@ private:
     void onContrastRead(QDBusPendingCallWatcher *call);
     void setContrastIncreased(bool isIncreased);
 
-    const std::unique_ptr<QDBusConnection> m_bus; // keeps the bus out of who includes this
+    const std::unique_ptr<QDBusConnection> m_bus; // so that this header needs no QtDBus
     QString m_portal; // unique bus name of the portal that runs; only its changes count
     bool m_isContrastIncreased = false;
     NotificationCenter m_notificationCenter;
