@@ -131,7 +131,7 @@ TEST_F(FastEraser, wayToTheReleaseCountsToo)
     EXPECT_TRUE(model().pathArray().isEmpty());
 }
 
-TEST_F(FastEraser, wayFromOnePressToTheNextDoesNot)
+TEST_F(FastEraser, wayFromOnePressToTheNextErasesNothing)
 {
     const std::int64_t kept = lineAcross(100);
     putDown({ 100, 30 });

@@ -252,7 +252,7 @@ TEST_P(PulledImage, inwardFitsIntoWhatWasPulled)
     expectOtherEdgesKept(before);
 }
 
-TEST_P(PulledImage, staysUnderTheHandThatRestsAndCountsFromWhereItTookHold)
+TEST_P(PulledImage, isNotCorrectedUnderARestingHandAndCountsFromTheFirstFrame)
 {
     constexpr std::chrono::milliseconds longerThanARest { 500 };
     startOn({ 560, 420 });

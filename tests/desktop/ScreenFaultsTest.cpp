@@ -68,7 +68,7 @@ TEST_P(ScreenLost, leavesAWindowThatIsDrawnOnAndEnds)
     expectEndByTool();
 }
 
-TEST_P(ScreenLost, thatIsAnotherThanTheWindowsMattersNothing)
+TEST_P(ScreenLost, withoutAWindowOnItChangesNothing)
 {
     startKind(kind());
     expectPlacesKnown();

@@ -55,7 +55,7 @@ class LostConnection : public FaultOfEachKind
 
 } // namespace
 
-TEST_F(Surroundings, withABusAddressOfNoSenseAreNothingToSpeakOf)
+TEST_F(Surroundings, busAddressOfNoSenseChangesNothing)
 {
     startKind("whiteboard", {}, { "DBUS_SESSION_BUS_ADDRESS=nonsense" });
 
@@ -65,7 +65,7 @@ TEST_F(Surroundings, withABusAddressOfNoSenseAreNothingToSpeakOf)
     expectEndByTool();
 }
 
-TEST_F(Surroundings, whoseBusGoesAwayMeanwhileAreNothingToSpeakOf)
+TEST_F(Surroundings, busThatGoesAwayChangesNothing)
 {
     startKind("whiteboard", {}, { "DBUS_SESSION_BUS_ADDRESS=" + desktop().sessionBus() });
     expectInk();
@@ -77,7 +77,7 @@ TEST_F(Surroundings, whoseBusGoesAwayMeanwhileAreNothingToSpeakOf)
     expectEndByTool();
 }
 
-TEST_F(Surroundings, withADecimalCommaTakeSevenAndAHalfAsThicknessWithOne)
+TEST_F(Surroundings, decimalCommaIsReadInAThickness)
 {
     startKind("whiteboard", { "--option", "brush#7,5" }, { "LC_NUMERIC=de_DE.UTF-8" });
 
@@ -92,7 +92,7 @@ TEST_F(Surroundings, withADecimalCommaTakeSevenAndAHalfAsThicknessWithOne)
     EXPECT_EQ(rows, 8);
 }
 
-TEST_F(Surroundings, withoutAHomeThatCanBeWrittenAreNothingToSpeakOf)
+TEST_F(Surroundings, homeThatCannotBeWrittenToChangesNothing)
 {
     startKind("whiteboard", {}, { "HOME=/dev/null/home" });
 
@@ -102,7 +102,7 @@ TEST_F(Surroundings, withoutAHomeThatCanBeWrittenAreNothingToSpeakOf)
     expectEndByTool();
 }
 
-TEST_F(Surroundings, withOneFontAloneAreWrittenInWithThat)
+TEST_F(Surroundings, textIsWrittenInTheOnlyFontThereIs)
 {
     // "mim" is about 50 pixels wide in the one and 41 in the other.
     std::vector<int> widths;

@@ -76,7 +76,7 @@ TEST_F(ToolBarWhileTyping, keysOfUndoAndRedoAreTheEditorsOwn)
     EXPECT_TRUE(waitUntil([&] { return inked().width() <= caret; }));
 }
 
-TEST_F(ToolBarWhileTyping, whoTypesOnAfterTheEndChoosesNoTool)
+TEST_F(ToolBarWhileTyping, typingOnAfterTheEditChoosesNoTool)
 {
     desktop().keyboard().press("Return");
     desktop().keyboard().type("be");

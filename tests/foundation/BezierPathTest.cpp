@@ -72,7 +72,7 @@ TEST(BezierPath, linesThatFollowEachOtherAreAChainOfPointsAndKeepTheirElements)
     }
 }
 
-TEST(BezierPath, whateverIsNoChainKeepsTheElementsThatItHadAsOne)
+TEST(BezierPath, pathThatStopsBeingAChainKeepsItsElements)
 {
     const auto chainOfOne = [] {
         auto path = std::make_unique<BezierPath>();

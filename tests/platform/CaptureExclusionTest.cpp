@@ -52,7 +52,7 @@ TEST_F(CaptureExclusion, windowThatMayBeSeenIsNotInTheList)
     EXPECT_EQ(m_bar.windowsToLeaveOutOfCaptures(), Identifiers { m_bar.winId() });
 }
 
-TEST_F(CaptureExclusion, hasWhatStandsAboveTheWindowAndWhatWillInTheOrderOfBeingToldOf)
+TEST_F(CaptureExclusion, listsWindowsAboveAndExpectedAboveInTheOrderOfAdding)
 {
     expectAll();
 

@@ -124,7 +124,7 @@ TEST(OwnLook, editorKeepsItsFont)
     EXPECT_EQ(font.pixelSize(), 24);
 }
 
-TEST(OwnLook, fontLeavesNothingToWhatItIsUsedWith)
+TEST(OwnLook, fontSetsAllItsProperties)
 {
     QFont loud(QStringLiteral("Serif"), 40, QFont::Bold, true);
     loud.setUnderline(true);

@@ -80,7 +80,7 @@ TEST_F(PointerContactTest, deviceThatIsGoneExcludesNobody)
     EXPECT_FALSE(m_contact.excludes(mouse(QEvent::MouseButtonPress, m_mouse)));
 }
 
-TEST_F(PointerContactTest, penThatHoversWasLetGoAndAMouseThatDoesWasNot)
+TEST_F(PointerContactTest, contactOfAPenIsOverWhenThePenHoversAndNotWhenAMouseDoes)
 {
     m_contact.begin(tablet(QEvent::TabletPress, m_tip), {}, 1);
     EXPECT_TRUE(m_contact.isBeliedBy(mouse(QEvent::MouseMove, m_tip)));
@@ -90,7 +90,7 @@ TEST_F(PointerContactTest, penThatHoversWasLetGoAndAMouseThatDoesWasNot)
     EXPECT_FALSE(m_contact.isBeliedBy(mouse(QEvent::MouseMove, m_tip)));
 }
 
-TEST_F(PointerContactTest, mouseThatHoversWasLetGoWhereItsReleaseWasLost)
+TEST_F(PointerContactTest, contactOfAMouseIsOverWhenTheMouseHovers)
 {
     m_contact.begin(mouse(QEvent::MouseButtonPress, m_mouse), {}, 1);
 

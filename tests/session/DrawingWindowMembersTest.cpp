@@ -96,7 +96,7 @@ TEST_F(DrawingWindowMembers, originThatIsSetIsWhereWindowsArePlacedFrom)
     EXPECT_EQ(m_controller->drawingWindowOrigin(), std::nullopt);
 }
 
-TEST_F(DrawingWindowMembers, typeThatIsSetIsWhatTheEndIsToldBy)
+TEST_F(DrawingWindowMembers, typeThatIsSetDecidesHowTheEndIsTold)
 {
     m_controller->setMWindowType(WindowType::imageAnnotation);
     EXPECT_EQ(m_controller->mWindowType(), WindowType::imageAnnotation);

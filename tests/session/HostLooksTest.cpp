@@ -277,7 +277,7 @@ std::string lookName(const testing::TestParamInfo<std::tuple<HostLook, int>> &lo
 
 } // namespace
 
-TEST_P(HostLooks, doNotChangeAWindowThatIsOpenedThen)
+TEST_P(HostLooks, doNotChangeAWindowThatIsOpenedLater)
 {
     const Pictures &expected = usual();
 

@@ -251,7 +251,7 @@ TEST_F(ToolPanelWindow, isAdjustedTwoTenthsOfASecondAfterTheButtonWasLetGo)
     EXPECT_EQ(m_panel.frame().x, 343);
 }
 
-TEST_F(ToolPanelWindow, everyReleaseIsAdjustedAfterAndNothingWaitsThen)
+TEST_F(ToolPanelWindow, everyReleaseIsFollowedByOneAdjustment)
 {
     show();
     m_controller.mouseUp();

@@ -35,7 +35,7 @@ TEST(TextRoom, emptyTextTakesTwoThousandFiveHundredCharactersAndTwoHundredFiftyL
     EXPECT_EQ(roomBehind(QString()), (TextRoom { 2500, 249, 64 }));
 }
 
-TEST(TextRoom, whatIsThereTakesItsPlace)
+TEST(TextRoom, textThatIsThereTakesUpRoom)
 {
     EXPECT_EQ(roomBehind(QStringLiteral("ab\ncd")), (TextRoom { 2495, 248, 64 }));
     EXPECT_EQ(roomBehind(times(2500, QStringLiteral("m"))), (TextRoom { 0, 249, 64 }));

@@ -117,7 +117,7 @@ TEST_F(TnTextBoxPlaceTest, placedBoxThatIsTooHighShowsItsBeginningAndTheWheelThe
     EXPECT_EQ(box->font().pixelSize(), 24);
 }
 
-TEST_F(TnTextBoxPlaceTest, wheelOverABoxThatIsShownWholeIsNotTheBoxes)
+TEST_F(TnTextBoxPlaceTest, wheelOverABoxThatIsShownWholeIsNotTaken)
 {
     const auto box = placedBox();
 

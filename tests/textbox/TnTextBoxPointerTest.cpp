@@ -312,7 +312,7 @@ TEST_F(TnTextBoxPointerTest, selectionInAPlacedBoxStaysForItsOwnMenu)
     EXPECT_EQ(box->textCursor().selectedText(), QStringLiteral("Hello"));
 }
 
-TEST_F(TnTextBoxPointerTest, whatIsDroppedOfASelectionScrollsNothing)
+TEST_F(TnTextBoxPointerTest, clearingASelectionScrollsNothing)
 {
     const auto box = newBox();
     paste(*box, QStringLiteral("1\n2\n3\n4\n5\n6\n7\n8\n9"));

@@ -77,7 +77,7 @@ TEST_F(ToolPanelKeys, lettersChooseToolsOnAFreshBoard)
     EXPECT_EQ(selectedOptions("color"), only("color#red"));
 }
 
-TEST_F(ToolPanelKeys, whoTypesOnAfterReturnChoosesNothing)
+TEST_F(ToolPanelKeys, typingOnAfterReturnChoosesNothing)
 {
     writeAt({ 250, 100 });
     type(Qt::Key_Return);
@@ -201,7 +201,7 @@ TEST_F(ToolPanelKeys, pressOnAnotherBoardWakesNothingHere)
     EXPECT_EQ(tool(), QStringLiteral("text"));
 }
 
-TEST_F(ToolPanelKeys, noneOfThemRepeatsItself)
+TEST_F(ToolPanelKeys, keyThatRepeatsItselfDoesNothing)
 {
     auto &model = *drawViewController().drawingCanvasModel();
     model.createPathWithParam(Qt::black, 5.0, { 300, 300 });
