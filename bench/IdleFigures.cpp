@@ -39,7 +39,7 @@ public:
 #ifdef PENWICK_HAS_GETRUSAGE
         return ofAllThreads() - m_atFirst;
 #else
-        return m_blocks; // of the event loop alone, which may only have thought of sleeping
+        return m_blocks; // the event loop's own count, in which it may not have slept each time
 #endif
     }
 
