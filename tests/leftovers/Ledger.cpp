@@ -18,8 +18,8 @@ namespace {
 // No block is smaller than 32 bytes, its own bookkeeping included.
 constexpr double bytesOfNoBlock = 24.0;
 
-// The toolkit sets the title of a window through a library that writes down each such request until
-// it is itself asked for an answer, which the toolkit never does.
+// The toolkit sets the title of a window through Xlib, which remembers each such request until Xlib
+// is asked for an answer. The toolkit never asks, so the memory would grow; it is asked here.
 void settleDisplay()
 {
     if (QGuiApplication::platformName() != QStringLiteral("xcb"))

@@ -76,7 +76,8 @@ void rest()
     }
 }
 
-// The toolkit keeps some of what was shown last, the pointer for one: that is the same each time.
+// Ends with one session of each kind, so that what the toolkit keeps of the windows shown last,
+// such as the pointer's shape, is the same each time.
 bool comeToRest()
 {
     constexpr int kinds = 3;

@@ -53,7 +53,7 @@ void MonkeyHost::awaitAnswer()
     try {
         m_process->writeLine("answer");
     } catch (const std::runtime_error &) {
-        // It has just ended; see below.
+        // The host has just ended, which keepOpen() deals with below.
     }
     bool hasAnswered = false;
     const bool isDone = waitUntil(

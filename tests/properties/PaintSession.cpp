@@ -184,7 +184,8 @@ QImage PaintSession::onScreen()
         QEvent paintWhatIsMarked(QEvent::UpdateRequest);
         QCoreApplication::sendEvent(&m_window, &paintWhatIsMarked);
     }
-    // What the screen has of it; without a screen nothing else reads it at every scale.
+    // The window's backing store is what would be on the screen. Without a screen there is no other
+    // way to read it in device pixels at every scale.
     const auto &shown = dynamic_cast<const QImage &>(*m_window.backingStore()->paintDevice());
     return shown.convertToFormat(QImage::Format_RGB32);
 }

@@ -13,10 +13,10 @@ namespace penwick::sessions {
 [[nodiscard]] bool isReplaced(
     const std::string &before, const std::string &put, const std::string &now);
 
-/// What stands in a box, and what an input method has half composed there.
+/// The text of a box, and what an input method is composing in it.
 ///
-/// Where the caret is and what is selected is the editor's business: after a step that depends on
-/// it, the text that the editor has is taken over, if it is one that the step may leave.
+/// The caret and the selection are not modelled. After a step that depends on them, the text that
+/// the real editor has is taken over, if the step may leave such a text.
 class PlainText
 {
 public:

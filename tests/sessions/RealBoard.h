@@ -40,7 +40,7 @@ namespace sessions {
 /// One session of a host: its entry object and the drawing window that it opened last.
 ///
 /// Pointer and keys go through the toolkit's own delivery, at times of a clock that stands still
-/// unless a step is taken. Nothing is left to timers: what one would do is asked for by name.
+/// unless a step is taken. Nothing waits for a timer: a step calls by name what a timer would do.
 class RealBoard
 {
 public:

@@ -49,7 +49,7 @@ void RealBoard::learnNames()
     }
 }
 
-// One that nobody learnt of shows as such.
+// A stroke or box that learnNames() has not seen is called "?", which shows as a difference.
 std::string RealBoard::nameOf(std::int64_t id) const
 {
     const auto found = m_names.find(id);

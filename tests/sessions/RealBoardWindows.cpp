@@ -43,8 +43,9 @@ void RealBoard::paint()
 
 void RealBoard::activate(bool isActive)
 {
-    // What replaces this call asks the desktop, whose answer comes with the event loop: the board
-    // would have painted, and done what it left for later, before it loses the keys.
+    // This call is deprecated, but it acts at once. The one that replaces it asks the desktop,
+    // whose answer comes with the event loop: the board would paint, and do what it left for later,
+    // before it lost the keys.
     QT_WARNING_PUSH
     QT_WARNING_DISABLE_DEPRECATED
     QApplication::setActiveWindow(isActive ? &window() : nullptr);

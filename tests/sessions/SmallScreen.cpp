@@ -9,7 +9,8 @@ namespace {
 
 QtMessageHandler former = nullptr;
 
-// Without a screen there is no order of windows and no grab.
+// Keeps back what the toolkit says whenever a window is raised or the pointer grabbed: without a
+// screen it can do neither.
 void withoutPlugin(QtMsgType type, const QMessageLogContext &context, const QString &message)
 {
     if (!message.startsWith(QStringLiteral("This plugin does not support")))
