@@ -15,8 +15,6 @@ const QString text = QStringLiteral("text");
 
 using DrawViewControllerOptionTest = CanvasFixture;
 
-// Options
-
 TEST_F(DrawViewControllerOptionTest, everyColourOfTheMapCanBeChosen)
 {
     ASSERT_EQ(colorMap().size(), 9);
