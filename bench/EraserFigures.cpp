@@ -4,6 +4,7 @@
 #include "Figure.h"
 #include "Turns.h"
 
+#include "strokes/StrokeIndex.h"
 #include "strokes/StrokePainter.h"
 #include "strokes/StrokePicture.h"
 
@@ -54,14 +55,19 @@ Figure missFigure()
         turns.of(onEmpty), { 5.0, 3.0 });
 }
 
-/// How many pixels of a picture are written when the stroke at `index` is removed. Before that all
+/// How many pixels of a picture are written when the stroke at `gone` is removed. Before that all
 /// pixels are given a colour that no stroke has; those that have lost it were written.
-double pixelsPaintedWithout(const Board &board, int index, const QRect &area)
+double pixelsPaintedWithout(const Board &board, int gone, const QRect &area)
 {
     const QSize size = QSize(canvasWidth, canvasHeight) * board.scale();
+    StrokeIndex index;
     StrokePicture picture;
-    picture.follow(board.strokes());
-    picture.update(size, board.scale());
+    const auto show = [&](const EntryList<StrokeEntry> &strokes) {
+        index.follow(strokes);
+        picture.follow(strokes);
+        picture.update(index, size, board.scale());
+    };
+    show(board.strokes());
     constexpr QRgb untouched = 0x01010101;
     const QImage &image = picture.pixels().image();
     // The picture lets nobody write to its pixels. As nobody else shares the image, its lines can
@@ -71,9 +77,8 @@ double pixelsPaintedWithout(const Board &board, int index, const QRect &area)
         std::fill_n(line, image.width(), untouched);
     }
     EntryList<StrokeEntry> without = board.strokes();
-    without.removeAt(index);
-    picture.follow(without);
-    picture.update(size, board.scale());
+    without.removeAt(gone);
+    show(without);
 
     double painted = 0.0;
     for (int y = 0; y < image.height(); ++y) {

@@ -33,7 +33,7 @@ double bytesInUse()
     return static_cast<double>(info.uordblks + info.hblkhd);
 }
 
-/// What a stroke takes on a board all told: points, entry, record, both indices.
+/// What a stroke takes on a board all told: points, entry, record, index.
 double bytesOfAStroke(int segments)
 {
     Board board(1); // so that everything is there which is there once
@@ -47,15 +47,14 @@ double bytesOfAStroke(int segments)
 double windowsCached(const EntryList<StrokeEntry> &strokes, double scale)
 {
     const QSize size = QSize(canvasWidth, canvasHeight) * scale;
-    const double before = bytesInUse();
     StrokeIndex index;
     index.follow(strokes);
-    const double betweenBoth = bytesInUse();
+    static_cast<void>(index.touching({})); // so that it has taken them in
+    const double before = bytesInUse();
     StrokePicture picture;
     picture.follow(strokes);
-    picture.update(size, scale);
-    const double cached = (bytesInUse() - betweenBoth) - (betweenBoth - before);
-    return cached / (4.0 * size.width() * size.height());
+    picture.update(index, size, scale);
+    return (bytesInUse() - before) / (4.0 * size.width() * size.height());
 }
 
 Figures byteFigures()

@@ -37,6 +37,12 @@ UndoRedoManager &DrawingCanvasModel::requireHistory() const
     return *platform::require(m_undoRedoManager, "the canvas model has no history");
 }
 
+void DrawingCanvasModel::setPathArray(EntryList<StrokeEntry> strokes)
+{
+    CanvasContent::setPathArray(std::move(strokes));
+    m_strokeIndex.follow(pathArray());
+}
+
 void DrawingCanvasModel::record(const UndoRedoState &state)
 {
     UndoRedoManager &history = requireHistory();
@@ -66,7 +72,6 @@ void DrawingCanvasModel::createPathWithParam(
     EntryList<StrokeEntry> strokes = pathArray();
     strokes.append(entry);
     setPathArray(std::move(strokes));
-    m_strokeIndex.follow(pathArray());
     record({ entry, ActionType::draw, pathId });
     forgetWhatCouldBeRedone();
 }
@@ -75,7 +80,6 @@ void DrawingCanvasModel::updateTheCurrentPath(platform::Point currentPoint)
 {
     if (pathArray().isEmpty())
         return;
-    m_strokeIndex.follow(pathArray()); // an undo may have made another stroke the newest
     EntryList<StrokeEntry> strokes = pathArray();
     StrokeEntry &current = strokes.mutableLast();
     std::optional<platform::Point> &segmentStart = current.bPathParams.startPoint;
@@ -89,7 +93,6 @@ void DrawingCanvasModel::updateTheCurrentPath(platform::Point currentPoint)
 
 bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLocation)
 {
-    m_strokeIndex.follow(pathArray());
     const auto hit = m_strokeIndex.oldestAt(eraseLocation);
     if (!hit)
         return false;
@@ -99,14 +102,7 @@ bool DrawingCanvasModel::performEraseOperationAtLocation(platform::Point eraseLo
     EntryList<StrokeEntry> strokes = pathArray();
     strokes.removeAt(*hit);
     setPathArray(std::move(strokes));
-    m_strokeIndex.follow(pathArray());
     return true;
-}
-
-Meetings DrawingCanvasModel::strokesMetOn(const Way &way)
-{
-    m_strokeIndex.follow(pathArray());
-    return m_strokeIndex.meetingsOn(way);
 }
 
 void DrawingCanvasModel::createTextBox(
@@ -123,8 +119,6 @@ void DrawingCanvasModel::createTextBox(
     boxes.append(entry);
     setTextBoxArray(std::move(boxes));
     record({ entry, ActionType::draw, entry.textId });
-    // record() may have made the history forget strokes; the index must not keep them alive.
-    m_strokeIndex.follow(pathArray());
 }
 
 void DrawingCanvasModel::deleteTextBoxWith(std::int64_t hashValue)
@@ -150,7 +144,6 @@ void DrawingCanvasModel::clearCanvas()
         history.pushUndo({ entry, ActionType::clear, entry.textId });
     history.setUndoCount(0);
     setPathArray({});
-    m_strokeIndex.follow(pathArray()); // so that the index keeps no stroke alive
     setTextBoxArray({});
 }
 

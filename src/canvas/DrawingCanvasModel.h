@@ -49,8 +49,8 @@ public:
     /// Erases the oldest stroke that the point lies on; false if there is none.
     bool performEraseOperationAtLocation(platform::Point eraseLocation);
 
-    /// Where an eraser that moves along `way` meets strokes.
-    [[nodiscard]] Meetings strokesMetOn(const Way &way);
+    /// Which strokes lie where; always of pathArray().
+    [[nodiscard]] const StrokeIndex &strokeIndex() const { return m_strokeIndex; }
 
     /// Adds a text box to the content; the caller adds it to a view. Unlike a new stroke, a new box
     /// leaves what can be redone as it is. `delegate` must be a TextBoxDelegate (else the process
@@ -67,7 +67,7 @@ public:
 
 private:
     // Only the history assigns the arrays; everybody else calls an operation.
-    using CanvasContent::setPathArray;
+    void setPathArray(EntryList<StrokeEntry> strokes) override;
     using CanvasContent::setTextBoxArray;
 
     [[nodiscard]] UndoRedoManager &requireHistory() const;
@@ -75,7 +75,7 @@ private:
     void forgetWhatCouldBeRedone();
 
     std::shared_ptr<UndoRedoManager> m_undoRedoManager;
-    StrokeIndex m_strokeIndex; // follow() is called before it is asked and before a stroke grows
+    StrokeIndex m_strokeIndex;
 };
 
 } // namespace penwick

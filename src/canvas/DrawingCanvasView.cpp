@@ -175,7 +175,7 @@ bool DrawingCanvasView::dragEraserTo(Point point)
     const Way way { std::exchange(m_eraserPlace, point).value_or(point), point };
     int strokesLeft = -1;
     for (;;) {
-        const Meetings met = model().strokesMetOn(way);
+        const Meetings met = model().strokeIndex().meetingsOn(way);
         if (met.places.empty() || model().pathArray().size() == strokesLeft)
             return met.isAtEnd;
         strokesLeft = model().pathArray().size();
@@ -315,8 +315,13 @@ QSize DrawingCanvasView::pixelSize() const
 
 const PixelLayer &DrawingCanvasView::finishedPixels()
 {
-    m_picture.follow(m_pathArray); // a click may have dropped an entry
-    m_picture.update(pixelSize(), QWidget::devicePixelRatioF(), paper());
+    DrawingCanvasDelegate *const delegate = m_drawingCanvasDelegate.get();
+    const std::shared_ptr<DrawingCanvasModel> content
+        = delegate ? delegate->drawingCanvasModel() : nullptr;
+    if (content) { // whose strokes begin with those of the copy here
+        const double scale = QWidget::devicePixelRatioF();
+        m_picture.update(content->strokeIndex(), pixelSize(), scale, paper());
+    }
     return m_picture.pixels();
 }
 

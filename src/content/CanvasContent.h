@@ -34,6 +34,12 @@ struct StrokeEntry
     std::int64_t pathId = 0; ///< the path's hash()
 };
 
+/// Whether both are the same stroke, however much it has grown.
+[[nodiscard]] inline bool isSameStroke(const StrokeEntry &a, const StrokeEntry &b)
+{
+    return a.bPath == b.bPath;
+}
+
 /// One text box.
 struct TextBoxEntry
 {
@@ -53,7 +59,7 @@ public:
     CanvasContent &operator=(const CanvasContent &) = delete;
 
     [[nodiscard]] const EntryList<StrokeEntry> &pathArray() const { return m_pathArray; }
-    void setPathArray(EntryList<StrokeEntry> strokes) { m_pathArray = std::move(strokes); }
+    virtual void setPathArray(EntryList<StrokeEntry> strokes) { m_pathArray = std::move(strokes); }
     [[nodiscard]] const EntryList<TextBoxEntry> &textBoxArray() const { return m_textBoxArray; }
     void setTextBoxArray(EntryList<TextBoxEntry> boxes) { m_textBoxArray = std::move(boxes); }
 

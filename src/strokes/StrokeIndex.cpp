@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "strokes/StrokeIndex.h"
 
+#include "content/EntryListChange.h"
 #include "strokes/StrokeHitTest.h"
 
 #include <penwick/platform/BezierPath.h>
@@ -31,6 +32,9 @@ using TreeBox = geometry::model::box<TreePoint>;
 constexpr std::size_t strokesOfANode = 16;
 constexpr double longestPiece = 64.0; // points
 constexpr double mostPieces = 1000.0; // bounds the work for two events that are very far apart
+// The tree is built anew if more than one place in so many has changed: that is faster than many
+// single changes, and gives a better tree.
+constexpr std::size_t placesPerSingleChange = 8;
 
 // Rounded outwards: the tree may find a stroke too many, never one too few.
 float below(double value)
@@ -65,7 +69,24 @@ public:
     using Places = geometry::index::rtree<Place, geometry::index::quadratic<strokesOfANode>,
         BoxOfPlace, SamePlace>;
 
+    /// Makes the tree hold exactly the places in `all`.
+    void bringUpTo(const std::deque<Place> &all)
+    {
+        const std::size_t come = all.size() - taken;
+        if ((gone.size() + come) * placesPerSingleChange > all.size()) {
+            places = Places(all);
+        } else {
+            for (const Place &place : gone)
+                places.remove(place);
+            places.insert(all.end() - static_cast<std::ptrdiff_t>(come), all.end());
+        }
+        gone.clear();
+        taken = all.size();
+    }
+
     Places places;
+    std::size_t taken = 0; // how many places at the front of the list are in the tree
+    std::vector<Place> gone; // places that have left the list, but not yet the tree
 };
 
 StrokeIndex::StrokeIndex()
@@ -81,48 +102,35 @@ StrokeIndex::Bounds StrokeIndex::boundsOf(const StrokeEntry &stroke)
     return { below(bounds.x), below(bounds.y), above(bounds.maxX()), above(bounds.maxY()) };
 }
 
-EntryListChange StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
+void StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
 {
-    const EntryListChange change = changeBetween(m_strokes, strokes,
-        [](const StrokeEntry &a, const StrokeEntry &b) { return a.bPath == b.bPath; });
+    const EntryListChange change = changeBetween(m_strokes, strokes, isSameStroke);
     m_strokes = strokes;
-    const int last = change.first + change.added;
-    if (change.added == 0 && last < strokes.size()) {
-        remove(change.first, change.first + change.removed);
-        return change;
+    if (change.added == 0 && change.first < strokes.size()) {
+        forget(change.first, change.first + change.removed);
+        return;
     }
     // Everything behind the change is numbered anew, so that numbers rise from old to new. The
     // newest stroke gets no number, because it may still grow.
     const int wanted = std::max(0, strokes.size() - 1);
     const int present = static_cast<int>(m_places.size());
-    remove(std::min({ change.first, wanted, present }), present);
-    insert(static_cast<int>(m_places.size()), wanted);
-    return change;
-}
-
-void StrokeIndex::remove(int from, int to)
-{
-    if (from == 0 && to == static_cast<int>(m_places.size()))
-        m_tree->places.clear();
-    for (int index = from; index < to && !m_tree->places.empty(); ++index)
-        m_tree->places.remove(m_places[static_cast<std::size_t>(index)]);
-    m_places.erase(m_places.begin() + from, m_places.begin() + to);
-}
-
-void StrokeIndex::insert(int from, int to)
-{
-    for (int index = from; index < to; ++index)
+    forget(std::min({ change.first, wanted, present }), present);
+    for (int index = static_cast<int>(m_places.size()); index < wanted; ++index)
         m_places.push_back({ boundsOf(m_strokes[index]), m_nextNumber++ });
-    if (from == 0 && to > 0) {
-        m_tree->places = Tree::Places(m_places); // faster than one by one, and a better tree
-        return;
-    }
-    m_tree->places.insert(m_places.begin() + from, m_places.end());
+}
+
+void StrokeIndex::forget(int from, int to)
+{
+    const int taken = std::clamp(static_cast<int>(m_tree->taken), from, to);
+    m_tree->gone.insert(m_tree->gone.end(), m_places.begin() + from, m_places.begin() + taken);
+    m_tree->taken -= static_cast<std::size_t>(taken - from);
+    m_places.erase(m_places.begin() + from, m_places.begin() + to);
 }
 
 template <class Visit>
 void StrokeIndex::visit(const Rect &area, Visit visit) const
 {
+    m_tree->bringUpTo(m_places);
     const TreeBox box { { below(area.x), below(area.y) },
         { above(area.maxX()), above(area.maxY()) } };
     const auto visitPlace = [this, &visit](const Place &place) {

@@ -3,7 +3,6 @@
 #pragma once
 
 #include "content/CanvasContent.h"
-#include "content/EntryListChange.h"
 #include "strokes/StrokeCrossing.h"
 
 #include <penwick/platform/Geometry.h>
@@ -29,18 +28,17 @@ struct Meetings
 /// Finds the strokes of a list by place, without asking each of them.
 ///
 /// The index must be told of every change of the list but one: the newest stroke may grow without a
-/// word. No other stroke may grow. The index takes little memory next to the strokes themselves.
-/// GUI thread only.
+/// word. No other stroke may grow. Telling it costs little: the next question takes in all that has
+/// changed since the last one. The index takes little memory next to the strokes themselves. GUI
+/// thread only.
 class StrokeIndex
 {
 public:
     StrokeIndex();
     ~StrokeIndex();
 
-    /// The list that follow() was last given.
-    [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_strokes; }
-    /// Takes `strokes` as the list from now on. Returns how it differs from the list before.
-    EntryListChange follow(const EntryList<StrokeEntry> &strokes);
+    /// Takes `strokes` as the list from now on.
+    void follow(const EntryList<StrokeEntry> &strokes);
 
     /// The index of the oldest stroke that `point` lies on.
     [[nodiscard]] std::optional<int> oldestAt(platform::Point point) const;
@@ -64,8 +62,7 @@ private:
     class Tree;
 
     static Bounds boundsOf(const StrokeEntry &stroke);
-    void insert(int from, int to);
-    void remove(int from, int to);
+    void forget(int from, int to);
     [[nodiscard]] std::vector<int> near(const Way &way) const;
     template <class Visit>
     void visit(const platform::Rect &area, Visit visit) const;
@@ -75,7 +72,7 @@ private:
     // reserve twice the memory that it needs.
     std::deque<Place> m_places;
     std::uint32_t m_nextNumber = 0;
-    std::unique_ptr<Tree> m_tree;
+    std::unique_ptr<Tree> m_tree; // of m_places, as they were when it was asked last
 };
 
 } // namespace penwick

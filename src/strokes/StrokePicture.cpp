@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "strokes/StrokePicture.h"
 
+#include "strokes/StrokeIndex.h"
 #include "strokes/StrokePainter.h"
 
 #include <penwick/platform/BezierPath.h>
+
+#include <utility>
 
 namespace penwick {
 
@@ -36,12 +39,12 @@ QRect StrokePicture::follow(const EntryList<StrokeEntry> &strokes)
     if (strokes.isEmpty())
         forgetPixels();
     if (m_finished.area().isEmpty()) { // nothing is painted yet, so there is nothing to mend
-        m_index.follow(strokes);
+        m_strokes = strokes;
         return strokes.isEmpty() ? QRect() : pixelsOf(strokes.last(), m_scale);
     }
     const QRect grown = addGrowth();
-    const EntryList<StrokeEntry> before = m_index.strokes();
-    const EntryListChange change = m_index.follow(strokes);
+    const EntryList<StrokeEntry> before = std::exchange(m_strokes, strokes);
+    const EntryListChange change = changeBetween(before, m_strokes, isSameStroke);
     if (!change.isNothing())
         followChange(change, before);
     return grown | addGrowth();
@@ -62,17 +65,17 @@ void StrokePicture::followChange(
     mark(before, change.first, lastGone);
 
     int lastCome = change.first + change.added;
-    const bool isNewestNew = change.added > 0 && lastCome == strokes().size();
+    const bool isNewestNew = change.added > 0 && lastCome == m_strokes.size();
     if (isNewestNew)
         --lastCome;
-    mark(strokes(), change.first, lastCome);
+    mark(m_strokes, change.first, lastCome);
     // A stroke without a colour takes the colour of one before it, which may be another one now.
-    if (lastCome < strokes().size() && !strokes()[lastCome].bPathParams.pathColor)
+    if (lastCome < m_strokes.size() && !m_strokes[lastCome].bPathParams.pathColor)
         m_marked = m_finished.area();
     if (isNewestNew)
         takeNewestApart();
-    else if (!m_isNewestApart && !strokes().isEmpty())
-        m_newestElements = strokes().last().bPath->elementCount();
+    else if (!m_isNewestApart && !m_strokes.isEmpty())
+        m_newestElements = m_strokes.last().bPath->elementCount();
 }
 
 void StrokePicture::mark(const EntryList<StrokeEntry> &strokes, int from, int to)
@@ -115,19 +118,19 @@ void StrokePicture::forgetNewest()
 
 QColor StrokePicture::newestColor() const
 {
-    return colorOf(strokes(), strokes().size() - 1);
+    return colorOf(m_strokes, m_strokes.size() - 1);
 }
 
 QRect StrokePicture::addGrowth()
 {
-    if (strokes().isEmpty())
+    if (m_strokes.isEmpty())
         return {};
-    const StrokeEntry &newest = strokes().last();
+    const StrokeEntry &newest = m_strokes.last();
     const int elements = newest.bPath->elementCount();
     if (elements == m_newestElements)
         return {};
     if (!m_isNewestApart) { // it was painted with those below, but is growing again
-        mark(strokes(), strokes().size() - 1, strokes().size());
+        mark(m_strokes, m_strokes.size() - 1, m_strokes.size());
         takeNewestApart();
     }
     const int linesPainted = m_newestElements / 2;
@@ -140,15 +143,15 @@ QRect StrokePicture::addGrowth()
     return grown;
 }
 
-void StrokePicture::update(QSize size, double scale, const QColor &paper)
+void StrokePicture::update(const StrokeIndex &index, QSize size, double scale, const QColor &paper)
 {
-    if (strokes().isEmpty()) {
+    if (m_strokes.isEmpty()) {
         m_scale = scale;
         return;
     }
     resize(size, scale, paper);
     addGrowth();
-    paintMarked();
+    paintMarked(index);
 }
 
 void StrokePicture::forgetPixels()
@@ -186,21 +189,20 @@ void StrokePicture::resize(QSize size, double scale, const QColor &paper)
     m_newest.reset(m_finished.area());
 }
 
-void StrokePicture::paintMarked()
+void StrokePicture::paintMarked(const StrokeIndex &index)
 {
     for (const QRect &part : m_marked)
-        paintPart(part);
+        paintPart(index, part);
     m_marked = {};
 }
 
-void StrokePicture::paintPart(const QRect &part)
+void StrokePicture::paintPart(const StrokeIndex &index, const QRect &part)
 {
     m_below.clear(part);
-    const int settled = strokes().size() - (m_isNewestApart ? 1 : 0);
-    for (const int index : m_index.touching(inPoints(part.adjusted(-1, -1, 1, 1), m_scale))) {
-        if (index < settled)
-            paintStroke(
-                m_below, strokes()[index], colorOf(strokes(), index), m_scale, part, m_scratch);
+    const int settled = m_strokes.size() - (m_isNewestApart ? 1 : 0);
+    for (const int at : index.touching(inPoints(part.adjusted(-1, -1, 1, 1), m_scale))) {
+        if (at < settled)
+            paintStroke(m_below, m_strokes[at], colorOf(m_strokes, at), m_scale, part, m_scratch);
     }
     m_finished.copy(m_below, part);
     const QRect common = part & m_newestArea;

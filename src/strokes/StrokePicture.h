@@ -2,15 +2,18 @@
 // The strokes of a canvas as finished pixels, mended where they change.
 #pragma once
 
+#include "content/CanvasContent.h"
+#include "content/EntryListChange.h"
 #include "strokes/CoverageMask.h"
 #include "strokes/PixelLayer.h"
-#include "strokes/StrokeIndex.h"
 
 #include <QColor>
 #include <QRect>
 #include <QRegion>
 
 namespace penwick {
+
+class StrokeIndex;
 
 /// What a list of strokes looks like, oldest first, each one shape in its colour.
 ///
@@ -28,8 +31,9 @@ public:
     QRect follow(const EntryList<StrokeEntry> &strokes);
 
     /// Brings the pixels up to date for a canvas of `size` device pixels with `scale` pixels a
-    /// point, on `paper`.
-    void update(QSize size, double scale, const QColor &paper = Qt::transparent);
+    /// point, on `paper`. `index` is of these strokes, or of more that came after them.
+    void update(
+        const StrokeIndex &index, QSize size, double scale, const QColor &paper = Qt::transparent);
 
     /// The finished pixels, at least as large as the canvas, after update(); none at all where
     /// there are no strokes.
@@ -45,12 +49,11 @@ private:
     QRect addGrowth();
     void forgetPixels();
     void resize(QSize size, double scale, const QColor &paper);
-    void paintMarked();
-    void paintPart(const QRect &part);
-    [[nodiscard]] const EntryList<StrokeEntry> &strokes() const { return m_index.strokes(); }
+    void paintMarked(const StrokeIndex &index);
+    void paintPart(const StrokeIndex &index, const QRect &part);
     [[nodiscard]] QColor newestColor() const;
 
-    StrokeIndex m_index;
+    EntryList<StrokeEntry> m_strokes;
     double m_scale = 0.0; // pixels a point
     QColor m_paper = Qt::transparent;
     PixelLayer m_finished;

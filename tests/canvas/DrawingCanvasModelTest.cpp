@@ -178,6 +178,21 @@ TEST_F(DrawingCanvasModelTest, undoOfAStrokeKeepsItsPathAlive)
     EXPECT_TRUE(path.expired());
 }
 
+TEST_F(DrawingCanvasModelTest, strokeThatGrewWhileALaterOneWasUndoneIsErasedWhereItGrew)
+{
+    drawLine({ 0, 0 });
+    drawLine({ 0, 50 });
+    EXPECT_FALSE(model->performEraseOperationAtLocation({ 50, 20 }));
+    history->undoAction();
+    model->updateTheCurrentPath({ 100, 300 });
+    history->redoAction();
+    ASSERT_EQ(model->pathArray().size(), 2);
+
+    EXPECT_TRUE(model->performEraseOperationAtLocation({ 100, 200 }));
+
+    EXPECT_EQ(model->pathArray().size(), 1);
+}
+
 TEST_F(DrawingCanvasModelTest, eraseTakesTheOlderOfTwoStrokesThenTheNewer)
 {
     const std::int64_t older = drawLine();

@@ -70,6 +70,34 @@ TEST(StrokeIndex, strokeThatIsNewestAgainMayGrowAgain)
     EXPECT_EQ(index.oldestAt({ 50, 80 }), 0);
 }
 
+TEST(StrokeIndex, whatChangesBetweenTwoQuestionsIsTakenInWithTheSecond)
+{
+    EntryList<StrokeEntry> strokes;
+    for (int number = 1; number <= 200; ++number)
+        strokes.append(lineAt(number * 10.0));
+    StrokeIndex index;
+    index.follow(strokes);
+    ASSERT_EQ(index.oldestAt({ 20, 510 }), 50);
+
+    for (const int gone : { 50, 0, strokes.size() - 3 }) {
+        strokes.removeAt(gone);
+        index.follow(strokes);
+    }
+    for (const double y : { 3000.0, 3010.0 }) {
+        strokes.append(lineAt(y));
+        index.follow(strokes);
+    }
+
+    for (const double y : { 10.0, 510.0, 2000.0 })
+        EXPECT_EQ(index.oldestAt({ 20, y }), std::nullopt) << y;
+    EXPECT_EQ(index.oldestAt({ 20, 20 }), 0);
+    EXPECT_EQ(index.oldestAt({ 20, 520 }), 49);
+    EXPECT_EQ(index.oldestAt({ 20, 1990 }), 196);
+    EXPECT_EQ(index.oldestAt({ 20, 3000 }), 197);
+    EXPECT_EQ(index.oldestAt({ 20, 3010 }), 198);
+    EXPECT_EQ(index.touching({ 0, 0, 100, 4000 }).size(), 199U);
+}
+
 TEST(StrokeIndex, meetingPointsAreInTheOrderOfTheWayAndOldestFirstWhereStrokesAreMetAtOnce)
 {
     EntryList<StrokeEntry> strokes;
@@ -114,6 +142,8 @@ RC_GTEST_PROP(StrokeIndexProperties, meetsOnAWayWhatAskingEveryStrokeMeets, ())
     for (int step = 0; step < steps; ++step) {
         drawing.change();
         index.follow(drawing.strokes());
+        if (*rc::gen::inRange(0, 3) == 0)
+            continue; // several changes for one question
 
         const Way way { anyPoint(), anyPoint() };
         std::vector<std::pair<double, int>> met;
@@ -141,6 +171,8 @@ RC_GTEST_PROP(StrokeIndexProperties, answersAsAskingEveryStrokeDoes, ())
     for (int step = 0; step < steps; ++step) {
         drawing.change();
         index.follow(drawing.strokes());
+        if (*rc::gen::inRange(0, 3) == 0)
+            continue;
 
         const Point point = anyPoint();
         RC_ASSERT(index.oldestAt(point)

@@ -3,6 +3,7 @@
 #include "strokes/StrokePicture.h"
 
 #include "StrokeFixture.h"
+#include "strokes/StrokeIndex.h"
 #include "strokes/StrokePainter.h"
 
 #include <gtest/gtest.h>
@@ -27,7 +28,24 @@ QImage paintedAnew(const EntryList<StrokeEntry> &strokes, QSize size, double sca
     return layer.image();
 }
 
-QImage shownBy(const StrokePicture &picture, QSize size)
+/// A picture with an index of the same strokes.
+class Shown
+{
+public:
+    void follow(const EntryList<StrokeEntry> &strokes)
+    {
+        m_index.follow(strokes);
+        m_picture.follow(strokes);
+    }
+    void update(QSize size, double scale) { m_picture.update(m_index, size, scale); }
+    [[nodiscard]] const PixelLayer &pixels() const { return m_picture.pixels(); }
+
+private:
+    StrokeIndex m_index;
+    StrokePicture m_picture;
+};
+
+QImage imageOf(const Shown &picture, QSize size)
 {
     if (picture.pixels().area().isEmpty())
         return PixelLayer(size).image();
@@ -54,7 +72,7 @@ EntryList<StrokeEntry> listOf(const std::vector<StrokeEntry> &strokes)
 std::string colorAt(
     int y, const std::vector<StrokeEntry> &before, const std::vector<StrokeEntry> &after)
 {
-    StrokePicture picture;
+    Shown picture;
     for (const auto &strokes : { before, after }) {
         picture.follow(listOf(strokes));
         picture.update({ 100, 70 }, 1.0);
@@ -96,7 +114,7 @@ TEST(StrokePicture, newestStrokeWithoutAColourTakesAnotherWhenTheOneBeforeItGoes
 
 TEST(StrokePicture, pictureOfNothingHasNoPixelsAndKeepsNone)
 {
-    StrokePicture picture;
+    Shown picture;
     picture.update({ 100, 70 }, 1.0);
     EXPECT_TRUE(picture.pixels().area().isEmpty());
 
@@ -111,10 +129,26 @@ TEST(StrokePicture, pictureOfNothingHasNoPixelsAndKeepsNone)
     EXPECT_TRUE(picture.pixels().area().isEmpty());
 }
 
+TEST(StrokePicture, strokesThatItsIndexKnowsAlreadyAreNotShownBeforeItIsToldOfThem)
+{
+    EntryList<StrokeEntry> strokes = listOf({ lineAt(10), lineAt(30) });
+    StrokePicture picture;
+    picture.follow(strokes);
+    StrokeIndex index;
+    for (const double y : { 40.0, 50.0 })
+        strokes.append(lineAt(y));
+    index.follow(strokes);
+
+    picture.update(index, { 100, 70 }, 1.0);
+
+    EXPECT_EQ(picture.pixels().image().copy(picture.pixels().inImage({ 0, 0, 100, 70 })),
+        paintedAnew(listOf({ strokes[0], strokes[1] }), { 100, 70 }, 1.0));
+}
+
 RC_GTEST_PROP(StrokePictureProperties, mendedPictureIsTheOnePaintedAnew, ())
 {
     AnyDrawing drawing;
-    StrokePicture picture;
+    Shown picture;
     double scale = 1.0;
     QSize size(side, side);
     const int steps = *rc::gen::inRange(1, 60);
@@ -127,7 +161,7 @@ RC_GTEST_PROP(StrokePictureProperties, mendedPictureIsTheOnePaintedAnew, ())
             size = { *rc::gen::inRange(1, 300), *rc::gen::inRange(1, 300) };
         if (*rc::gen::inRange(0, 2) == 0) {
             picture.update(size, scale);
-            RC_ASSERT(shownBy(picture, size) == paintedAnew(drawing.strokes(), size, scale));
+            RC_ASSERT(imageOf(picture, size) == paintedAnew(drawing.strokes(), size, scale));
         }
     }
 }
