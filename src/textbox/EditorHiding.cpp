@@ -1,10 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/EditorHiding.h"
 
-#include "textbox/TextEditing.h"
-
 #include <QCoreApplication>
 #include <QDragLeaveEvent>
+#include <QMenu>
 #include <QTextEdit>
 
 #include <utility>
@@ -15,6 +14,12 @@ EditorHiding::EditorHiding(QTextEdit &editor)
     : m_editor(editor)
 {
     editor.viewport()->installEventFilter(this);
+}
+
+void EditorHiding::closeMenu()
+{
+    for (QMenu *const menu : m_editor.findChildren<QMenu *>())
+        menu->close();
 }
 
 bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
@@ -28,7 +33,7 @@ bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
         m_isDraggedOver = false;
         break;
     case QEvent::Hide:
-        closeMenuOf(m_editor);
+        closeMenu();
         if (std::exchange(m_isDraggedOver, false)) {
             QDragLeaveEvent leave;
             QCoreApplication::sendEvent(watched, &leave);

@@ -21,6 +21,9 @@ public:
     /// Borrows `editor`, whose member this is.
     explicit EditorHiding(QTextEdit &editor);
 
+    /// Closes the editor's menu, if it is open.
+    void closeMenu();
+
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "textbox/TextComposition.h"
 
-#include "textbox/TextEditing.h"
+#include "textbox/TextSelection.h"
 
 #include <QCoreApplication>
 #include <QGuiApplication>

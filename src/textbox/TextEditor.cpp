@@ -3,7 +3,8 @@
 
 #include "textbox/TextBoxLayout.h"
 #include "textbox/TextComposition.h"
-#include "textbox/TextEditing.h"
+#include "textbox/TextKeys.h"
+#include "textbox/TextSelection.h"
 
 #include <QAbstractTextDocumentLayout>
 #include <QMimeData>
@@ -90,16 +91,42 @@ void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point 
 
 void TextEditor::setEditable(bool editable)
 {
-    setReadOnly(!editable);
-    if (editable && hasFocus())
+    if (!editable) {
+        endEdit();
+        return;
+    }
+    setReadOnly(false);
+    if (hasFocus())
         m_caret.show();
-    else
-        m_caret.hide();
+}
+
+void TextEditor::endEdit()
+{
+    commitCompositionIn(*this); // an editor that became read-only would drop it
+    clearSelectionIn(*this);
+    document()->clearUndoRedoStacks();
+    m_hiding.closeMenu(); // what it offers is not possible any more
+    setReadOnly(true);
+    m_caret.hide();
+    verticalScrollBar()->setValue(0);
 }
 
 bool TextEditor::isEmpty() const
 {
     return document()->isEmpty();
+}
+
+bool TextEditor::isBlank() const
+{
+    return isEmpty() && compositionIn(*this).isEmpty();
+}
+
+void TextEditor::scrollToCaret(double height)
+{
+    if (height <= this->height())
+        verticalScrollBar()->setValue(0);
+    else
+        ensureCursorVisible();
 }
 
 // QTextEdit does not paint here, because at a scale such as 1.5 it shows its own caret even with a
@@ -140,12 +167,27 @@ void TextEditor::paintText(
 
 // The pointer
 
+// To be called before QTextEdit hears of a press; the right button, which opens the menu, changes
+// nothing. A composition becomes text, because QTextEdit would count positions as if it were text
+// already. The left button puts the caret where it is pressed, which clears the selection:
+// QTextEdit would drag selected text in an event loop of its own, in which the host may end the
+// session.
+void TextEditor::prepareForPress(const QMouseEvent &press)
+{
+    if (press.button() == Qt::RightButton)
+        return;
+    commitCompositionIn(*this);
+    // A press with Shift alone extends the selection; QTextEdit does that itself.
+    if (press.button() == Qt::LeftButton && press.modifiers() != Qt::ShiftModifier)
+        setTextCursor(cursorForPosition(press.position().toPoint()));
+}
+
 // A view takes the left button alone, and a text box gives QTextEdit none of its drags and
 // releases. QTextEdit needs them nevertheless: it selects text as the pointer moves on, and on X11
 // it pastes with the middle button.
 void TextEditor::mousePressEvent(QMouseEvent *event)
 {
-    prepareForPress(*this, *event);
+    prepareForPress(*event);
     if (event->button() == Qt::MiddleButton && isEditable())
         QTextEdit::mousePressEvent(event); // NOLINT(bugprone-parent-virtual-call): the editor alone
     ViewOf::mousePressEvent(event);
@@ -189,8 +231,14 @@ void TextEditor::keyPressEvent(QKeyEvent *event)
         return;
     }
     m_caret.restart();
-    if (!refuses(*event) && !redoIfAsked(*this, *event))
+    if (refuses(*event))
+        return;
+    if (isEditable() && asksForRedo(*event)) {
+        event->accept();
+        redo();
+    } else {
         ViewOf::keyPressEvent(event);
+    }
 }
 
 TextRoom TextEditor::room() const

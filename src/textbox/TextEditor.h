@@ -33,8 +33,14 @@ public:
     [[nodiscard]] bool isFlipped() const override { return true; }
 
     [[nodiscard]] bool isEditable() const { return !isReadOnly(); }
+    /// False ends an edit: a composition becomes text, nothing stays selected, the next edit cannot
+    /// undo this one, and a text that is too long for the editor shows its beginning.
     void setEditable(bool editable);
     [[nodiscard]] bool isEmpty() const; ///< a composition is no text yet
+    [[nodiscard]] bool isBlank() const; ///< empty, and without a composition
+    /// Scrolls only as far as the caret needs to be seen, and not at all if all of the text, which
+    /// is `height` points high, has room.
+    void scrollToCaret(double height);
 
     /// Writes everything in `font` and `color`, beginning at `origin` from the top left corner.
     void setInk(const QFont &font, const QColor &color, platform::Point origin);
@@ -67,6 +73,8 @@ protected:
     void insertFromMimeData(const QMimeData *source) override;
 
 private:
+    void endEdit();
+    void prepareForPress(const QMouseEvent &press);
     [[nodiscard]] QList<Selection> selections() const;
     [[nodiscard]] TextRoom room() const;
     [[nodiscard]] bool refuses(const QKeyEvent &press);

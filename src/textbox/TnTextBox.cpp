@@ -10,11 +10,8 @@
 #include "textbox/TextBoxLayout.h"
 #include "textbox/TextBoxNotice.h"
 #include "textbox/TextBoxPlace.h"
-#include "textbox/TextComposition.h"
-#include "textbox/TextEditing.h"
 
 #include <QPainterPath>
-#include <QScrollBar>
 #include <QTextDocument>
 
 namespace penwick {
@@ -88,11 +85,10 @@ void TnTextBox::customizeTextBox()
     m_placeholderAttributedString = { tr("Type your text here.."), faded(m_textFontColor),
         systemFontOf(placeholderFontSize), Qt::AlignJustify };
     setInk(textFontOf(m_textFontSize), m_textFontColor, textContainerOrigin());
-    setEditable(true);
-    m_hasDashedBorder = true;
     m_deleteTextButton = platform::makeView<DeleteTextBoxButton>(frame());
     connect(m_deleteTextButton.get(), &QAbstractButton::clicked, this, &TnTextBox::deleteTextBox);
     setAccessibleName(tr("Text box"));
+    beginEditing();
 }
 
 platform::PanGestureRecognizer &TnTextBox::panGesture()
@@ -127,7 +123,7 @@ void TnTextBox::drawContent(QPainter &painter)
 
 void TnTextBox::drawPlaceholder()
 {
-    if (!isEmpty() || !compositionIn(*this).isEmpty())
+    if (!isBlank())
         return;
     const Point origin = textContainerOrigin();
     QPainter painter(viewport());
@@ -154,39 +150,23 @@ void TnTextBox::drawBorder(const Rect &rect)
     painter.fillPath(QPainterPathStroker(pen).createStroke(edge), pen.color());
 }
 
-void TnTextBox::showPlacedBorder()
-{
-    setViewBorder(
-        *this, TnhColors::textBoxNormalBorderColor, placedBorderWidth, placedBorderRadius);
-}
-
 void TnTextBox::showDeleteTextButton()
 {
-    if (!m_deleteTextButton)
+    if (!m_deleteTextButton || !superview())
         return;
     m_deleteTextButton->setFrameOrigin(DeleteTextBoxButton::originFor(frame()));
     m_deleteTextButton->setHidden(false);
-    if (superview())
-        superview()->addSubview(m_deleteTextButton);
+    superview()->addSubview(m_deleteTextButton);
 }
 
 // The pointer
 
 void TnTextBox::mouseDown(const platform::MouseEvent &event)
 {
-    if (event.clickCount == 1 && !isEditable()) {
-        m_hasDashedBorder = false;
-        addGestureRecognizer(panGesture());
-        showPlacedBorder();
-    } else if (event.clickCount == 2) {
-        removeGestureRecognizer(panGesture());
-        setEditable(true);
-        if (platform::Layer *const ownLayer = layer())
-            ownLayer->borderWidth = 0.0;
-        m_hasDashedBorder = true;
-        showDeleteTextButton();
-        setNeedsDisplay();
-    }
+    if (event.clickCount == 2)
+        beginEditing();
+    else if (event.clickCount == 1 && !isEditable())
+        becomePlaced();
     if (platform::ViewHost *const ownWindow = window())
         ownWindow->makeFirstResponder(this);
     TextEditor::mouseDown(event);
@@ -233,6 +213,30 @@ void TnTextBox::keyUp(const platform::KeyEvent &event)
 
 // Modes
 
+void TnTextBox::beginEditing()
+{
+    if (m_panGesture)
+        removeGestureRecognizer(*m_panGesture);
+    setEditable(true);
+    if (platform::Layer *const ownLayer = layer())
+        ownLayer->borderWidth = 0.0;
+    m_hasDashedBorder = true;
+    showDeleteTextButton();
+    setNeedsDisplay();
+}
+
+void TnTextBox::becomePlaced()
+{
+    addGestureRecognizer(panGesture());
+    setViewBorder(
+        *this, TnhColors::textBoxNormalBorderColor, placedBorderWidth, placedBorderRadius);
+    m_hasDashedBorder = false;
+    if (!m_deleteTextButton)
+        return;
+    m_deleteTextButton->setHidden(true);
+    m_deleteTextButton->restoreImage(); // a hidden button may not hear that the pointer left
+}
+
 void TnTextBox::endEditing()
 {
     if (platform::ViewHost *const ownWindow = window())
@@ -243,16 +247,8 @@ bool TnTextBox::resignFirstResponder()
 {
     if (m_isTextBoxDeleted)
         return true;
-    endEditIn(*this);
     setEditable(false);
-    showPlacedBorder();
-    m_hasDashedBorder = false;
-    addGestureRecognizer(panGesture());
-    if (m_deleteTextButton) {
-        m_deleteTextButton->setHidden(true);
-        m_deleteTextButton->restoreImage(); // a hidden button may not hear that the pointer left
-    }
-    verticalScrollBar()->setValue(0); // a text too long for the canvas shows its beginning
+    becomePlaced();
     setAccessibleDescription({});
     if (isEmpty()) {
         m_isTextBoxDeleted = true;
@@ -294,17 +290,14 @@ void TnTextBox::fitToText()
 {
     if (m_isFitting || !superview())
         return;
-    m_isWritten = m_isWritten || !isEmpty() || !compositionIn(*this).isEmpty();
+    m_isWritten = m_isWritten || !isBlank();
     if (!m_isWritten)
         return; // until the first letter the box stays where the canvas was clicked
     m_isFitting = true;
     const platform::Size canvas = superview()->bounds().size();
     const platform::Size needed = layOutText(*document(), canvas.width);
     moveInto(frameInSight(frame(), needed, canvas));
-    if (needed.height <= frame().height)
-        verticalScrollBar()->setValue(0);
-    else
-        ensureCursorVisible();
+    scrollToCaret(needed.height);
     m_isFitting = false;
 }
 

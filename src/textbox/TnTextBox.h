@@ -106,10 +106,11 @@ public:
 
 private:
     TnTextBox(QTextDocument *textContainer, QWidget *parent);
-    void showPlacedBorder();
+    void beginEditing();
+    void becomePlaced();
+    void endEditing();
     void showDeleteTextButton();
     void removeAndReport();
-    void endEditing();
     void sayRefused(int count);
     void fitToText();
     void moveInto(const platform::Rect &frame);
