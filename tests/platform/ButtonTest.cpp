@@ -203,6 +203,23 @@ TEST_F(ButtonTest, titleIsShownWhereThereIsNoImageAndReadOut)
     EXPECT_GT(inked, 10);
 }
 
+TEST_F(ButtonTest, titleThatIsTooLongIsTheToolTipUntilAShorterOneComes)
+{
+    AttributedString title;
+    title.string = QStringLiteral("A title that no button of this width has room for");
+    m_button->setToolTip(QStringLiteral("its own"));
+
+    m_button->setAttributedTitle(title);
+    EXPECT_EQ(m_button->toolTip(), title.string);
+    title.string += QStringLiteral(", and more of it");
+    m_button->setAttributedTitle(title);
+    EXPECT_EQ(m_button->toolTip(), title.string);
+
+    title.string = QStringLiteral("I");
+    m_button->setAttributedTitle(title);
+    EXPECT_EQ(m_button->toolTip(), QStringLiteral("its own"));
+}
+
 TEST_F(ButtonTest, backgroundHasTheLayersRoundCorners)
 {
     m_button->setWantsLayer(true);

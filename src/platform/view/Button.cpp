@@ -3,6 +3,8 @@
 
 #include "platform/view/PointerPress.h"
 
+#include <utility>
+
 namespace penwick::platform {
 
 namespace {
@@ -55,8 +57,11 @@ void Button::setAttributedTitle(const AttributedString &title)
 {
     m_attributedTitle = title;
     setText(title.string); // what accessibility reads out
-    if (!fittedTitle().isWhole)
-        setToolTip(title.string);
+    const bool isWhole = fittedTitle().isWhole;
+    if (!isWhole && !m_ownToolTip)
+        m_ownToolTip = toolTip();
+    if (m_ownToolTip)
+        setToolTip(isWhole ? *std::exchange(m_ownToolTip, std::nullopt) : title.string);
     setNeedsDisplay();
 }
 

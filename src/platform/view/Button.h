@@ -10,6 +10,7 @@
 #include <QPushButton>
 
 #include <functional>
+#include <optional>
 
 namespace penwick::platform {
 
@@ -85,6 +86,7 @@ private:
     QIcon m_alternateImage;
     QColor m_backgroundColor = Qt::transparent;
     AttributedString m_attributedTitle;
+    std::optional<QString> m_ownToolTip; // while the title stands in its place
 };
 
 } // namespace penwick::platform
