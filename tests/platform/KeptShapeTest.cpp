@@ -37,6 +37,7 @@ struct Pulled
     Rect expected;
     Rect before = penwick::platform::before;
     Size ratio = sixteenToNine;
+    Rect area { -1000.0, -1000.0, 4000.0, 3000.0 };
 };
 
 template <class Row>
@@ -105,7 +106,7 @@ TEST_P(PulledFrame, hasTheShape)
 {
     const Pulled &row = GetParam();
 
-    const Rect shaped = shapedAfterPull(row.before, row.pulled, row.ratio);
+    const Rect shaped = shapedAfterPull(row.before, row.pulled, row.ratio, row.area);
 
     expectNear(shaped, row.expected);
     if (row.pulled.width > row.before.width || row.pulled.height > row.before.height) {
@@ -140,5 +141,47 @@ INSTANTIATE_TEST_SUITE_P(SixteenToNine, PulledFrame,
         Pulled { "squareOut", { 200, 100, 200, 210 }, { 200, 100, 210, 210 },
             { 200, 100, 200, 200 }, { 1, 1 } }),
     situation<Pulled>);
+
+// Of a board of 640 by 360 in an area of 1200 by 800.
+
+TEST(PulledBeyondTheScreen, boardIsAsLargeAsTheWorkAreaAllowsAndInsideIt)
+{
+    expectNear(
+        shapedAfterPull(board, { 200, 50, 640, 790 }, sixteenToNine, area), { 100, 50, 1200, 675 });
+    expectNear(shapedAfterPull(board, { 200, 100, 1300, 360 }, sixteenToNine, area),
+        { 100, 50, 1200, 675 });
+}
+
+TEST(PulledBeyondTheScreen, boardThatIsNotLargerThanTheAreaStaysWhereItIsPulled)
+{
+    expectNear(shapedAfterPull(board, { 700, 100, 1100, 360 }, sixteenToNine, area),
+        { 700, 460 - 618.75, 1100, 618.75 });
+}
+
+TEST(PulledInASmallerArea, isShapedAllTheSame)
+{
+    expectNear(shapedAfterPull(board, { 200, 100, 480, 360 }, sixteenToNine, area),
+        { 200, 190, 480, 270 });
+}
+
+TEST(FrameThatSpans, goesFromEdgeToEdgeOneWayAtLeast)
+{
+    EXPECT_TRUE(spans({ 100, 50, 600, 800 }, area));
+    EXPECT_TRUE(spans({ 700, 52, 600, 797 }, area)) << "but for a border";
+    EXPECT_TRUE(spans({ 100, 450, 1200, 400 }, area));
+    EXPECT_TRUE(spans(area, area));
+    EXPECT_FALSE(spans({ 100, 50, 600, 790 }, area));
+    EXPECT_FALSE(spans({ 100, 53, 600, 797 }, area));
+    EXPECT_FALSE(spans({ 103, 450, 1197, 400 }, area));
+    EXPECT_FALSE(spans({ 100, 450, 1190, 400 }, area));
+    EXPECT_FALSE(spans({ 100, 20, 600, 800 }, area)) << "as high, but elsewhere";
+}
+
+TEST(ShapedInside, isTheLargestInTheTopLeftCorner)
+{
+    expectNear(shapedInside({ 100, 50, 600, 800 }, sixteenToNine), { 100, 512.5, 600, 337.5 });
+    expectNear(
+        shapedInside({ 100, 450, 1200, 400 }, sixteenToNine), { 100, 450, 400.0 * 16 / 9, 400 });
+}
 
 } // namespace penwick::platform

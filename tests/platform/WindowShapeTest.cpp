@@ -146,6 +146,29 @@ TEST_F(WindowShapeTest, pulledBackToItsOwnSizeKeepsItsShape)
     EXPECT_EQ(m_window.frame(), place);
 }
 
+TEST_F(WindowShapeTest, pulledBeyondTheScreenIsNoLargerThanTheScreen)
+{
+    WindowAttributes attributes = m_window.attributes();
+    attributes.aspectRatio = Size { 3.0, 1.0 };
+    m_window.setAttributes(attributes);
+    showAt(place);
+    pullTo({ 300, 100, 600, 800 });
+
+    rest();
+
+    EXPECT_EQ(m_window.frame(), (Rect { 0, 100, 1920, 640 }));
+}
+
+TEST_F(WindowShapeTest, thatTheDesktopPutsIntoHalfOfTheScreenStaysInThatHalf)
+{
+    showAt({ 300, 200, 640, 360 });
+    pullTo({ 960, 0, 960, 1080 });
+
+    rest();
+
+    EXPECT_EQ(m_window.frame(), (Rect { 960, 540, 960, 540 }));
+}
+
 TEST_F(WindowShapeTest, movedWhileItIsPulledCountsFromWhereItWas)
 {
     showAt(place);

@@ -19,6 +19,18 @@ bool haveSameCorner(const PlainFrame &one, const PlainFrame &other)
         && std::round(screenHeight - one.top()) == std::round(screenHeight - other.top());
 }
 
+PlainFrame noLargerThanTheScreen(PlainFrame frame)
+{
+    const double scale = std::min(screenWidth / frame.width, screenHeight / frame.height);
+    if (scale >= 1.0)
+        return frame;
+    frame.width *= scale;
+    frame.height *= scale;
+    frame.x = std::clamp(frame.x, 0.0, screenWidth - frame.width);
+    frame.y = std::clamp(frame.y, 0.0, screenHeight - frame.height);
+    return frame;
+}
+
 } // namespace
 
 void PlainFrames::shiftPanel(double x, double y)
@@ -89,20 +101,25 @@ PlainFrame PlainFrames::reshaped() const
     if (isInShape || !m_unpulled
         || (m_unpulled->width == board.width && m_unpulled->height == board.height))
         return board;
-    const bool isOutward = board.width > m_unpulled->width || board.height > m_unpulled->height;
+    const auto isSame = [](double one, double other) { return std::abs(one - other) < border; };
+    const double right = board.x + board.width;
+    // Nobody holds the pointer here: the desktop has put it into a half of the screen.
+    const bool isHalf = (isSame(board.x, 0) && isSame(right, screenWidth))
+        || (isSame(board.y, 0) && isSame(board.top(), screenHeight));
+    const bool isOutward
+        = !isHalf && (board.width > m_unpulled->width || board.height > m_unpulled->height);
     const bool followsWidth = (board.width * 9 > board.height * 16) == isOutward;
     PlainFrame frame = board;
     if (followsWidth)
         frame.height = board.width * 9 / 16;
     else
         frame.width = board.height * 16 / 9;
-    const auto isSame = [](double one, double other) { return std::abs(one - other) < border; };
-    const double right = board.x + board.width;
-    if (!isSame(board.x, m_unpulled->x) && isSame(right, m_unpulled->x + m_unpulled->width))
+    const double unpulledRight = m_unpulled->x + m_unpulled->width;
+    if (!isHalf && !isSame(board.x, m_unpulled->x) && isSame(right, unpulledRight))
         frame.x = right - frame.width;
-    if (!isSame(board.y, m_unpulled->y) || isSame(board.top(), m_unpulled->top()))
+    if (isHalf || !isSame(board.y, m_unpulled->y) || isSame(board.top(), m_unpulled->top()))
         frame.y = board.top() - frame.height;
-    return frame;
+    return noLargerThanTheScreen(frame);
 }
 
 void PlainFrames::pullPanelIn()

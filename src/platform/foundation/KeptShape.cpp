@@ -37,7 +37,7 @@ Size scaledDownInto(const Size &picture, const Size &room)
         std::max(1.0, std::round(picture.height * scale)) };
 }
 
-Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio)
+Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio, const Rect &area)
 {
     const bool isOutward = pulled.width > before.width || pulled.height > before.height;
     const double asHigh = pulled.height * ratio.width / ratio.height;
@@ -47,8 +47,24 @@ Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio)
     const auto isKept = [](double one, double other) { return std::abs(one - other) < samePlace; };
     const bool keepsRight = isKept(before.maxX(), pulled.maxX()) && !isKept(before.x, pulled.x);
     const bool keepsBottom = isKept(before.y, pulled.y) && !isKept(before.maxY(), pulled.maxY());
-    return { keepsRight ? pulled.maxX() - width : pulled.x,
+    const Rect shaped { keepsRight ? pulled.maxX() - width : pulled.x,
         keepsBottom ? pulled.y : pulled.maxY() - height, width, height };
+    return shrinkage(shaped.size(), area.size()) < 1.0 ? broughtInsideInShape(shaped, area)
+                                                       : shaped;
+}
+
+bool spans(const Rect &frame, const Rect &area)
+{
+    const auto isSame = [](double one, double other) { return std::abs(one - other) < samePlace; };
+    return (isSame(frame.x, area.x) && isSame(frame.maxX(), area.maxX()))
+        || (isSame(frame.y, area.y) && isSame(frame.maxY(), area.maxY()));
+}
+
+Rect shapedInside(const Rect &frame, const Size &ratio)
+{
+    const double width = std::min(frame.width, frame.height * ratio.width / ratio.height);
+    const double height = width * ratio.height / ratio.width;
+    return { frame.x, frame.maxY() - height, width, height };
 }
 
 } // namespace penwick::platform

@@ -18,7 +18,16 @@ namespace penwick::platform {
 /// an edge was pulled outward, it is the smallest that holds `pulled`, so that no such pull makes a
 /// window smaller; otherwise the largest that fits into `pulled`. Of the left and the right edge
 /// the one that was not pulled stays, and the left one if neither or both were; likewise of the top
-/// and the bottom edge, with the top one if neither or both were.
-[[nodiscard]] Rect shapedAfterPull(const Rect &before, const Rect &pulled, const Size &ratio);
+/// and the bottom edge, with the top one if neither or both were. A frame that would be larger than
+/// `area` is brought inside it in its shape.
+[[nodiscard]] Rect shapedAfterPull(
+    const Rect &before, const Rect &pulled, const Size &ratio, const Rect &area);
+
+/// Whether `frame` goes from edge to edge of `area`, one way at least, but for a desktop's border:
+/// as a window that the desktop puts into a half of the screen does.
+[[nodiscard]] bool spans(const Rect &frame, const Rect &area);
+
+/// The largest frame in the shape of `ratio` inside `frame`, in its top left corner.
+[[nodiscard]] Rect shapedInside(const Rect &frame, const Size &ratio);
 
 } // namespace penwick::platform

@@ -7,6 +7,7 @@
 #include "platform/native/NativeDesktop.h"
 #include "platform/window/FrameTracker.h"
 #include "platform/window/ScreenCoordinates.h"
+#include "platform/window/WorkArea.h"
 
 #include <cmath>
 #include <utility>
@@ -86,6 +87,8 @@ void WindowShape::rememberFrame()
 void WindowShape::await(bool isPulled)
 {
     m_isPulled = isPulled;
+    if (!m_rest.at()) // once for each pull: the desktop has to be asked
+        m_isByHand = NativeDesktop::instance().isPointerHeld();
     awaitRest();
 }
 
@@ -98,8 +101,10 @@ void WindowShape::awaitRest()
 // than the one that is seen.
 void WindowShape::rest()
 {
-    if (NativeDesktop::instance().isPointerHeld())
+    if (NativeDesktop::instance().isPointerHeld()) {
+        m_isByHand = true;
         return awaitRest();
+    }
     correct();
     if (!m_isAnswering)
         rememberFrame();
@@ -114,10 +119,22 @@ void WindowShape::correct()
     const bool isChanged = m_before != Rect() && m_before.size() != pulled.size();
     if (hasShape(pulled.size(), ratio) || (m_isPulled && !isChanged))
         return;
-    const double height = heightFor(pulled.width, ratio);
-    m_window.setFrame(m_isPulled ? shapedAfterPull(m_before, pulled, ratio)
-                                 : Rect { pulled.x, pulled.maxY() - height, pulled.width, height });
+    m_window.setFrame(shaped(pulled, ratio));
     m_isAnswering = true;
+}
+
+Rect WindowShape::shaped(const Rect &changed, const Size &ratio) const
+{
+    if (!m_isPulled) {
+        const double height = heightFor(changed.width, ratio);
+        return { changed.x, changed.maxY() - height, changed.width, height };
+    }
+    const Rect area = workAreaFor(changed);
+    // Without a hand at its edges, the desktop has put it into a part of the screen: no pull
+    // outward, though it may have become higher.
+    if (!m_isByHand && spans(changed, area))
+        return shapedInside(changed, ratio);
+    return shapedAfterPull(m_before, changed, ratio, area);
 }
 
 } // namespace penwick::platform

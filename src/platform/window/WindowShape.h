@@ -31,6 +31,7 @@ private:
     void rest();
     void correct();
     void rememberFrame();
+    [[nodiscard]] Rect shaped(const Rect &changed, const Size &ratio) const;
     [[nodiscard]] bool isKept() const;
     [[nodiscard]] bool isArranged() const;
 
@@ -38,6 +39,7 @@ private:
     FrameTracker &m_tracker;
     Rect m_before; // the frame that the user began to pull; empty before the first one
     bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
+    bool m_isByHand = false; // the pointer was held during the pull
     bool m_isAnswering = false; // the desktop has still to answer a correction
     Alarm m_rest { Clock::ofTheUser(), this }; // set while the user may still be pulling
 };
