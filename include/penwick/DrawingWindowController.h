@@ -47,11 +47,13 @@ public:
     /// The controller of the tool bar; null before the window was loaded. Owned.
     [[nodiscard]] const std::shared_ptr<ToolPanelWindowController> &tPanelWindowController() const;
     /// Holds `controller` in place of the former one, which is destroyed unless somebody else holds
-    /// it. The new tool bar is placed and closed together with the drawing window; the caller makes
-    /// its panel a child window.
+    /// it; its panel is then no longer a child window. The new tool bar is placed and closed together
+    /// with the drawing window; the caller makes its panel a child window.
     void setTPanelWindowController(std::shared_ptr<ToolPanelWindowController> controller);
     /// The banner's window; null where it could not be loaded. Owned.
     [[nodiscard]] const std::shared_ptr<platform::Window> &sharingNotificationWindow() const;
+    /// Holds `window` in place of the former one, which is destroyed unless somebody else holds it,
+    /// and is no longer a child window.
     void setSharingNotificationWindow(std::shared_ptr<platform::Window> window);
     /// The kind of window; nothing before the window was placed.
     [[nodiscard]] std::optional<WindowType> mWindowType() const;
@@ -110,6 +112,7 @@ public:
 
 private:
     [[nodiscard]] DrawViewController &content() const;
+    void letGo(platform::Window *former);
     void coverScreen(const QScreen &screen);
     void showBoardBorder();
     void placeAsBoard(const platform::Rect &frame);

@@ -121,6 +121,10 @@ void DrawingWindowController::setTPanelWindowController(
     std::shared_ptr<ToolPanelWindowController> controller)
 {
     platform::requireGuiThread();
+    if (controller == m_tPanelWindowController)
+        return;
+    if (m_tPanelWindowController)
+        letGo(m_tPanelWindowController->toolPanelWindow());
     m_tPanelWindowController = std::move(controller);
 }
 
@@ -133,9 +137,19 @@ const std::shared_ptr<platform::Window> &DrawingWindowController::sharingNotific
 void DrawingWindowController::setSharingNotificationWindow(std::shared_ptr<platform::Window> window)
 {
     platform::requireGuiThread();
+    if (window == m_sharingNotificationWindow)
+        return;
+    letGo(m_sharingNotificationWindow.get());
     m_sharingNotificationWindow = std::move(window);
     if (m_drawingWindow && m_sharingNotificationWindow)
         m_drawingWindow->expectChildWindow(*m_sharingNotificationWindow);
+}
+
+// Somebody else may hold it, and need not be rid of it before another one has its place.
+void DrawingWindowController::letGo(platform::Window *former)
+{
+    if (m_drawingWindow && former)
+        m_drawingWindow->removeChildWindow(*former);
 }
 
 double DrawingWindowController::minWindowWidth() const

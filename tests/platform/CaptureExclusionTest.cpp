@@ -170,6 +170,30 @@ TEST_F(CaptureExclusion, windowThatGoesOrBelongsElsewhereIsToldWhereItWas)
     EXPECT_EQ(list(), Identifiers {});
 }
 
+TEST_F(CaptureExclusion, windowThatIsRemovedIsToldAndStandsByItself)
+{
+    expectAll();
+    show(m_window);
+    m_bar.orderFront();
+    m_told.clear();
+
+    m_window.removeChildWindow(m_banner);
+    EXPECT_EQ(list(), (Identifiers { m_bar.winId(), m_popover.winId() }));
+    EXPECT_EQ(m_told.count(), 1);
+    m_window.removeChildWindow(m_bar);
+    m_window.removeChildWindow(m_popover); // it is the bar's
+
+    EXPECT_EQ(list(), Identifiers {});
+    EXPECT_EQ(m_told.count(), 2);
+    EXPECT_EQ(m_window.childWindows(), std::vector<Window *> {});
+    EXPECT_EQ(m_bar.parentWindow(), nullptr);
+    EXPECT_EQ(m_bar.windowHandle()->transientParent(), nullptr);
+    EXPECT_EQ(
+        m_bar.windowsToLeaveOutOfCaptures(), (Identifiers { m_bar.winId(), m_popover.winId() }));
+    m_window.hide();
+    EXPECT_TRUE(m_bar.isVisible());
+}
+
 TEST_F(CaptureExclusion, listIsTheNewOneInsideTheSlot)
 {
     Identifiers told;

@@ -99,6 +99,34 @@ TEST_P(LeftOutOfCaptures, endOfTheSessionIsNoNewsOfThem)
     EXPECT_EQ(told.count(), 0);
 }
 
+TEST_P(LeftOutOfCaptures, bannerAndToolBarThatAreReplacedAreNotAmongThem)
+{
+    const std::shared_ptr<Window> banner = m_controller->sharingNotificationWindow();
+    const std::shared_ptr<ToolPanelWindowController> toolBar
+        = m_controller->tPanelWindowController();
+    const Window &panel = *toolBar->toolPanelWindow();
+    m_controller->showWindow(nullptr);
+    m_penwick->showWindowSharingNotification();
+
+    m_controller->setSharingNotificationWindow(std::make_shared<Window>());
+    m_controller->setTPanelWindowController(std::make_shared<ToolPanelWindowController>());
+
+    EXPECT_EQ(sorted(), Identifiers {});
+    EXPECT_EQ(window().childWindows(), std::vector<Window *> {});
+    EXPECT_EQ(banner->parentWindow(), nullptr);
+    EXPECT_EQ(panel.parentWindow(), nullptr);
+}
+
+TEST_P(LeftOutOfCaptures, thoseThatAreSetAgainStayAmongThem)
+{
+    const Identifiers before = sorted();
+
+    m_controller->setSharingNotificationWindow(m_controller->sharingNotificationWindow());
+    m_controller->setTPanelWindowController(m_controller->tPanelWindowController());
+
+    EXPECT_EQ(sorted(), before);
+}
+
 TEST_P(LeftOutOfCaptures, noneIsKeptOutByADesktopThatCannot)
 {
     for (const Window *const child : window().childWindows())

@@ -157,6 +157,7 @@ const Operation operations[] {
     OF_WINDOW(showsWhatIsBelow),
     OF_WINDOW(isKeptOutOfCaptures),
     OF_WINDOW(windowsToLeaveOutOfCaptures),
+    { "Window", "removeChildWindow", [](Subject &s) { s.window.removeChildWindow(s.banner); } },
     { "Window", "expectChildWindow", [](Subject &s) { s.window.expectChildWindow(s.banner); } },
     { "Window", "addChildWindow", [](Subject &s) { s.window.addChildWindow(s.banner); } },
     OF_WINDOW(parentWindow),

@@ -108,6 +108,9 @@ public:
     /// resized, and is on the screen only while this one is. Puts it on the screen if it can be
     /// there. A child of this window already is only brought to the front.
     void addChildWindow(Window &child);
+    /// Lets `child`, which was added or expected, stand by itself from now on, where it is: it is
+    /// this window's no longer. Nothing where it is neither.
+    void removeChildWindow(Window &child);
     /// The window whose child this is; null without one.
     [[nodiscard]] Window *parentWindow() const;
     [[nodiscard]] std::vector<Window *> childWindows() const; ///< in the order of adding

@@ -49,15 +49,21 @@ void CaptureExclusion::add(CaptureExclusion &child)
 {
     if (child.m_parent == this)
         return;
-    if (CaptureExclusion *const former = child.m_parent) {
-        std::erase(former->m_children, &child);
-        child.disconnect(former);
-        child.m_parent = nullptr;
-        former->check();
-    }
+    if (CaptureExclusion *const former = child.m_parent)
+        former->remove(child);
     child.m_parent = this;
     m_children.emplace_back(&child);
     connect(&child, &QObject::destroyed, this, &CaptureExclusion::onChildGone);
+    check();
+}
+
+void CaptureExclusion::remove(CaptureExclusion &child)
+{
+    if (child.m_parent != this)
+        return;
+    std::erase(m_children, &child);
+    child.disconnect(this);
+    child.m_parent = nullptr;
     check();
 }
 

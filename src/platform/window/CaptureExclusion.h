@@ -21,6 +21,8 @@ public:
 
     /// Counts `child` and those above it from now on, and no longer where it belonged before.
     void add(CaptureExclusion &child);
+    /// Counts `child` and those above it no longer; nothing where it is not counted here.
+    void remove(CaptureExclusion &child);
     /// The native identifiers of those that are not to be seen, the window itself first; makes the
     /// native windows that are not there yet.
     [[nodiscard]] std::vector<WId> identifiers();

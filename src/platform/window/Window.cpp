@@ -291,6 +291,18 @@ void Window::addChildWindow(Window &child)
         child.orderFront();
 }
 
+void Window::removeChildWindow(Window &child)
+{
+    requireGuiThread();
+    d->captures.remove(child.d->captures);
+    if (child.parentWindow() != this)
+        return;
+    d->family.remove(child);
+    child.d->family.setParent(nullptr);
+    if (child.windowHandle())
+        child.windowHandle()->setTransientParent(nullptr);
+}
+
 Window *Window::parentWindow() const
 {
     requireGuiThread();
