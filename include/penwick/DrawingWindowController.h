@@ -47,8 +47,8 @@ public:
     /// The controller of the tool bar; null before the window was loaded. Owned.
     [[nodiscard]] const std::shared_ptr<ToolPanelWindowController> &tPanelWindowController() const;
     /// Holds `controller` in place of the former one, which is destroyed unless somebody else holds
-    /// it; its panel is then no longer a child window. The new tool bar is placed and closed together
-    /// with the drawing window; the caller makes its panel a child window.
+    /// it; its panel is then no longer a child window. The new tool bar is placed and closed
+    /// together with the drawing window; the caller makes its panel a child window.
     void setTPanelWindowController(std::shared_ptr<ToolPanelWindowController> controller);
     /// The banner's window; null where it could not be loaded. Owned.
     [[nodiscard]] const std::shared_ptr<platform::Window> &sharingNotificationWindow() const;

@@ -33,8 +33,9 @@ PictureFit::PictureFit(platform::Window &window, platform::ImageView &view)
 
 bool PictureFit::eventFilter(QObject *watched, QEvent *event)
 {
-    // Where the desktop tells the borders beforehand, this comes before the first paint.
-    if (event->type() == QEvent::Resize)
+    // Before the first paint, where the desktop tells the borders beforehand. Later on it may be
+    // the user who resizes the window.
+    if (event->type() == QEvent::Resize && !m_settled)
         fit();
     return QObject::eventFilter(watched, event);
 }
