@@ -48,7 +48,7 @@ void DrawingWindowController::placeToolBar()
     platform::WindowAttributes attributes = panel->attributes();
     attributes.hasShadow = true;
     panel->setAttributes(attributes);
-    m_tPanelWindowController->keepEndInReach();
+    m_tPanelWindowController->takeItsPlace();
     m_tPanelWindowController->showWindow(this);
 }
 

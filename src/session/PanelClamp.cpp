@@ -34,9 +34,7 @@ platform::Rect reachablePanel(
 {
     if (panel.height <= parent.height - titleBar - 2 * margin)
         return panel;
-    platform::Rect reachable = panel;
-    reachable.y = platform::broughtInside(panel, workArea, platform::KeptEdge::Bottom).y;
-    return reachable;
+    return platform::broughtInside(panel, workArea, platform::KeptEdge::Bottom);
 }
 
 } // namespace penwick

@@ -11,10 +11,9 @@ namespace penwick {
 [[nodiscard]] platform::Rect clampedPanel(
     const platform::Rect &panel, const platform::Rect &parent);
 
-/// `panel` as it is, if `parent` is high enough for it. Otherwise it is moved up or down into
-/// `workArea`; if that is not high enough either, its lower end, which has the button that ends the
-/// session, lies inside. It is never moved sideways, because it would leave its place in the parent
-/// while that is on its way to another screen.
+/// `panel` as it is, if `parent` is high enough for it. Otherwise it is moved into `workArea`; if
+/// that is not high enough either, its lower end, which has the button that ends the session, lies
+/// inside.
 [[nodiscard]] platform::Rect reachablePanel(
     const platform::Rect &panel, const platform::Rect &parent, const platform::Rect &workArea);
 

@@ -18,9 +18,12 @@ constexpr int settleTime = 200; // ms, between letting go of the panel and pulli
 constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
 constexpr int hiddenTitle = 1;
 
-platform::Rect reachableBeside(const platform::Window &parent, const platform::Rect &panel)
+// The work area of the screen that the panel stands on, or at least its parent.
+platform::Rect reachableBeside(const platform::Rect &parent, const platform::Rect &panel)
 {
-    return reachablePanel(panel, parent.frame(), platform::workAreaFor(panel));
+    const platform::Rect area = platform::workAreaFor(panel);
+    return reachablePanel(
+        panel, parent, panel.intersects(area) ? area : platform::workAreaFor(parent));
 }
 
 } // namespace
@@ -63,28 +66,46 @@ void ToolPanelWindowController::windowDidLoad()
 
 void ToolPanelWindowController::adjustPosition()
 {
-    if (!m_toolPanelWindow)
+    if (!m_toolPanelWindow || !m_toolPanelWindow->parentWindow())
         return;
-    const platform::Window *const parent = m_toolPanelWindow->parentWindow();
-    if (parent) {
-        const platform::Rect clamped = clampedPanel(m_toolPanelWindow->frame(), parent->frame());
-        m_toolPanelWindow->setFrame(reachableBeside(*parent, clamped), platform::Animate::Yes);
-    }
+    const platform::Rect parent = m_toolPanelWindow->parentWindow()->frame();
+    m_toolPanelWindow->setFrame(
+        inReachFrom(clampedPanel(ownPlace(), parent), parent), platform::Animate::Yes);
 }
 
 void ToolPanelWindowController::keepEndInReach()
 {
-    if (!m_toolPanelWindow)
+    if (!m_toolPanelWindow || !m_toolPanelWindow->parentWindow())
         return;
-    const platform::Window *const parent = m_toolPanelWindow->parentWindow();
-    const platform::Rect frame = m_toolPanelWindow->frame();
-    const platform::Rect reachable = parent ? reachableBeside(*parent, frame) : frame;
-    if (!(reachable == frame))
+    const platform::Rect parent = m_toolPanelWindow->parentWindow()->frame();
+    const platform::Rect reachable = inReachFrom(ownPlace(), parent);
+    if (!(reachable == m_toolPanelWindow->frame()))
         m_toolPanelWindow->setFrame(reachable);
+}
+
+void ToolPanelWindowController::takeItsPlace()
+{
+    m_displacement = {};
+    keepEndInReach();
+}
+
+platform::Rect ToolPanelWindowController::ownPlace() const
+{
+    const platform::Rect frame = m_toolPanelWindow->frame();
+    return { frame.x - m_displacement.x, frame.y - m_displacement.y, frame.width, frame.height };
+}
+
+platform::Rect ToolPanelWindowController::inReachFrom(
+    const platform::Rect &place, const platform::Rect &parent)
+{
+    const platform::Rect reachable = reachableBeside(parent, place);
+    m_displacement = reachable.origin() - place.origin();
+    return reachable;
 }
 
 void ToolPanelWindowController::mouseDown()
 {
+    m_displacement = {}; // wherever it is dragged from here is its own place
     ToolPanelViewController &bar = content();
     require(bar.popoverW(), "the tool bar has no popover window");
     bar.hidePopover();

@@ -48,13 +48,20 @@ public:
     /// Glides the panel into its parent's frame; does nothing without a parent.
     void adjustPosition();
     /// Moves a panel that is higher than its parent has room for so that its lower end, which ends
-    /// the session, is on the screen; at once.
+    /// the session, is on the screen; at once. It comes back to its own place as its parent does.
     void keepEndInReach();
+    /// The same for a panel that was put where it stands: that is its own place from now on.
+    void takeItsPlace();
     void mouseDown() override;
     void mouseUp() override;
 
 private:
+    [[nodiscard]] platform::Rect ownPlace() const;
+    [[nodiscard]] platform::Rect inReachFrom(
+        const platform::Rect &place, const platform::Rect &parent);
+
     QPointer<ToolBarPanelWindow> m_toolPanelWindow;
+    platform::Point m_displacement; // from its own place, so that its end is in reach
     std::shared_ptr<platform::Window> m_popoverWindow;
 };
 

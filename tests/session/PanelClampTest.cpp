@@ -86,9 +86,10 @@ TEST_F(ReachablePanel, thatIsHigherThanItsParentHasRoomForComesUp)
     EXPECT_EQ(shown({ 200, -1, 60, 400 }, { 100, 100, 480, 270 }), (Rect { 200, 0, 60, 400 }));
 }
 
-TEST_F(ReachablePanel, comesDownAndStaysBesideItsParent)
+TEST_F(ReachablePanel, comesDownAndInFromTheSides)
 {
-    EXPECT_EQ(shown({ 1260, 500, 60, 400 }, { 900, 600, 480, 270 }), (Rect { 1260, 400, 60, 400 }));
+    EXPECT_EQ(shown({ 1260, 500, 60, 400 }, { 900, 600, 480, 270 }), (Rect { 1220, 400, 60, 400 }));
+    EXPECT_EQ(shown({ -70, 100, 60, 400 }, { -90, 100, 480, 270 }), (Rect { 0, 100, 60, 400 }));
 }
 
 TEST_F(ReachablePanel, insideTheScreenStaysWhereItIs)

@@ -18,7 +18,6 @@ namespace penwick {
 
 namespace {
 
-using platform::Point;
 using platform::Rect;
 using platform::Window;
 
@@ -176,51 +175,6 @@ TEST_F(ToolPanelWindow, insideItsParentStays)
     m_controller.adjustPosition();
 
     EXPECT_EQ(m_panel.frame(), (Rect { 700, 400, 52, 352 }));
-}
-
-// The screen is 1920 x 1080 and the panel 352 high.
-
-TEST_F(ToolPanelWindow, ofASmallBoardKeepsItsEndOnTheScreenWhereverTheBoardIsTaken)
-{
-    show();
-    m_board->window()->setFrame({ 600, 40, 320, 180 });
-    QCoreApplication::processEvents();
-    m_controller.adjustPosition(); // its upper edge below the board's title bar
-    EXPECT_EQ(m_panel.frame().y, 0);
-    EXPECT_TRUE(QTest::qWaitFor([this] { return m_panel.y() == 1080 - 352; }));
-
-    m_board->window()->setFrameOrigin({ 600, 500 });
-    QCoreApplication::processEvents();
-    EXPECT_EQ(m_panel.frame().y, 460);
-
-    m_board->window()->setFrameOrigin({ 600, 10 });
-    QCoreApplication::processEvents();
-    EXPECT_EQ(m_panel.frame().y, 0);
-}
-
-TEST_F(ToolPanelWindow, ofASmallPictureStandsOnTheScreenFromTheStart)
-{
-    QImage image(480, 60, QImage::Format_RGB32);
-    image.fill(Qt::gray);
-
-    m_board
-        = m_penwick.createDrawingWindowController(WindowType::imageAnnotation, secondary(), image);
-
-    // Centred beside the picture it would stand at 280 + 30 - 176; the screen begins at 160.
-    EXPECT_EQ(m_board->window()->frame(), (Rect { 1920 + 1280.0 / 6, 280, 480, 60 }));
-    EXPECT_EQ(m_board->tPanelWindowController()->toolPanelWindow()->frame().y, 160);
-}
-
-TEST_F(ToolPanelWindow, thatFitsItsBoardLeavesTheScreenWithIt)
-{
-    show();
-    const Rect before = m_panel.frame();
-    m_board->window()->setFrameOrigin({ 320, -400 });
-    QCoreApplication::processEvents();
-
-    m_controller.adjustPosition();
-
-    EXPECT_EQ(m_panel.frame().y, before.y - 580);
 }
 
 TEST_F(ToolPanelWindow, withoutAParentIsNeverMoved)

@@ -161,7 +161,7 @@ void PlainBoard::pressPanel()
 {
     pressBar();
     hidePopover();
-    m_frames.pullPanelIn();
+    m_frames.letPanelGo();
 }
 
 void PlainBoard::showPopover(const std::string &kind)

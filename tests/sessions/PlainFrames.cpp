@@ -33,10 +33,28 @@ PlainFrame noLargerThanTheScreen(PlainFrame frame)
 
 } // namespace
 
+bool PlainFrames::isPanelTall() const
+{
+    return panel.height > board.height - 28;
+}
+
+// As it was placed, if it was not moved since.
+PlainFrame &PlainFrames::ownPlace()
+{
+    if (!m_ownPlace) {
+        m_ownPlace = panel;
+        if (isPanelTall()) {
+            m_ownPlace->x = board.x + 20;
+            m_ownPlace->y = board.y + (board.height - panel.height) / 2;
+        }
+    }
+    return *m_ownPlace;
+}
+
 void PlainFrames::shiftPanel(double x, double y)
 {
-    panel.x += x;
-    panel.y += y;
+    ownPlace().x += x;
+    ownPlace().y += y;
 }
 
 bool PlainFrames::isAt(const PlainFrame &frame) const
@@ -51,7 +69,7 @@ void PlainFrames::moveTo(const PlainFrame &frame)
     shiftPanel(std::round(frame.x) - std::round(board.x),
         std::round(screenHeight - board.top()) - std::round(screenHeight - frame.top()));
     board = frame;
-    bringPanelUp();
+    showPanel();
 }
 
 void PlainFrames::comeUpAt(const PlainFrame &frame)
@@ -65,11 +83,11 @@ void PlainFrames::comeUpAt(const PlainFrame &frame)
     if (scale == 1.0) {
         shiftPanel(inside.x - board.x, inside.y - board.y);
     } else { // placed as if it were new
-        panel.x = inside.x + 20;
-        panel.y = inside.y + (inside.height - panel.height) / 2;
+        ownPlace().x = inside.x + 20;
+        ownPlace().y = inside.y + (inside.height - panel.height) / 2;
     }
     board = inside;
-    bringPanelUp();
+    showPanel();
 }
 
 void PlainFrames::resizeTo(const PlainFrame &frame)
@@ -122,23 +140,32 @@ PlainFrame PlainFrames::reshaped() const
     return noLargerThanTheScreen(frame);
 }
 
-void PlainFrames::pullPanelIn()
+void PlainFrames::letPanelGo()
 {
-    if (panel.x < board.x + 3)
-        panel.x = board.x + 23;
-    if (panel.y < board.y + 3)
-        panel.y = board.y + 3;
-    if (panel.top() > board.top() - 25)
-        panel.y = board.top() - 25 - panel.height;
-    if (panel.x + panel.width > board.x + board.width - 3)
-        panel.x = board.x + board.width - 3 - panel.width;
-    bringPanelUp();
+    m_ownPlace = panel;
+    pullPanelIn();
 }
 
-void PlainFrames::bringPanelUp()
+void PlainFrames::pullPanelIn()
 {
-    if (panel.height <= board.height - 28)
+    PlainFrame &own = ownPlace();
+    if (own.x < board.x + 3)
+        own.x = board.x + 23;
+    if (own.y < board.y + 3)
+        own.y = board.y + 3;
+    if (own.top() > board.top() - 25)
+        own.y = board.top() - 25 - own.height;
+    if (own.x + own.width > board.x + board.width - 3)
+        own.x = board.x + board.width - 3 - own.width;
+    showPanel();
+}
+
+void PlainFrames::showPanel()
+{
+    panel = ownPlace();
+    if (!isPanelTall())
         return;
+    panel.x = std::clamp(panel.x, 0.0, screenWidth - panel.width);
     panel.y = std::clamp(panel.y, 0.0, screenHeight - panel.height);
 }
 

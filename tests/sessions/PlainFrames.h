@@ -35,15 +35,19 @@ public:
     /// The desktop has granted `frame` for what was asked: 16:9 after its edges were pulled, so
     /// that no pull outward makes it smaller.
     void restAt(const PlainFrame &frame);
-    void pullPanelIn(); ///< into the drawing window
+    void letPanelGo(); ///< where the user has dragged it; it is pulled into the drawing window
 
     [[nodiscard]] std::string inWords() const;
 
 private:
     void shiftPanel(double x, double y);
-    void bringPanelUp(); ///< of a board that has no room for it
+    void pullPanelIn();
+    void showPanel(); ///< of a board that has no room for it, where all of it is seen
+    [[nodiscard]] bool isPanelTall() const;
+    [[nodiscard]] PlainFrame &ownPlace();
     [[nodiscard]] PlainFrame reshaped() const;
 
+    std::optional<PlainFrame> m_ownPlace; // the panel's, to which it comes back with its board
     std::optional<PlainFrame> m_unpulled; // the drawing window before the user took hold of an edge
 };
 
