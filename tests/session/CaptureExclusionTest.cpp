@@ -117,6 +117,16 @@ TEST_P(LeftOutOfCaptures, bannerAndToolBarThatAreReplacedAreNotAmongThem)
     EXPECT_EQ(panel.parentWindow(), nullptr);
 }
 
+TEST_P(LeftOutOfCaptures, bannerThatIsSetIsAmongThemBeforeItIsShown)
+{
+    const auto banner = std::make_shared<Window>();
+    m_controller->setNotificationWindowProperties(*banner);
+
+    m_controller->setSharingNotificationWindow(banner);
+
+    EXPECT_EQ(sorted(), barPopoverAndBanner());
+}
+
 TEST_P(LeftOutOfCaptures, thoseThatAreSetAgainStayAmongThem)
 {
     const Identifiers before = sorted();
