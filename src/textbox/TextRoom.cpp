@@ -21,12 +21,36 @@ int lineEndsIn(QStringView text)
     return static_cast<int>(std::count_if(text.begin(), text.end(), isLineEnd));
 }
 
+// The first character, which is two units long beyond the basic plane.
+QStringView firstOf(QStringView text)
+{
+    const bool isPair
+        = text.size() > 1 && text.front().isHighSurrogate() && text.at(1).isLowSurrogate();
+    return text.first(isPair ? 2 : 1);
+}
+
+QStringView lastOf(QStringView text)
+{
+    const bool isPair = text.size() > 1 && text.back().isLowSurrogate()
+        && text.at(text.size() - 2).isHighSurrogate();
+    return text.last(isPair ? 2 : 1);
+}
+
+bool isMark(QStringView character)
+{
+    return character.size() > 1
+        ? QChar::isMark(QChar::surrogateToUcs4(character.front(), character.back()))
+        : character.front().isMark();
+}
+
 int marksAround(QStringView before, QStringView after)
 {
-    const auto isLetter = [](QChar letter) { return !letter.isMark(); };
-    const auto ahead = std::find_if(before.rbegin(), before.rend(), isLetter);
-    const auto behind = std::find_if(after.begin(), after.end(), isLetter);
-    return static_cast<int>((ahead - before.rbegin()) + (behind - after.begin()));
+    int marks = 0;
+    for (; !before.isEmpty() && isMark(lastOf(before)); ++marks)
+        before.chop(lastOf(before).size());
+    for (; !after.isEmpty() && isMark(firstOf(after)); ++marks)
+        after = after.sliced(firstOf(after).size());
+    return marks;
 }
 
 } // namespace
@@ -48,20 +72,21 @@ QString fittingPart(const QString &text, const TextRoom &room)
     QString taken;
     int lineEnds = 0;
     int marks = mostMarks - room.marks;
-    for (qsizetype place = 0; place < text.size() && taken.size() < room.characters; ++place) {
-        const QChar letter = text.at(place);
+    for (qsizetype place = 0; place < text.size();) {
+        const QStringView character = firstOf(QStringView(text).sliced(place));
+        if (taken.size() + character.size() > room.characters)
+            break;
+        const QChar letter = character.front();
         const bool isSecondHalf = letter == u'\n' && place > 0 && text.at(place - 1) == u'\r';
         if (isLineEnd(letter) && !isSecondHalf && ++lineEnds > room.lineEnds)
             break;
-        marks = letter.isMark() ? marks + 1 : 0;
+        marks = isMark(character) ? marks + 1 : 0;
         if (marks <= mostMarks)
-            taken += letter;
+            taken += character;
         else if (place - taken.size() > mostCharacters)
             break; // so many marks in a row that the rest is not worth reading
+        place += character.size();
     }
-    const bool isCut = taken.size() < text.size();
-    if (isCut && !taken.isEmpty() && taken.back().isHighSurrogate())
-        taken.chop(1); // the first half of a character whose second half was cut off
     return taken;
 }
 

@@ -123,6 +123,44 @@ TEST(TextRoom, marksThatAreTooManyAreLeftOutAndTheRestGoesIn)
     EXPECT_EQ(fittingPart(accent, { 100, 0, 0 }), QString());
 }
 
+TEST(TextRoom, marksBeyondTheBasicPlaneCountAsOneEach)
+{
+    const QString stem = QStringLiteral("\U0001D165"); // of a note
+    const QString letter = QStringLiteral("e");
+
+    EXPECT_EQ(fittingPart(letter + times(64, stem), {}), letter + times(64, stem));
+    EXPECT_EQ(
+        fittingPart(letter + times(65, stem) + letter, {}), letter + times(64, stem) + letter);
+    EXPECT_EQ(roomBehind(letter + times(3, stem) + times(2, accent)).marks, 59);
+    QTextDocument document;
+    document.setPlainText(letter + times(5, stem));
+    QTextCursor cursor(&document);
+    cursor.setPosition(1 + 4);
+    EXPECT_EQ(roomAt(cursor).marks, 59) << "on both sides";
+}
+
+TEST(TextRoom, marksAtTheBeginningOfATextAreCounted)
+{
+    QTextDocument document;
+    document.setPlainText(times(3, accent));
+
+    EXPECT_EQ(roomAt(QTextCursor(&document)).marks, 61);
+}
+
+TEST(TextRoom, onlyTheSecondHalfOfAPairOfCharactersEndsNoLineOfItsOwn)
+{
+    EXPECT_EQ(fittingPart(QStringLiteral("\na"), { 9, 0, 64 }), QString());
+    EXPECT_EQ(fittingPart(QStringLiteral("\r\na"), { 9, 1, 64 }), QStringLiteral("\r\na"));
+    EXPECT_EQ(fittingPart(QStringLiteral("\n\na"), { 9, 1, 64 }), QStringLiteral("\n"));
+    EXPECT_EQ(fittingPart(QStringLiteral("\ra\nb"), { 9, 1, 64 }), QStringLiteral("\ra"));
+    EXPECT_EQ(fittingPart(QStringLiteral("\r\rb"), { 9, 1, 64 }), QStringLiteral("\r"));
+}
+
+TEST(TextRoom, newRoomIsThatOfAnEmptyText)
+{
+    EXPECT_EQ(TextRoom(), (TextRoom { 2500, 249, 64 }));
+}
+
 TEST(TextRoom, millionsOfMarksEndTheSearchForMore)
 {
     const QString text = QStringLiteral("e") + times(1'000'000, accent) + QStringLiteral("e");
