@@ -73,6 +73,12 @@ TEST_F(DeleteTextBoxButtonTest, isHiddenAtFirstAndHasBothImages)
     EXPECT_NE(artwork(m_normal), artwork(m_hover));
 }
 
+TEST_F(DeleteTextBoxButtonTest, saysWhatItDoes)
+{
+    EXPECT_EQ(m_button->accessibleName(), QStringLiteral("Delete text"));
+    EXPECT_EQ(m_button->toolTip(), QStringLiteral("Delete text"));
+}
+
 TEST_F(DeleteTextBoxButtonTest, showsTheHoverImageWhileThePointerIsOverItAndTheArrow)
 {
     enter();

@@ -2,6 +2,7 @@
 // The insertion point of an editor.
 #include "textbox/TextCaret.h"
 
+#include <QAbstractEventDispatcher>
 #include <QApplication>
 #include <QImage>
 #include <QPainter>
@@ -10,9 +11,25 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
 namespace penwick {
 
 namespace {
+
+class PaintCounter final : public QObject
+{
+public:
+    explicit PaintCounter(QWidget &widget) { widget.installEventFilter(this); }
+
+    bool eventFilter(QObject * /*watched*/, QEvent *event) override
+    {
+        count += event->type() == QEvent::Paint ? 1 : 0;
+        return false;
+    }
+
+    int count = 0;
+};
 
 /// An editor with "Hello" in it and a red caret before it; the caret does not blink.
 class TextCaretTest : public testing::Test
@@ -44,6 +61,15 @@ protected:
             }
         }
         return area;
+    }
+
+    /// Of the timers that run for it, in milliseconds.
+    [[nodiscard]] QList<int> intervals()
+    {
+        QList<int> found;
+        for (const auto &timer : QAbstractEventDispatcher::instance()->registeredTimers(&m_caret))
+            found.append(timer.interval);
+        return found;
     }
 
     QTextEdit m_editor;
@@ -94,6 +120,56 @@ TEST_F(TextCaretTest, blinksAtTheDesktopsPaceAndIsSolidAgainAfterAKey)
     EXPECT_FALSE(painted().isNull());
     EXPECT_TRUE(QTest::qWaitFor([this] { return painted().isNull(); }));
     EXPECT_TRUE(QTest::qWaitFor([this] { return !painted().isNull(); }));
+}
+
+TEST_F(TextCaretTest, timeOnlyRunsWhileABlinkingOneIsShown)
+{
+    QApplication::setCursorFlashTime(1000);
+    m_caret.restart();
+    EXPECT_EQ(intervals(), QList<int> {}) << "it is not shown";
+
+    m_caret.show();
+    EXPECT_EQ(intervals(), QList<int> { 500 });
+
+    m_caret.hide();
+    EXPECT_EQ(intervals(), QList<int> {});
+    m_caret.restart();
+    EXPECT_EQ(intervals(), QList<int> {});
+    m_caret.show();
+    QApplication::setCursorFlashTime(0); // steady from now on
+    m_caret.restart();
+    EXPECT_EQ(intervals(), QList<int> {});
+}
+
+TEST_F(TextCaretTest, timeOfSomethingElseIsNotItsOwn)
+{
+    QApplication::setCursorFlashTime(1000);
+    m_caret.show();
+    QTimerEvent other(0);
+
+    QCoreApplication::sendEvent(&m_caret, &other);
+
+    EXPECT_FALSE(painted().isNull());
+}
+
+TEST_F(TextCaretTest, editorIsPaintedAgainForEachChange)
+{
+    m_editor.show();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&m_editor));
+    PaintCounter paints(*m_editor.viewport());
+    const auto isPaintedAfter = [&paints](const std::function<void()> &change) {
+        QCoreApplication::processEvents();
+        paints.count = 0;
+        change();
+        return QTest::qWaitFor([&paints] { return paints.count > 0; });
+    };
+
+    EXPECT_TRUE(isPaintedAfter([this] { m_caret.show(); }));
+    EXPECT_TRUE(isPaintedAfter([this] { m_caret.restart(); }));
+    EXPECT_TRUE(isPaintedAfter([this] { m_caret.hide(); }));
+    QApplication::setCursorFlashTime(20);
+    m_caret.show();
+    EXPECT_TRUE(isPaintedAfter([] {})) << "it blinks";
 }
 
 } // namespace penwick
