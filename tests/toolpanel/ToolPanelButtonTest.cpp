@@ -113,6 +113,18 @@ TEST_F(ToolPanelButtonTest, imagesAreTheScenes)
     EXPECT_EQ(m_button.buttonAltImage().cacheKey(), m_button.alternateImage().cacheKey());
 }
 
+TEST_F(ToolPanelButtonTest, imagesAreSet)
+{
+    const QIcon one(QPixmap(1, 1));
+    const QIcon other(QPixmap(2, 2));
+
+    m_button.setButtonImage(one);
+    m_button.setButtonAltImage(other);
+
+    EXPECT_EQ(m_button.buttonImage().cacheKey(), one.cacheKey());
+    EXPECT_EQ(m_button.buttonAltImage().cacheKey(), other.cacheKey());
+}
+
 TEST_F(ToolPanelButtonTest, pointerShowsTheHoverLookAndTakesItAlong)
 {
     enter();

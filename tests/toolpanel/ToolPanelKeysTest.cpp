@@ -106,6 +106,32 @@ TEST_F(ToolPanelKeys, digitsRestInAnOpenPopoverTooAndEscapeClosesIt)
     EXPECT_FALSE(isPopoverShown());
 }
 
+TEST_F(ToolPanelKeys, answerWhetherTheyWereTaken)
+{
+    const auto isTaken = [this](Qt::Key key, bool isRepeated = false) {
+        return bar.performKey(
+            QKeyEvent(QEvent::KeyPress, key, Qt::NoModifier, QString(), isRepeated));
+    };
+    EXPECT_TRUE(isTaken(Qt::Key_E));
+    EXPECT_FALSE(isTaken(Qt::Key_E, true));
+    EXPECT_FALSE(isTaken(Qt::Key_Escape)) << "nothing is open";
+    EXPECT_FALSE(isTaken(Qt::Key_4));
+
+    press("brush");
+    press("brush");
+    ASSERT_TRUE(isPopoverShown());
+    const auto count = static_cast<int>(
+        bar.popoverVc()->brushPopoverView()->subviews().at(0)->subviews().size());
+    ASSERT_LT(count, 9);
+    EXPECT_FALSE(isTaken(static_cast<Qt::Key>(Qt::Key_1 + count))) << "there is none";
+    ASSERT_TRUE(isPopoverShown());
+    EXPECT_TRUE(isTaken(static_cast<Qt::Key>(Qt::Key_1 + count - 1)));
+    press("color");
+    ASSERT_TRUE(isPopoverShown());
+    EXPECT_TRUE(isTaken(Qt::Key_Escape));
+    EXPECT_FALSE(isPopoverShown());
+}
+
 TEST_F(ToolPanelKeys, pressOnTheBoardWakesThem)
 {
     writeAt({ 250, 100 });
