@@ -6,6 +6,7 @@
 #include "canvas/ToolSelectionDelegate.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/view/ViewHost.h"
+#include "textbox/TextBoxPlace.h"
 #include "textbox/TnTextBox.h"
 
 #include <QGuiApplication>
@@ -275,6 +276,8 @@ void DrawingCanvasView::placeTextBox(Point point)
         platform::fatalError("a new text box has not reached the canvas");
     const auto box = m_textBoxArray.last().textBox;
     addSubview(box);
+    if (!isOver(point)) // pressed here and let go elsewhere: who writes in it wants to see where
+        box->setFrame(frameInReach(box->frame(), bounds().size()));
     ownWindow->makeFirstResponder(box.get());
 }
 

@@ -173,6 +173,18 @@ TEST_F(DrawingCanvasViewToolsTest, textClickThatTremblesWhileABoxIsEditedOnlyEnd
     EXPECT_EQ(window.firstResponder(), canvas);
 }
 
+TEST_F(DrawingCanvasViewToolsTest, boxOfAReleaseBesideTheCanvasStandsWhereItIsSeen)
+{
+    canvas->setCurrentSelectedTool(QStringLiteral("text"));
+    window.makeFirstResponder(canvas);
+
+    press({ 250, 20 });
+    release({ 340, -60 });
+
+    ASSERT_EQ(model().textBoxArray().size(), 1);
+    EXPECT_EQ(model().textBoxArray().last().textBox->frame(), (Rect { 280, -10, 200, 30 }));
+}
+
 TEST_F(DrawingCanvasViewToolsTest, textDragEndsTheEditingAndItsReleasePlacesABox)
 {
     canvas->setCurrentSelectedTool(text);

@@ -87,6 +87,8 @@ void PlainCanvas::placeBox(Spot spot)
     PlainBox &box = allBoxes[name];
     box.x = spot.x;
     box.top = spot.y - 24 + 30;
+    if (spot.x < 0 || spot.x >= m_size.x || spot.y < 0 || spot.y > m_size.y)
+        bringIntoReach(box);
     copyContent();
     putOn(name);
     makeFirstResponder(name);
