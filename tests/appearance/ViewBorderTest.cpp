@@ -15,7 +15,7 @@ namespace penwick {
 namespace {
 
 /// Any view; counts how often it is painted.
-class PlainView final : public platform::ViewOf<QWidget>
+class CountingView final : public platform::ViewOf<QWidget>
 {
 public:
     int paints = 0;
@@ -32,7 +32,7 @@ protected:
 
 TEST(ViewBorder, layerTakesColourWidthAndRadius)
 {
-    PlainView view;
+    CountingView view;
     view.setWantsLayer(true);
 
     setViewBorder(view, TnhColors::borderGreenColor, 3.0, 1.5);
@@ -45,7 +45,7 @@ TEST(ViewBorder, layerTakesColourWidthAndRadius)
 
 TEST(ViewBorder, borderIsShownAtOnce)
 {
-    PlainView view;
+    CountingView view;
     view.setWantsLayer(true);
     view.show();
     ASSERT_TRUE(QTest::qWaitFor([&view] { return view.paints > 0; }));
@@ -59,7 +59,7 @@ TEST(ViewBorder, borderIsShownAtOnce)
 
 TEST(ViewBorder, viewWithoutALayerStaysAsItIs)
 {
-    PlainView view;
+    CountingView view;
 
     setViewBorder(view, TnhColors::borderGreenColor, 3.0, 1.5);
 

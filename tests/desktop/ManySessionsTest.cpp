@@ -33,7 +33,7 @@ TEST_P(ManySessions, leaveNothingBehind)
     std::vector<std::string> environment = desktop.environment();
     environment.emplace_back("QT_QPA_PLATFORM=xcb");
 
-    ChildProcess sessions({ { PENWICK_SESSIONS_PROGRAM, "81" }, environment, errors });
+    ChildProcess sessions({ { PENWICK_LEFTOVERS_PROGRAM, "81" }, environment, errors });
     require([&] { return sessions.exitStatus().has_value(); }, "the sessions to end", bound);
 
     EXPECT_EQ(sessions.exitStatus(), 0);

@@ -4,7 +4,7 @@
 #include <QCoreApplication>
 #include <QMouseEvent>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 void Hand::press(QWidget &widget, QPointF place)
 {
@@ -44,4 +44,4 @@ void Hand::send(QEvent::Type type)
     QCoreApplication::sendEvent(m_pressed, &event);
 }
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

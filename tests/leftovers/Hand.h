@@ -7,7 +7,7 @@
 #include <QPointer>
 #include <QWidget>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 /// Presses a widget and goes on with that press. The widget may go in the middle of it; what the
 /// hand does then reaches nobody.
@@ -28,4 +28,4 @@ private:
     QPointF m_place; // on the screen
 };
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

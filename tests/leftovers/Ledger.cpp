@@ -11,7 +11,7 @@
 
 #include <X11/Xlib.h>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 namespace {
 
@@ -92,4 +92,4 @@ void countMemoryExactly(char **arguments)
     execv("/proc/self/exe", arguments); // goes on as it is where there is no such file
 }
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

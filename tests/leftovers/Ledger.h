@@ -7,7 +7,7 @@
 
 #include <cstddef>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 /// The windows, widgets and timers of the process, and the memory it has asked for.
 struct Ledger
@@ -32,4 +32,4 @@ struct Ledger
 /// Makes the allocator count exactly: starts the program anew if it has to, with `arguments`.
 void countMemoryExactly(char **arguments);
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

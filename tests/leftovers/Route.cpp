@@ -5,7 +5,7 @@
 #include <cstddef>
 #include <cstdio>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 namespace {
 
@@ -52,4 +52,4 @@ void sayRoutes(const std::vector<int> &taken)
     std::putchar('\n');
 }
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

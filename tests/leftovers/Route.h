@@ -4,7 +4,7 @@
 
 #include <vector>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 /// What is under way when a session ends.
 enum class Moment
@@ -39,4 +39,4 @@ struct Route
 /// Writes to standard output, as a table, how often each of allRoutes() was taken.
 void sayRoutes(const std::vector<int> &taken);
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

@@ -18,7 +18,7 @@
 #include <ctime>
 #include <functional>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 namespace {
 
@@ -80,7 +80,7 @@ QWidget &toolButton(const char *name)
 // Writes `what` about session `number` to standard error. Always returns false.
 bool complain(int number, const char *what)
 {
-    std::fprintf(stderr, "penwick-sessions: session %d: %s\n", number, what);
+    std::fprintf(stderr, "penwick-leftovers: session %d: %s\n", number, what);
     return false;
 }
 
@@ -303,4 +303,4 @@ void Sessions::end(End how)
     }
 }
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

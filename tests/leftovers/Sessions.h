@@ -12,7 +12,7 @@
 #include <memory>
 #include <vector>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 /// Opens the kinds of drawing windows in turn, uses them, and ends them by each route in turn. GUI
 /// thread only.
@@ -69,4 +69,4 @@ private:
     std::vector<int> m_taken;
 };
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

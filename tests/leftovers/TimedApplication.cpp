@@ -6,7 +6,7 @@
 
 #include <utility>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 bool TimedApplication::notify(QObject *receiver, QEvent *event)
 {
@@ -33,4 +33,4 @@ TimedApplication::Block TimedApplication::takeLongestBlock()
     return std::exchange(m_longest, {});
 }
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

@@ -6,7 +6,7 @@
 
 #include <chrono>
 
-namespace penwick::leftovers {
+namespace penwick::test {
 
 /// Times every event that is not delivered inside another one.
 class TimedApplication final : public QApplication
@@ -29,4 +29,4 @@ private:
     int m_depth = 0;
 };
 
-} // namespace penwick::leftovers
+} // namespace penwick::test

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// penwick-sessions [COUNT]: opens, uses and ends COUNT sessions, 100 by default, in one process,
+// penwick-leftovers [COUNT]: opens, uses and ends COUNT sessions, 100 by default, in one process,
 // and says what they cost. Its status is 0 if none of them left anything behind, else 1.
 #include "leftovers/Ledger.h"
 #include "leftovers/Sessions.h"
@@ -13,7 +13,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-using namespace penwick::leftovers;
+using namespace penwick::test;
 using penwick::WindowType;
 using penwick::platform::NotificationCenter;
 
@@ -94,7 +94,7 @@ int main(int argumentCount, char **arguments)
 {
     const int count = argumentCount > 1 ? std::atoi(arguments[1]) : 100;
     if (count <= 0 || argumentCount > 2) {
-        std::fputs("Usage: penwick-sessions [COUNT]\n", stderr);
+        std::fputs("Usage: penwick-leftovers [COUNT]\n", stderr);
         return 2;
     }
     countMemoryExactly(arguments);
