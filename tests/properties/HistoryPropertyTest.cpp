@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Random sessions on the model and its history, held against the reference step by step.
+// Random sessions on the model and its history, held against the second model step by step.
 #include "appearance/PenwickBundle.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "history/UndoRedoManager.h"
-#include "properties/ReferenceCanvas.h"
+#include "soak/PlainDrawing.h"
 #include "support/NotificationRecorder.h"
 #include "textbox/TextBoxDelegate.h"
 #include "textbox/TnTextBox.h"
@@ -14,8 +14,9 @@
 #include <QColor>
 #include <QObject>
 
+#include <map>
 #include <memory>
-#include <tuple>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -30,28 +31,18 @@ public:
     void shouldDeleteTheTextBox(std::int64_t /*withHash*/) override { }
 };
 
-/// What either side holds, in one comparable form: action, is it a stroke, identifier.
-using Records = std::vector<std::tuple<int, bool, std::int64_t>>;
+using Names = std::vector<std::string>;
+using Records = std::vector<std::pair<std::string, std::string>>; // what was done, to what
 
-Records recordsOf(const RecordStack &stack)
+Records recordsOf(const std::vector<PlainDrawing::Record> &stack)
 {
     Records records;
-    for (const UndoRedoState &record : stack) {
-        records.emplace_back(static_cast<int>(record.actionAssociated),
-            std::holds_alternative<StrokeEntry>(record.element), record.elementId);
-    }
+    for (const PlainDrawing::Record &record : stack)
+        records.emplace_back(record.action, record.name);
     return records;
 }
 
-Records recordsOf(const std::vector<ReferenceCanvas::Record> &stack)
-{
-    Records records;
-    for (const ReferenceCanvas::Record &record : stack)
-        records.emplace_back(static_cast<int>(record.action), record.item.isStroke, record.item.id);
-    return records;
-}
-
-/// The model and the reference, going through the same session.
+/// The model and the second one, going through the same session.
 class Session
 {
 public:
@@ -61,6 +52,7 @@ public:
         setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         m_history->setDrawingCanvasModel(m_model);
         m_model->setUndoRedoManager(m_history);
+        m_plain.setListener([this](const std::string &posted) { m_posted.push_back(posted); });
     }
 
     void doSomething()
@@ -84,7 +76,7 @@ public:
             break;
         case 5:
             m_model->clearCanvas();
-            m_reference.clear();
+            m_plain.clear();
             break;
         case 6:
             undoSeveralTimes();
@@ -97,34 +89,61 @@ public:
     /// Both sides hold the same, posted the same, and no older copy has changed.
     void compare()
     {
-        RC_ASSERT(m_recorder.take() == std::exchange(m_reference.posted, {}));
-        RC_ASSERT(strokeIds(m_model->pathArray()) == m_reference.strokeIds());
-        RC_ASSERT(textBoxIds(m_model->textBoxArray()) == m_reference.textBoxIds());
-        RC_ASSERT(recordsOf(m_history->undoStack()) == recordsOf(m_reference.undoStack));
-        RC_ASSERT(recordsOf(m_history->redoStack()) == recordsOf(m_reference.redoStack));
-        RC_ASSERT(m_history->undoCount() == m_reference.undoCount);
-        for (const auto &[strokes, ids] : m_copies)
-            RC_ASSERT(strokeIds(strokes) == ids);
+        RC_ASSERT(postedByProduct() == std::exchange(m_posted, {}));
+        RC_ASSERT(namesOf(m_model->pathArray()) == m_plain.strokes());
+        RC_ASSERT(namesOf(m_model->textBoxArray()) == m_plain.boxes());
+        RC_ASSERT(recordsOf(m_history->undoStack()) == test::recordsOf(m_plain.undoStack()));
+        RC_ASSERT(recordsOf(m_history->redoStack()) == test::recordsOf(m_plain.redoStack()));
+        RC_ASSERT(m_history->undoCount() == m_plain.undoCount());
+        for (const auto &[strokes, names] : m_copies)
+            RC_ASSERT(namesOf(strokes) == names);
     }
 
     /// Takes a copy of the strokes, as the canvas view does, and keeps it.
-    void keepCopy() { m_copies.emplace_back(m_model->pathArray(), m_reference.strokeIds()); }
+    void keepCopy() { m_copies.emplace_back(m_model->pathArray(), m_plain.strokes()); }
 
 private:
-    static ReferenceCanvas::Ids strokeIds(const EntryList<StrokeEntry> &entries)
+    [[nodiscard]] Names namesOf(const EntryList<StrokeEntry> &entries) const
     {
-        ReferenceCanvas::Ids ids;
+        Names names;
         for (const StrokeEntry &entry : entries)
-            ids.push_back(entry.pathId);
-        return ids;
+            names.push_back(m_names.at(entry.pathId));
+        return names;
     }
 
-    static ReferenceCanvas::Ids textBoxIds(const EntryList<TextBoxEntry> &entries)
+    [[nodiscard]] Names namesOf(const EntryList<TextBoxEntry> &entries) const
     {
-        ReferenceCanvas::Ids ids;
+        Names names;
         for (const TextBoxEntry &entry : entries)
-            ids.push_back(entry.textId);
-        return ids;
+            names.push_back(m_names.at(entry.textId));
+        return names;
+    }
+
+    [[nodiscard]] Records recordsOf(const RecordStack &stack) const
+    {
+        static const std::map<ActionType, std::string> actions { { ActionType::draw, "draw" },
+            { ActionType::erase, "erase" }, { ActionType::clear, "clear" } };
+        Records records;
+        for (const UndoRedoState &record : stack) {
+            const auto *const stroke = std::get_if<StrokeEntry>(&record.element);
+            const std::int64_t id
+                = stroke ? stroke->pathId : std::get<TextBoxEntry>(record.element).textId;
+            RC_ASSERT(id == record.elementId);
+            records.emplace_back(actions.at(record.actionAssociated), m_names.at(id));
+        }
+        return records;
+    }
+
+    /// What the product posted, by name instead of identifier.
+    [[nodiscard]] std::vector<std::string> postedByProduct()
+    {
+        const std::string removal = "removeWithId ";
+        std::vector<std::string> posted = m_recorder.take();
+        for (std::string &each : posted) {
+            if (each.starts_with(removal))
+                each = removal + m_names.at(std::stoll(each.substr(removal.size())));
+        }
+        return posted;
     }
 
     static double anyX() { return *rc::gen::inRange(0, 40); }
@@ -132,30 +151,31 @@ private:
 
     void beginStroke()
     {
-        const int line = anyLine();
+        const double y = anyLine() * lineDistance;
         const double x = anyX();
-        m_model->createPathWithParam(Qt::black, 5.0, { x, line * lineDistance });
-        m_reference.beginStroke(m_model->pathArray().last().pathId, line, x);
+        m_model->createPathWithParam(Qt::black, 5.0, { x, y });
+        m_plain.beginStroke({ x, y }, 5.0);
+        m_names[m_model->pathArray().last().pathId] = m_plain.strokes().back();
         if (*rc::gen::inRange(0, 4) > 0)
             extendStroke();
     }
 
+    // Along its line: no two strokes cross, and every distance is a whole number.
     void extendStroke()
     {
         const double x = anyX();
-        const int line = m_reference.strokes.empty() ? 0 : m_reference.newestLine();
-        m_model->updateTheCurrentPath({ x, line * lineDistance });
-        m_reference.extendStroke(x);
+        const Names &strokes = m_plain.strokes();
+        const double y = strokes.empty() ? 0.0 : m_plain.stroke(strokes.back()).next.y;
+        m_model->updateTheCurrentPath({ x, y });
+        m_plain.extendStroke({ x, y });
     }
 
     void erase()
     {
-        const int line = anyLine();
+        const double y = anyLine() * lineDistance + *rc::gen::inRange(-3, 4);
         const double x = anyX();
-        const double above = *rc::gen::inRange(-3, 4);
-        const bool isErased
-            = m_model->performEraseOperationAtLocation({ x, line * lineDistance + above });
-        RC_ASSERT(isErased == m_reference.eraseAt(line, x, above));
+        const bool isErased = m_model->performEraseOperationAtLocation({ x, y });
+        RC_ASSERT(isErased == m_plain.eraseAt({ x, y }));
     }
 
     // More than five in a row now and then: that is where the button rules change.
@@ -165,7 +185,7 @@ private:
     {
         for (int left = anyRepetition(); left > 0; --left) {
             m_history->undoAction();
-            m_reference.undo();
+            m_plain.undo();
         }
     }
 
@@ -173,33 +193,37 @@ private:
     {
         for (int left = anyRepetition(); left > 0; --left) {
             m_history->redoAction();
-            m_reference.redo();
+            m_plain.redo();
         }
     }
 
     void addTextBox()
     {
         m_model->createTextBox({ anyX(), 0 }, Qt::black, 24.0, &m_owner);
-        m_reference.addTextBox(m_model->textBoxArray().last().textId);
+        m_names[m_model->textBoxArray().last().textId] = m_plain.addBox();
     }
 
     void deleteTextBox()
     {
-        const auto ids = m_reference.textBoxIds();
-        const std::int64_t id = ids.empty() ? -1 : *rc::gen::elementOf(ids);
+        const EntryList<TextBoxEntry> &boxes = m_model->textBoxArray();
+        const int index = boxes.isEmpty() ? -1 : *rc::gen::inRange(0, boxes.size());
+        const std::int64_t id = index < 0 ? -1 : boxes[index].textId;
+        const std::string name = index < 0 ? "none" : m_names.at(id);
         m_model->deleteTextBoxWith(id);
-        m_reference.deleteTextBox(id);
+        m_plain.deleteBox(name);
     }
 
     Owner m_owner;
     std::shared_ptr<DrawingCanvasModel> m_model = std::make_shared<DrawingCanvasModel>();
     std::shared_ptr<UndoRedoManager> m_history = std::make_shared<UndoRedoManager>();
-    ReferenceCanvas m_reference;
+    PlainDrawing m_plain;
+    std::map<std::int64_t, std::string> m_names; // of strokes and boxes, as the second model calls
     NotificationRecorder m_recorder;
-    std::vector<std::pair<EntryList<StrokeEntry>, ReferenceCanvas::Ids>> m_copies;
+    std::vector<std::string> m_posted; // by the second model
+    std::vector<std::pair<EntryList<StrokeEntry>, Names>> m_copies;
 };
 
-RC_GTEST_PROP(HistoryProperties, everySessionEndsAsTheReferenceDoes, ())
+RC_GTEST_PROP(HistoryProperties, everySessionGoesAsTheSecondModelSays, ())
 {
     Session session;
     const int steps = *rc::gen::inRange(0, 600);
