@@ -2,6 +2,7 @@
 #include "soak/Run.h"
 
 #include "soak/Session.h"
+#include "soak/Step.h"
 
 #include <csignal>
 #include <cstdio>
@@ -49,12 +50,12 @@ std::uint64_t freshSeed()
     return device() & 0x7fffffffU; // short enough to be copied by hand
 }
 
-std::optional<std::string> runSession(std::uint64_t seed, int steps, Kinds kinds)
+std::optional<std::string> runSession(std::uint64_t seed, int steps)
 {
     tellSeedWhenStopped();
     present = "\nstopped in this session: " + howToRepeat(seed, steps) + "\n";
     Session session;
-    auto shortest = stepsOf(seed, steps, kinds);
+    auto shortest = stepsOf(seed, steps);
     auto found = session.run(shortest.value());
     if (!found)
         return std::nullopt;
@@ -70,6 +71,13 @@ std::optional<std::string> runSession(std::uint64_t seed, int steps, Kinds kinds
         shrinks = next->shrinks();
     }
     return "repeat it with " + howToRepeat(seed, steps) + "\n" + *found;
+}
+
+std::vector<std::string> linesOf(std::uint64_t seed, int steps)
+{
+    Session session;
+    static_cast<void>(session.run(stepsOf(seed, steps).value()));
+    return session.said();
 }
 
 } // namespace penwick::test

@@ -21,8 +21,43 @@ public:
 
     /// Takes `steps`. Answers what differed, and how it came to that; nothing if nothing did.
     std::optional<std::string> run(const Steps &steps);
+    /// The same with what a session has said of itself, or what somebody has written in such words:
+    /// "tool text", "press canvas 200,100", "key Escape". Each line must do what it says.
+    std::optional<std::string> play(const std::vector<std::string> &lines);
+    /// What was done, in the words that play() takes.
+    [[nodiscard]] const std::vector<std::string> &said() const { return m_said; }
 
 private:
+    // Each does what it is told where that can be done, on both sides, and says so.
+    void act(const std::string &line);
+    bool actAsIs(const std::string &line);
+    bool actWithPlace(const std::string &line);
+    void actWithName(const std::string &line);
+    void pressAgain(Spot spot, int click);
+    void otherButton(Qt::MouseButton button, Spot spot);
+    void useTool(const std::string &name, bool byPointer);
+    void useOption(const std::string &name, bool byPointer);
+    void missTool(const std::string &name);
+    void pressKey(const std::string &name);
+    void pressEditorsKey(const std::string &name);
+    void copyElsewhere(const std::string &text);
+    void composeHalf(const std::string &half);
+    void commit(const std::string &whole);
+    void dragOver(Spot spot, const std::string &text);
+    void drop(Spot spot, const std::string &text);
+    void dragAway();
+    void openMenuByKey();
+    void useMenu(const std::string &item, bool byPointer);
+    void moveWindowTo(QPoint corner);
+    bool resizeWindowTo(QSize size, bool fromTheLeft);
+    void activate();
+    void deactivate();
+    void turn();
+    void pressPanel();
+    void turnBanner();
+    void close();
+
+    // Each chooses what a step of its kind does.
     void open(int number); ///< a window of one of the kinds
     void take(const Step &step);
     void takeWindowStep(const Step &step);
@@ -42,7 +77,6 @@ private:
     void write(const Step &step);
     void key(const Step &step);
     void edit(const Step &step);
-    void copyElsewhere(const Step &step);
     void compose(const Step &step);
     void dragText(const Step &step);
     void workMenu(const Step &step);
@@ -60,6 +94,7 @@ private:
     [[nodiscard]] bool isMenuOpen() const { return !m_plain->menu().empty(); }
     [[nodiscard]] bool canType() const; ///< into a box
     [[nodiscard]] bool isComposing() const;
+    [[nodiscard]] bool canDragText() const;
     void adopt();
     [[nodiscard]] std::optional<std::string> difference();
     void say(const std::string &what) { m_said.push_back(what); }

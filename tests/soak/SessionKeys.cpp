@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The steps of the keys, and of whatever else reaches a box that is being edited.
 #include "soak/Session.h"
+#include "soak/Words.h"
 
 namespace penwick::test {
 
@@ -24,19 +25,25 @@ void Session::key(const Step &step)
     const bool isEditing = !m_plain->canvas().editedBox().empty();
     if (!isEditing && name == "BackSpace" && step.b % 2)
         name = "Delete";
+    if (name != "C-w" || step.b <= 80)
+        pressKey(name);
+}
+
+void Session::pressKey(const std::string &name)
+{
+    const bool isEditing = !m_plain->canvas().editedBox().empty();
     const bool isTyped = isEditing && (name.size() == 1 || name == "BackSpace");
     if (isTyped && isComposing())
         return; // the input method takes it
     if (isMenuOpen() && name == "Escape") {
-        say("escape from the menu");
+        say("key " + name); // it is the menu's
         m_real.key(name);
         return m_plain->closeMenu();
     }
     // While a box is edited, keys with Ctrl are its editor's, which has an undo of its own. C-w
     // ends the session, so it is let through only seldom.
     const bool isEditors = isEditing && name.starts_with("C-") && name != "C-w";
-    if (!canPoint() || isMenuOpen() || !m_plain->isKey() || isEditors
-        || (name == "C-w" && step.b > 80))
+    if (!canPoint() || isMenuOpen() || !m_plain->isKey() || isEditors)
         return;
     say("key " + name);
     if (isTyped)
@@ -64,10 +71,16 @@ void Session::edit(const Step &step)
     static const std::vector<std::string> names { "C-z", "C-z", "C-y", "C-S-z", "C-a", "C-c", "C-x",
         "C-v", "Left", "Right", "Home", "End", "S-Left", "S-Left", "S-Right", "S-Home", "S-End",
         "C-S-Left", "BackSpace", "Delete", "C-BackSpace", "C-Delete", "S-Return", "u", "v", "w" };
+    static const std::vector<std::string> texts { "", "p", "two\nlines", "of words" };
     if (step.b % 16 == 0)
-        return copyElsewhere(step);
-    const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
-    if (!canType() || (isComposing() && step.b % 4)) // an input method lets few keys through
+        return copyElsewhere(texts[static_cast<std::size_t>(step.a) % texts.size()]);
+    if (!isComposing() || step.b % 4 == 0) // an input method lets few keys through
+        pressEditorsKey(names[static_cast<std::size_t>(step.a) % names.size()]);
+}
+
+void Session::pressEditorsKey(const std::string &name)
+{
+    if (!canType())
         return;
     const PlainText &text = m_plain->canvas().allBoxes.at(m_plain->canvas().editedBox()).text;
     if (name == "C-v" && text.now().size() > longestText)
@@ -77,11 +90,9 @@ void Session::edit(const Step &step)
     m_plain->edit(name);
 }
 
-void Session::copyElsewhere(const Step &step)
+void Session::copyElsewhere(const std::string &text)
 {
-    static const std::vector<std::string> texts { "", "p", "two\nlines", "of words" };
-    const std::string &text = texts[static_cast<std::size_t>(step.a) % texts.size()];
-    say("copy elsewhere");
+    say("copy elsewhere " + quoted(text));
     RealBoard::copyElsewhere(text);
     m_plain->copyElsewhere(text);
 }
@@ -92,14 +103,26 @@ void Session::compose(const Step &step)
     static const std::vector<std::string> halves { "k", "ka", "kanji" };
     if (!canType())
         return;
-    if (!isComposing() || step.a % 3) {
-        const std::string &half = halves[static_cast<std::size_t>(step.b) % halves.size()];
-        say("compose " + half);
-        m_real.compose(half);
-        return m_plain->compose(half);
-    }
-    const std::string whole = step.b % 3 ? "K" : ""; // nothing: it is given up
-    say("commit " + whole);
+    if (!isComposing() || step.a % 3)
+        composeHalf(halves[static_cast<std::size_t>(step.b) % halves.size()]);
+    else
+        commit(step.b % 3 ? "K" : ""); // nothing: it is given up
+}
+
+void Session::composeHalf(const std::string &half)
+{
+    if (!canType())
+        return;
+    say("compose " + quoted(half));
+    m_real.compose(half);
+    m_plain->compose(half);
+}
+
+void Session::commit(const std::string &whole)
+{
+    if (!canType())
+        return;
+    say("commit " + quoted(whole));
     m_real.commit(whole);
     m_plain->commit(whole);
 }
@@ -108,24 +131,47 @@ void Session::compose(const Step &step)
 void Session::dragText(const Step &step)
 {
     static const std::vector<std::string> texts { "d", "drop", "on\ntwo", "" };
-    if (!canPoint() || isMenuOpen() || m_real.held())
-        return;
     const std::string &text = texts[static_cast<std::size_t>(step.a) % texts.size()];
     const std::string box = m_plain->canvas().editedBox();
     const Spot spot = box.empty() || step.a % 5 == 0 ? spotFor(step) : m_real.middleOf(box);
-    if (step.b % 3 == 0) {
-        say("drag text over");
-        m_real.dragOver(spot, text);
-    } else if (step.b % 3 == 1) {
-        const std::string target = m_real.targetAt(spot);
-        say("drop '" + text + "' on " + target);
-        m_real.drop(spot, text);
-        if (!text.empty())
-            m_plain->dropOn(target, text);
-    } else {
-        say("drag text away");
-        m_real.dragAway();
-    }
+    if (step.b % 3 == 0)
+        dragOver(spot, text);
+    else if (step.b % 3 == 1)
+        drop(spot, text);
+    else
+        dragAway();
+}
+
+bool Session::canDragText() const
+{
+    return canPoint() && !isMenuOpen() && !m_real.held();
+}
+
+void Session::dragOver(Spot spot, const std::string &text)
+{
+    if (!canDragText())
+        return;
+    say("drag text " + quoted(text) + " over" + inWords(spot));
+    m_real.dragOver(spot, text);
+}
+
+void Session::drop(Spot spot, const std::string &text)
+{
+    if (!canDragText())
+        return;
+    const std::string target = m_real.targetAt(spot);
+    say("drop " + quoted(text) + " on " + target + inWords(spot));
+    m_real.drop(spot, text);
+    if (!text.empty())
+        m_plain->dropOn(target, text);
+}
+
+void Session::dragAway()
+{
+    if (!canDragText())
+        return;
+    say("drag text away");
+    m_real.dragAway();
 }
 
 // A menu is a loop of its own on some desktops; the host and its user's aids go on meanwhile.
@@ -148,11 +194,24 @@ void Session::workMenu(const Step &step)
         const std::vector<std::string> items = RealBoard::menuItems();
         if (items.empty())
             return;
-        const std::string &item = items[static_cast<std::size_t>(step.a) % items.size()];
-        say("choose " + item);
-        m_real.chooseFromMenu(item, step.b % 2);
-        return m_plain->chooseFromMenu(item);
+        return useMenu(items[static_cast<std::size_t>(step.a) % items.size()], step.b % 2);
     }
+    openMenuByKey();
+}
+
+void Session::useMenu(const std::string &item, bool byPointer)
+{
+    if (!canPoint() || !isMenuOpen())
+        return;
+    say("choose " + item + (byPointer ? " by pointer" : ""));
+    m_real.chooseFromMenu(item, byPointer);
+    m_plain->chooseFromMenu(item);
+}
+
+void Session::openMenuByKey()
+{
+    if (!canPoint() || isMenuOpen())
+        return;
     const std::string responder = m_plain->canvas().responder();
     if (!m_plain->isKey() || m_real.held())
         return;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The steps of the pointer on the drawing window.
 #include "soak/Session.h"
+#include "soak/Words.h"
 
 #include <algorithm>
 
@@ -10,12 +11,6 @@ namespace {
 
 constexpr int columns = 16; // places that the pointer goes to
 constexpr int rows = 12;
-
-std::string inWords(Spot spot)
-{
-    return " " + std::to_string(static_cast<int>(spot.x)) + ","
-        + std::to_string(static_cast<int>(spot.y));
-}
 
 } // namespace
 
@@ -68,13 +63,18 @@ void Session::press(Spot spot, int clicks)
         if (m_real.held() != Qt::LeftButton || isGrabLost())
             return;
         release(spot);
-        if (!canPoint())
-            return;
-        m_grab = m_real.targetAt(spot);
-        say("press again " + m_grab);
-        m_real.pressAgain(spot);
-        m_plain->press(m_grab, spot, click == 2 ? 2 : 1); // a third is a first again
+        pressAgain(spot, click);
     }
+}
+
+void Session::pressAgain(Spot spot, int click)
+{
+    if (!canPoint() || m_real.held())
+        return;
+    m_grab = m_real.targetAt(spot);
+    say((click == 2 ? "press again " : "press a third time ") + m_grab + inWords(spot));
+    m_real.pressAgain(spot);
+    m_plain->press(m_grab, spot, click == 2 ? 2 : 1); // a third is a first again
 }
 
 void Session::pressView(const Step &step)
@@ -157,14 +157,18 @@ void Session::stroke(const Step &step)
 
 void Session::otherButton(const Step &step)
 {
-    const Qt::MouseButton button = step.a % 3 ? Qt::RightButton : Qt::MiddleButton;
-    const Spot spot = spotFor(step);
+    otherButton(step.a % 3 ? Qt::RightButton : Qt::MiddleButton, spotFor(step));
+}
+
+void Session::otherButton(Qt::MouseButton button, Spot spot)
+{
+    const std::string name = button == Qt::RightButton ? "right" : "middle";
     if (isGrabLost())
         releaseAll(spot);
     if (!canPoint() || isMenuOpen())
         return;
     if (m_real.held().testFlag(button)) {
-        say("release another button" + inWords(spot));
+        say("release the " + name + " button" + inWords(spot));
         m_real.release(spot, button);
         goTo(spot);
         if (!m_real.held())
@@ -174,7 +178,7 @@ void Session::otherButton(const Step &step)
     const std::string target = m_real.held() ? m_grab : m_real.targetAt(spot);
     if (target != "canvas" && m_real.held())
         return; // a menu in the middle of a drag would take the release
-    say("press another button on " + target + inWords(spot));
+    say("press the " + name + " button on " + target + inWords(spot));
     m_real.press(spot, button);
     goTo(spot);
     if (target == "canvas") {

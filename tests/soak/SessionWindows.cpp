@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The steps of the tool bar and of the windows.
 #include "soak/Session.h"
+#include "soak/Words.h"
 
 namespace penwick::test {
 
@@ -24,7 +25,12 @@ void Session::clickTool(const Step &step)
     const std::string &name = names[static_cast<std::size_t>(step.a) % names.size()];
     if (name == "state" && step.b > 20)
         return;
-    const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
+    useTool(name, step.b % 2);
+}
+
+void Session::useTool(const std::string &name, bool byPointer)
+{
+    byPointer = byPointer && !m_real.held() && canPoint() && !isMenuOpen();
     say("tool " + name + (byPointer ? " by pointer" : ""));
     m_real.clickTool(name, byPointer);
     if (byPointer)
@@ -34,12 +40,16 @@ void Session::clickTool(const Step &step)
 
 void Session::chooseOption(const Step &step)
 {
-    const std::string popover = m_plain->popover();
-    const auto &options = optionsOf(popover);
-    if (!m_plain->isPopoverVisible() || options.empty())
+    const auto &options = optionsOf(m_plain->popover());
+    if (!options.empty())
+        useOption(options[static_cast<std::size_t>(step.a) % options.size()], step.b % 2);
+}
+
+void Session::useOption(const std::string &name, bool byPointer)
+{
+    if (!m_plain->isPopoverVisible())
         return;
-    const std::string name = options[static_cast<std::size_t>(step.a) % options.size()];
-    const bool byPointer = !m_real.held() && canPoint() && !isMenuOpen() && step.b % 2;
+    byPointer = byPointer && !m_real.held() && canPoint() && !isMenuOpen();
     say("option " + name + (byPointer ? " by pointer" : ""));
     m_real.chooseOption(name, byPointer);
     if (byPointer)
@@ -52,92 +62,149 @@ void Session::chooseOption(const Step &step)
 void Session::takeWindowStep(const Step &step)
 {
     using Kind = Step::Kind;
-    if (step.kind == Kind::HideOrShow)
+    switch (step.kind) {
+    case Kind::HideOrShow:
         return hideOrShow();
-    if (step.kind == Kind::Minimise)
+    case Kind::Minimise:
         return minimiseOrRestore();
-    if (step.kind == Kind::OpenAnother)
+    case Kind::OpenAnother:
         return open(step.b);
-    if (step.kind == Kind::Close) {
-        say("close");
-        m_real.close();
-        return m_plain->close();
+    case Kind::Close:
+        return close();
+    case Kind::Paint:
+        return turn();
+    case Kind::Activate:
+        return activate();
+    case Kind::Deactivate:
+        return deactivate();
+    case Kind::Banner:
+        return turnBanner();
+    case Kind::MoveWindow:
+        return moveWindow(step);
+    case Kind::ResizeWindow:
+        return resizeWindow(step);
+    case Kind::PressPanel:
+        return pressPanel();
+    case Kind::ToolMissed:
+        return missTool(toolNames()[static_cast<std::size_t>(step.a) % 8]);
+    default:
+        break;
     }
+}
+
+void Session::close()
+{
+    say("close");
+    m_real.close();
+    m_plain->close();
+}
+
+void Session::turn()
+{
     if (!canPoint())
         return;
-    if (step.kind == Kind::Paint) {
-        say("turn and paint");
-        m_real.turn();
-        m_plain->turn();
-    } else if (step.kind == Kind::Activate || step.kind == Kind::Deactivate) {
-        const bool isActive = step.kind == Kind::Activate;
-        say(isActive ? "activate" : "deactivate");
-        m_real.activate(isActive);
-        m_plain->activate(isActive);
-    } else if (step.kind == Kind::Banner) {
-        m_isBannerShown = !m_isBannerShown;
-        say("banner");
-        m_real.showBanner(m_isBannerShown);
-        m_plain->showBanner(m_isBannerShown);
-    } else if (isMenuOpen()) {
-        return; // the pointer is the menu's
-    } else if (step.kind == Kind::MoveWindow) {
-        moveWindow(step);
-    } else if (step.kind == Kind::ResizeWindow) {
-        resizeWindow(step);
-    } else if (!m_real.held() && step.kind == Kind::PressPanel) {
-        say("press the panel");
-        m_real.pressPanel();
-        m_plain->pressPanel();
-    } else if (!m_real.held() && step.kind == Kind::ToolMissed) {
-        say("press a tool and let go beside it");
-        m_real.pressToolElsewhere(toolNames()[static_cast<std::size_t>(step.a) % 8]);
-        m_plain->pressBar();
-    }
+    say("turn and paint");
+    m_real.turn();
+    m_plain->turn();
+}
+
+void Session::activate()
+{
+    if (!canPoint())
+        return;
+    say("activate");
+    m_real.activate(true);
+    m_plain->activate(true);
+}
+
+void Session::deactivate()
+{
+    if (!canPoint())
+        return;
+    say("deactivate");
+    m_real.activate(false);
+    m_plain->activate(false);
+}
+
+void Session::turnBanner()
+{
+    if (!canPoint())
+        return;
+    m_isBannerShown = !m_isBannerShown;
+    say("banner");
+    m_real.showBanner(m_isBannerShown);
+    m_plain->showBanner(m_isBannerShown);
+}
+
+void Session::pressPanel()
+{
+    if (!canPoint() || isMenuOpen() || m_real.held())
+        return;
+    say("press the panel");
+    m_real.pressPanel();
+    m_plain->pressPanel();
+}
+
+void Session::missTool(const std::string &name)
+{
+    if (!canPoint() || isMenuOpen() || m_real.held())
+        return;
+    say("press beside tool " + name);
+    m_real.pressToolElsewhere(name);
+    m_plain->pressBar();
 }
 
 // By its title bar, in one or more steps.
 void Session::moveWindow(const Step &step)
 {
-    for (int part = 0; m_hasTitleBar && part <= step.b % 2; ++part) {
-        const QRect before = m_real.outerFrame();
-        const QRect outer(
-            3 * step.a - 200 + 8 * part, 2 * step.b - 100, before.width(), before.height());
-        if (outer == before)
-            continue;
-        say("move the window");
-        m_real.moveTo(outer);
-        m_plain->moveTo(plainFrame(m_real.outerFrame())); // a desktop may grant another place
-        m_plain->turn();
-    }
+    for (int part = 0; part <= step.b % 2; ++part)
+        moveWindowTo({ 3 * step.a - 200 + 8 * part, 2 * step.b - 100 });
+    if (step.b % 3)
+        rest();
+}
+
+void Session::moveWindowTo(QPoint corner)
+{
+    const QRect before = m_real.outerFrame();
+    if (!canPoint() || isMenuOpen() || !m_hasTitleBar || corner == before.topLeft())
+        return;
+    say("move the window to" + inWords(Spot { double(corner.x()), double(corner.y()) }));
+    m_real.moveTo({ corner, before.size() });
+    m_plain->moveTo(plainFrame(m_real.outerFrame())); // a desktop may grant another place
+    m_plain->turn();
+}
+
+void Session::resizeWindow(const Step &step)
+{
+    const QSize size(320 + 16 * (step.a % 20), 180 + 4 * (step.b % 60));
+    if (!resizeWindowTo(size, step.a % 2))
+        return;
     if (step.b % 3)
         rest();
 }
 
 // By its edges; at the left ones the right edge stays where it is.
-void Session::resizeWindow(const Step &step)
+bool Session::resizeWindowTo(QSize size, bool fromTheLeft)
 {
     if (m_grab.starts_with('x'))
-        return; // the button might come to lie where no pointer can let go of it
+        return false; // the button might come to lie where no pointer can let go of it
     const QRect before = m_real.outerFrame();
-    const QSize size(320 + 16 * (step.a % 20), 180 + 4 * (step.b % 60));
-    if (!m_hasTitleBar || size == before.size())
-        return;
+    if (!canPoint() || isMenuOpen() || !m_hasTitleBar || size == before.size())
+        return false;
     QRect outer(before.topLeft(), size);
-    if (step.a % 2)
+    if (fromTheLeft)
         outer.moveBottomRight(before.bottomRight());
-    say("resize the window to " + std::to_string(size.width()) + "x"
-        + std::to_string(size.height()));
+    say(std::string("resize the window ") + (fromTheLeft ? "from the left " : "") + "to"
+        + inWords(Spot { double(size.width()), double(size.height()) }));
     m_real.moveTo(outer);
     m_plain->resizeTo(plainFrame(m_real.outerFrame()));
     m_plain->turn();
-    if (step.b % 3)
-        rest();
+    return true;
 }
 
 void Session::rest()
 {
-    if (!m_hasTitleBar)
+    if (!canPoint() || isMenuOpen() || !m_hasTitleBar)
         return;
     say("let the window rest");
     m_real.rest();

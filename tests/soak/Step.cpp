@@ -9,7 +9,7 @@ namespace {
 
 using Kind = Step::Kind;
 
-rc::Gen<Kind> formerKind()
+rc::Gen<Kind> frequentKind()
 {
     return rc::gen::weightedElement<Kind>({ { 14, Kind::Press }, { 20, Kind::Drag },
         { 16, Kind::Release }, { 8, Kind::Click }, { 5, Kind::DoublePress },
@@ -20,18 +20,16 @@ rc::Gen<Kind> formerKind()
         { 1, Kind::OpenAnother } });
 }
 
-rc::Gen<Kind> newKind()
+rc::Gen<Kind> seldomKind()
 {
     return rc::gen::weightedElement<Kind>({ { 10, Kind::PressText }, { 30, Kind::Edit },
         { 10, Kind::Compose }, { 5, Kind::DragText }, { 12, Kind::Menu }, { 3, Kind::MoveWindow },
         { 2, Kind::ResizeWindow }, { 10, Kind::Tremble } });
 }
 
-rc::Gen<Step> anyStep(Kinds kinds)
+rc::Gen<Step> anyStep()
 {
-    const auto kind = kinds == Kinds::Former
-        ? formerKind()
-        : rc::gen::weightedOneOf<Kind>({ { 3, formerKind() }, { 1, newKind() } });
+    const auto kind = rc::gen::weightedOneOf<Kind>({ { 3, frequentKind() }, { 1, seldomKind() } });
     const auto number = rc::gen::resize(rc::kNominalSize, rc::gen::inRange(0, 256));
     return rc::gen::construct<Step>(kind, number, number);
 }
@@ -43,14 +41,14 @@ std::ostream &operator<<(std::ostream &stream, const Step &step)
     return stream << static_cast<int>(step.kind) << ' ' << step.a << ' ' << step.b;
 }
 
-rc::Gen<Steps> anySteps(Kinds kinds)
+rc::Gen<Steps> anySteps()
 {
-    return rc::gen::container<Steps>(anyStep(kinds));
+    return rc::gen::container<Steps>(anyStep());
 }
 
-rc::Shrinkable<Steps> stepsOf(std::uint64_t seed, int count, Kinds kinds)
+rc::Shrinkable<Steps> stepsOf(std::uint64_t seed, int count)
 {
-    return anySteps(kinds)(rc::Random(seed), count);
+    return anySteps()(rc::Random(seed), count);
 }
 
 } // namespace penwick::test

@@ -55,19 +55,11 @@ struct Step
 
 using Steps = std::vector<Step>;
 
-/// Of which kinds the steps of a session are.
-enum class Kinds
-{
-    All,
-    Former ///< those of the sessions that were kept before there were text steps and moved windows
-};
-
 std::ostream &operator<<(std::ostream &stream, const Step &step);
 
 /// Steps at random, no more than the generator's size.
-[[nodiscard]] rc::Gen<Steps> anySteps(Kinds kinds = Kinds::All);
+[[nodiscard]] rc::Gen<Steps> anySteps();
 /// The `count` steps that belong to `seed`, and what they can be made shorter to.
-[[nodiscard]] rc::Shrinkable<Steps> stepsOf(
-    std::uint64_t seed, int count, Kinds kinds = Kinds::All);
+[[nodiscard]] rc::Shrinkable<Steps> stepsOf(std::uint64_t seed, int count);
 
 } // namespace penwick::test
