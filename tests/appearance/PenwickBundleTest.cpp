@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-namespace penwick {
+namespace penwick::test {
 
 TEST(PenwickBundle, isEmptyUntilItIsSet)
 {
@@ -26,4 +26,4 @@ TEST(PenwickBundle, newOneReplacesAndReleasesTheFormer)
     setPenwickBundle(nullptr);
 }
 
-} // namespace penwick
+} // namespace penwick::test

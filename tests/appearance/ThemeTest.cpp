@@ -10,7 +10,7 @@
 #include <string>
 #include <vector>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -173,4 +173,4 @@ INSTANTIATE_TEST_SUITE_P(ColorMap, MisspeltColor,
     testing::Values("Black", "RED", "dark_gray", "light_gray", "darkgrey", "darkblue", "lightblue",
         "Light_Blue", "dark grey", "grey", "blue", " red", ""));
 
-} // namespace penwick
+} // namespace penwick::test

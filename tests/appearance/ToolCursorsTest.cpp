@@ -14,7 +14,7 @@
 #include <ostream>
 #include <string>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -97,4 +97,4 @@ TEST_F(ToolCursorsDeathTest, missingBundleStopsTheProcess)
         "penwick: fatal error: the resource bundle is not set");
 }
 
-} // namespace penwick
+} // namespace penwick::test

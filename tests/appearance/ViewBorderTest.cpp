@@ -10,7 +10,7 @@
 
 #include <gtest/gtest.h>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -70,4 +70,4 @@ TEST(ViewBorder, viewWithoutALayerStaysAsItIs)
     EXPECT_EQ(view.layer()->cornerRadius, 0.0);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -10,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-namespace penwick {
+namespace penwick::test {
 namespace {
 
 using Numbers = std::vector<int>;
@@ -324,4 +324,4 @@ RC_GTEST_PROP(EntryList, familyOfCopiesBehavesAsVectorsDo, ())
 }
 
 } // namespace
-} // namespace penwick
+} // namespace penwick::test

@@ -8,7 +8,7 @@
 #include <thread>
 #include <vector>
 
-namespace penwick {
+namespace penwick::test {
 namespace {
 
 TEST(NotificationNames, areThePrefixAndTheirFixedSuffix)
@@ -47,4 +47,4 @@ TEST(NotificationNames, areMadeOnceAlsoFromSeveralThreadsAtATime)
 }
 
 } // namespace
-} // namespace penwick
+} // namespace penwick::test

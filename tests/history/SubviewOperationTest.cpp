@@ -6,7 +6,7 @@
 
 #include <limits>
 
-namespace penwick {
+namespace penwick::test {
 namespace {
 
 using Case = SubviewOperation::Case;
@@ -55,4 +55,4 @@ INSTANTIATE_TEST_SUITE_P(SubviewOperation, NoSubviewOperation,
             { QStringLiteral("enableUndo"), true } })));
 
 } // namespace
-} // namespace penwick
+} // namespace penwick::test

@@ -10,7 +10,7 @@
 
 #include <functional>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -121,4 +121,4 @@ TEST(BannerLabel, newTextIsShownAtOnceAndHeardByAssistivePrograms)
     EXPECT_NE(pictureOf(label), before);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -11,7 +11,7 @@
 #include <algorithm>
 #include <optional>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -146,4 +146,4 @@ TEST_P(LeftOutOfCaptures, noneIsKeptOutByADesktopThatCannot)
 INSTANTIATE_TEST_SUITE_P(Kinds, LeftOutOfCaptures,
     testing::Values(WindowType::whiteboard, WindowType::annotation, WindowType::imageAnnotation));
 
-} // namespace penwick
+} // namespace penwick::test

@@ -10,7 +10,7 @@
 #include <QScrollBar>
 #include <QTest>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -297,4 +297,4 @@ TEST_F(ContentImage, clickThatDropsAnEntryOfTheViewsCopyTakesNothingAway)
     EXPECT_EQ(window().contentImage(), before);
 }
 
-} // namespace penwick
+} // namespace penwick::test

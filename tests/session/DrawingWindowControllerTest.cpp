@@ -11,7 +11,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -212,4 +212,4 @@ TEST_F(DrawingWindowDeathTest, windowThatIsGoneStopsTheProcess)
         "penwick: fatal error: the drawing window is gone");
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -12,7 +12,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -108,4 +108,4 @@ TEST_F(DrawingWindowStopDeathTest, bannerOverAnImageWindowThatHasNoImageStopsThe
         "penwick: fatal error: the drawing window has not been placed");
 }
 
-} // namespace penwick
+} // namespace penwick::test

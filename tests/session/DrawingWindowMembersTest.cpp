@@ -10,7 +10,7 @@
 #include <memory>
 #include <utility>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -257,4 +257,4 @@ TEST_F(DrawingWindowMembers, entryObjectHoldsTheControllerThatItIsGiven)
     m_penwick.showWindowSharingNotification(); // has nobody to ask
 }
 
-} // namespace penwick
+} // namespace penwick::test

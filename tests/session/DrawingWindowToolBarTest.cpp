@@ -16,7 +16,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -337,4 +337,4 @@ TEST_F(DrawingWindowToolBarDeathTest, missingPanelStopsTheProcess)
     EXPECT_DEATH(loaded(), "penwick: fatal error: the drawing window's tool bar has no panel");
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -13,7 +13,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -132,4 +132,4 @@ TEST_F(GlidingWindows, popoverThatIsOpenedOnTheWayStandsWhereTheBarWillBe)
     EXPECT_LT(opened.x, panel().frame().maxX() + 20);
 }
 
-} // namespace penwick
+} // namespace penwick::test

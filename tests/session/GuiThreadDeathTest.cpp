@@ -15,7 +15,7 @@
 #include <set>
 #include <thread>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -273,4 +273,4 @@ TEST(OnAnotherThread, namesAndPlainValuesAreForAnyThread)
     }).join();
 }
 
-} // namespace penwick
+} // namespace penwick::test

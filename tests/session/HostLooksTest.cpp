@@ -25,7 +25,7 @@
 #include <string>
 #include <tuple>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -312,4 +312,4 @@ INSTANTIATE_TEST_SUITE_P(All, HostLooks,
         testing::Values(1, 2)),
     lookName);
 
-} // namespace penwick
+} // namespace penwick::test

@@ -13,7 +13,7 @@
 
 #include <map>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -152,4 +152,4 @@ TEST_F(HostWords, bannerIsNoWiderThanTheScreen)
     EXPECT_EQ(bannerLabel().accessibleName(), QString(400, QLatin1Char('W')));
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -14,7 +14,7 @@
 #include <cmath>
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -199,4 +199,4 @@ TEST_F(ImageWindowPlacement, everyImageIsFittedOnce)
         (Rect { 0, 0, content().width, std::round(1000 * content().width / 400) }));
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -6,7 +6,7 @@
 
 #include <string>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -102,4 +102,4 @@ TEST_F(ReachablePanel, higherThanTheScreenKeepsItsLowerEnd)
     EXPECT_EQ(shown({ 200, -30, 60, 900 }, { 0, 0, 1280, 800 }), (Rect { 200, 0, 60, 900 }));
 }
 
-} // namespace penwick
+} // namespace penwick::test

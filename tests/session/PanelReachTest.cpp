@@ -8,7 +8,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -158,4 +158,4 @@ TEST_F(PanelReach, thatFitsItsBoardLeavesTheScreenWithIt)
     EXPECT_EQ(m_panel.frame().y, before.y - 580);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -12,7 +12,7 @@
 #include <set>
 #include <thread>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -200,4 +200,4 @@ TEST(NotificationName, isMadeOnceForAllThreads)
     EXPECT_EQ(*different.begin(), &penwickSessionEndNotificationKey());
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -11,7 +11,7 @@
 
 #include <gtest/gtest.h>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -78,4 +78,4 @@ TEST_F(PictureFitTest, firstPullOfAWindowThatNoDesktopFramesEndsTheFitting)
     EXPECT_EQ(picture(), (Rect { 0, 0, 400, 300 }));
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -15,7 +15,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -115,4 +115,4 @@ TEST_F(Scenes, buttonsOfTheToolBarHaveTheImagesThatTheSceneNames)
     EXPECT_EQ(named, 7) << "all but the one that ends";
 }
 
-} // namespace penwick
+} // namespace penwick::test

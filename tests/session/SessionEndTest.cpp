@@ -9,7 +9,7 @@
 #include <memory>
 #include <optional>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -152,4 +152,4 @@ TEST_F(SessionEnd, hostMayOpenTheNextWindowInsideTheNews)
     EXPECT_TRUE(m_penwick->penwickWindowController()->window()->isVisible());
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -17,7 +17,7 @@
 #include <utility>
 #include <vector>
 
-namespace penwick {
+namespace penwick::test {
 
 /// Opens drawing windows, and writes down the ends of sessions by their objects.
 class SessionFixture : public testing::Test
@@ -58,4 +58,4 @@ private:
     std::function<void()> m_reaction;
 };
 
-} // namespace penwick
+} // namespace penwick::test

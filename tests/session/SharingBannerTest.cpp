@@ -10,7 +10,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -159,4 +159,4 @@ TEST_F(SharingBanner, anyWindowIsMadeABannerTheSameWay)
     EXPECT_EQ(window.grab().toImage().pixelColor(10, 10).alpha(), 0);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -14,7 +14,7 @@
 
 #include <memory>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -294,4 +294,4 @@ TEST_F(ToolPanelWindowDeathTest, pressBeforeThePopoverWindowIsThereStopsTheProce
         m_controller.mouseDown(), "penwick: fatal error: the tool bar has no popover window");
 }
 
-} // namespace penwick
+} // namespace penwick::test

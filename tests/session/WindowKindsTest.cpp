@@ -9,7 +9,7 @@
 #include <QElapsedTimer>
 #include <QTest>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -178,4 +178,4 @@ TEST_F(WindowKinds, bannersGroundIsTranslucentWithRoundCorners)
     EXPECT_EQ(layer.cornerRadius, 4.0);
 }
 
-} // namespace penwick
+} // namespace penwick::test

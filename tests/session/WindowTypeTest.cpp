@@ -8,7 +8,7 @@
 #include <type_traits>
 #include <unordered_set>
 
-namespace penwick {
+namespace penwick::test {
 
 TEST(WindowType, rawValuesAreZeroToTwo)
 {
@@ -41,4 +41,4 @@ TEST(WindowType, isHashedByItsRawValue)
     EXPECT_EQ(types.count(WindowType::imageAnnotation), 0U);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -13,7 +13,7 @@
 #include <memory>
 #include <optional>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -92,4 +92,4 @@ TEST(WithoutApplication, namesAndPlainValuesNeedNone)
     EXPECT_EQ(windowTypeFromRawValue(2), WindowType::imageAnnotation);
 }
 
-} // namespace penwick
+} // namespace penwick::test

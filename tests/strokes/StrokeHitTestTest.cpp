@@ -8,7 +8,7 @@
 
 #include <cmath>
 
-namespace penwick {
+namespace penwick::test {
 namespace {
 
 using platform::BezierPath;
@@ -171,4 +171,4 @@ TEST(StrokeHitTest, curveIsHitAlongItself)
 }
 
 } // namespace
-} // namespace penwick
+} // namespace penwick::test

@@ -7,7 +7,7 @@
 #include <algorithm>
 #include <cmath>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -125,4 +125,4 @@ TEST(StrokeLines, curveOfAnySizeHasNoMoreThanTenThousandChords)
     EXPECT_EQ(linesOf(path).size(), 10'000U);
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -10,7 +10,7 @@
 
 #include <limits>
 
-namespace penwick {
+namespace penwick::test {
 
 TEST(TextBoxFont, sizeIsInPointsOfTheScreensLogicalPixels)
 {
@@ -75,4 +75,4 @@ TEST(TextBoxFont, isTheSystemsWhereThePreferredOneIsNotInstalled)
         textFontOf(24.0).family(), QFontDatabase::systemFont(QFontDatabase::GeneralFont).family());
 }
 
-} // namespace penwick
+} // namespace penwick::test

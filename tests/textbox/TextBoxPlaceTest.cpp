@@ -6,7 +6,7 @@
 
 #include <ostream>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -123,4 +123,4 @@ TEST(TextBoxPlace, boxIsReachedOnACanvasOfLessThanTwentyPoints)
     EXPECT_EQ(frameInReach({ -500, -50, 200, 30 }, { 15, 10 }), (Rect { -185, -20, 200, 30 }));
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -13,7 +13,7 @@
 
 #include <functional>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -172,4 +172,4 @@ TEST_F(TextCaretTest, editorIsPaintedAgainForEachChange)
     EXPECT_TRUE(isPaintedAfter([] {})) << "it blinks";
 }
 
-} // namespace penwick
+} // namespace penwick::test

@@ -7,7 +7,7 @@
 
 #include <gtest/gtest.h>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -168,4 +168,4 @@ TEST(TextRoom, millionsOfMarksEndTheSearchForMore)
     EXPECT_EQ(fittingPart(text, {}), QStringLiteral("e") + times(64, accent));
 }
 
-} // namespace penwick
+} // namespace penwick::test

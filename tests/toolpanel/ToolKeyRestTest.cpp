@@ -6,7 +6,7 @@
 
 #include <string>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -60,4 +60,4 @@ INSTANTIATE_TEST_SUITE_P(Events, ToolKeyRestTable,
         Row { "ppb", true }, Row { "eb", true }, Row { "ek", true }),
     eventsOf);
 
-} // namespace penwick
+} // namespace penwick::test

@@ -8,7 +8,7 @@
 
 #include <gtest/gtest.h>
 
-namespace penwick {
+namespace penwick::test {
 
 namespace {
 
@@ -61,4 +61,4 @@ TEST(ToolKeys, toolsHaveTheirKeys)
     EXPECT_EQ(toolForKey(press(Qt::Key_Delete)), QString());
 }
 
-} // namespace penwick
+} // namespace penwick::test
