@@ -8,7 +8,6 @@
 #include "canvas/DrawingCanvasView.h"
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
-#include "platform/scene/Storyboard.h"
 #include "platform/view/View.h"
 #include "platform/window/WindowFlags.h"
 #include "session/PictureFit.h"
@@ -45,10 +44,11 @@ Rect boardOn(const Rect &screen, double width)
     return { screen.x + screen.width / 6, screen.y + screen.height / 6, width, width * 9 * 0.0625 };
 }
 
-platform::Storyboard mainStoryboard()
+template <class Controller>
+std::unique_ptr<Controller> ofMainStoryboard(const QString &identifier)
 {
-    return platform::Storyboard(
-        QStringLiteral("Main"), *require(penwickBundle().get(), "the resource bundle is not set"));
+    return require(penwickBundle(), "the resource bundle is not set")
+        ->instantiate<Controller>(QStringLiteral("Main"), identifier);
 }
 
 } // namespace
@@ -185,7 +185,7 @@ void DrawingWindowController::windowDidLoad()
 void DrawingWindowController::loadBanner()
 {
     const std::shared_ptr<platform::WindowController> controller
-        = mainStoryboard().instantiate<platform::WindowController>(
+        = ofMainStoryboard<platform::WindowController>(
             QStringLiteral("SharingNotificationWindowController"));
     require(controller.get(), "the drawing window has no sharing banner");
     if (!controller->window())
@@ -198,8 +198,8 @@ void DrawingWindowController::loadBanner()
 
 void DrawingWindowController::attachToolBar()
 {
-    m_tPanelWindowController = mainStoryboard().instantiate<ToolPanelWindowController>(
-        QStringLiteral("ToolPanelWindowController"));
+    m_tPanelWindowController
+        = ofMainStoryboard<ToolPanelWindowController>(QStringLiteral("ToolPanelWindowController"));
     require(m_tPanelWindowController, "the drawing window has no tool bar");
     m_drawingWindow->addChildWindow(*require(
         m_tPanelWindowController->toolPanelWindow(), "the drawing window's tool bar has no panel"));

@@ -6,7 +6,6 @@
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
 #include "platform/foundation/StandardOutput.h"
-#include "platform/scene/Storyboard.h"
 #include "session/ComponentBundle.h"
 
 namespace penwick {
@@ -63,9 +62,8 @@ std::shared_ptr<DrawingWindowController> Penwick::createDrawingWindowController(
 {
     platform::requireGuiThread();
     const auto &bundle = platform::require(penwickBundle(), "the resource bundle is not set");
-    const platform::Storyboard storyboard(QStringLiteral("Main"), *bundle);
-    m_penwickWindowController = shared(
-        storyboard.instantiate<DrawingWindowController>(QStringLiteral("DrawingWindowController")));
+    m_penwickWindowController = shared(bundle->instantiate<DrawingWindowController>(
+        QStringLiteral("Main"), QStringLiteral("DrawingWindowController")));
     if (!m_penwickWindowController) {
         platform::printLine("Not able to create Penwick WindowController!");
         return nullptr;

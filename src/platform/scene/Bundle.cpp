@@ -22,9 +22,11 @@ void Bundle::addScene(const QString &storyboard, const QString &identifier, cons
     m_storyboards[storyboard].insert(identifier, maker);
 }
 
-Bundle::SceneMaker Bundle::scene(const QString &storyboard, const QString &identifier) const
+std::unique_ptr<QObject> Bundle::instantiateController(
+    const QString &storyboard, const QString &identifier) const
 {
-    return m_storyboards.value(storyboard).value(identifier);
+    const SceneMaker maker = m_storyboards.value(storyboard).value(identifier);
+    return maker ? maker() : nullptr;
 }
 
 void Bundle::addInterface(const QString &name, const InterfaceLoader &loader)

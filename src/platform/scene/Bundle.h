@@ -31,8 +31,21 @@ public:
 
     /// Adds the scene `identifier` to the storyboard `storyboard`.
     void addScene(const QString &storyboard, const QString &identifier, const SceneMaker &maker);
-    /// The maker of that scene; empty where there is none.
-    [[nodiscard]] SceneMaker scene(const QString &storyboard, const QString &identifier) const;
+    /// A new, loaded controller of that scene; null where there is no such scene. Its class is the
+    /// scene's: the caller tests for the one it needs.
+    [[nodiscard]] std::unique_ptr<QObject> instantiateController(
+        const QString &storyboard, const QString &identifier) const;
+    /// The same, as `Controller`; null where there is no such scene or it is of another class.
+    template <class Controller>
+    [[nodiscard]] std::unique_ptr<Controller> instantiate(
+        const QString &storyboard, const QString &identifier) const
+    {
+        std::unique_ptr<QObject> object = instantiateController(storyboard, identifier);
+        auto *const controller = dynamic_cast<Controller *>(object.get());
+        if (controller)
+            static_cast<void>(object.release());
+        return std::unique_ptr<Controller>(controller);
+    }
 
     /// Adds the interface file `name`.
     void addInterface(const QString &name, const InterfaceLoader &loader);
