@@ -190,7 +190,7 @@ void DrawingCanvasView::takePointer(Point point)
     if (window())
         window()->makeFirstResponder(this);
     if (isOver(point) && !(platform::Cursor::currentCursor() == m_cursorType))
-        m_cursorType.set(*this);
+        m_cursorType.set(surface());
 }
 
 void DrawingCanvasView::dragTo(Point point)
@@ -219,7 +219,7 @@ void DrawingCanvasView::mouseUp(const platform::MouseEvent &event)
 {
     const Point point = convertTo(event.locationInWindow, nullptr);
     if (!isOver(point) && platform::Cursor::currentCursor() == m_cursorType)
-        platform::Cursor::arrow().set(*this);
+        platform::Cursor::arrow().set(surface());
     if (m_currentSelectedTool == Tools::brush) {
         endStroke(point);
     } else if (m_currentSelectedTool == Tools::eraser) {

@@ -50,7 +50,7 @@ void DeleteTextBoxButton::mouseEntered()
     if (!std::exchange(m_isHovered, true))
         m_tempImage = image();
     setImage(alternateImage());
-    platform::Cursor::arrow().set(*this);
+    platform::Cursor::arrow().set(surface());
 }
 
 void DeleteTextBoxButton::mouseExited()
@@ -65,7 +65,7 @@ void DeleteTextBoxButton::mouseMoved(const platform::MouseEvent &event)
 
 void DeleteTextBoxButton::cursorUpdate(const platform::MouseEvent &)
 {
-    platform::Cursor::arrow().set(*this);
+    platform::Cursor::arrow().set(surface());
 }
 
 } // namespace penwick

@@ -187,7 +187,7 @@ void TnTextBox::mouseMoved(const platform::MouseEvent &)
         m_pointer = getCursorOfType(
             m_pointerIsForText ? QStringLiteral("Text_Cursor") : QStringLiteral("Move_Cursor"));
     }
-    m_pointer->set(*this);
+    m_pointer->set(surface());
 }
 
 void TnTextBox::handleGesture(const platform::PanGestureRecognizer &gesture)

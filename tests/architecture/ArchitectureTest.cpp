@@ -102,7 +102,8 @@ const std::string nativeInclude
       "|Foundation/|CoreGraphics/|ApplicationServices/|objc/|sys/|unistd\\.h|dlfcn\\.h|wayland)";
 const std::string privateQtInclude = "#\\s*include\\s*[<\"](qpa/|.*private/|.*_p\\.h)";
 const std::string desktopQuestion
-    = "Q_OS_|__APPLE__|_WIN32|__linux__|Q_WS_|QNativeInterface|nativeInterface\\s*<";
+    = "Q_OS_|__APPLE__|_WIN32|__linux__|Q_WS_|QNativeInterface|nativeInterface\\s*<"
+      "|platformName|\"xcb\"|QDBus";
 
 } // namespace
 

@@ -97,8 +97,8 @@ TEST_F(WorkspaceTest, busThatDoesNotAnswerIsNotWaitedFor)
 TEST_F(WorkspaceTest, unusableAddressIsNormalContrast)
 {
     const auto name = QStringLiteral("workspace-test-unusable");
-    m_workspace = std::make_unique<Workspace>(
-        QDBusConnection::connectToBus(QStringLiteral("unix:path=/nonexistent/bus"), name));
+    m_workspace = std::make_unique<Workspace>(std::make_unique<SettingsPortal>(
+        QDBusConnection::connectToBus(QStringLiteral("unix:path=/nonexistent/bus"), name)));
     QCoreApplication::processEvents();
 
     EXPECT_FALSE(m_workspace->accessibilityDisplayShouldIncreaseContrast());

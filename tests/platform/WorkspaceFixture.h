@@ -2,6 +2,7 @@
 // A private bus with a portal in a process of its own, for the tests of the workspace.
 #pragma once
 
+#include "platform/native/SettingsPortal.h"
 #include "platform/view/Workspace.h"
 
 #include <QDBusConnection>
@@ -138,7 +139,7 @@ protected:
 
     void makeWorkspace()
     {
-        m_workspace = std::make_unique<Workspace>(m_bus);
+        m_workspace = std::make_unique<Workspace>(std::make_unique<SettingsPortal>(m_bus));
         m_workspace->notificationCenter().addObserver(
             this, QString(), [this](const Notification &notification) {
                 m_notifications.push_back(notification);

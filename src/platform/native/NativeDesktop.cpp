@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/native/NativeDesktop.h"
 
-#include <QCoreApplication>
+#include <QGuiApplication>
 #include <QPointer>
 
 namespace penwick::platform {
@@ -43,6 +43,12 @@ bool NativeDesktop::isPointerHeld() const
 bool NativeDesktop::isCompositing() const
 {
     return true;
+}
+
+// X11 takes the hot spot in device pixels and Qt hands it on as it is given; elsewhere Qt scales.
+double NativeDesktop::hotSpotScale(double devicePixelRatio)
+{
+    return QGuiApplication::platformName() == QStringLiteral("xcb") ? devicePixelRatio : 1.0;
 }
 
 void NativeDesktop::keepContentRatio(QWindow &, const QSize &) { }

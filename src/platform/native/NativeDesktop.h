@@ -51,6 +51,9 @@ public:
     [[nodiscard]] virtual bool isPointerHeld() const;
     /// Whether transparent pixels of a window show what is below it.
     [[nodiscard]] virtual bool isCompositing() const;
+    /// By how much the hot spot of a picture of `devicePixelRatio` is multiplied when the toolkit
+    /// is given it in points: not every desktop's cursors count as its pictures do.
+    [[nodiscard]] static double hotSpotScale(double devicePixelRatio);
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that
     /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);

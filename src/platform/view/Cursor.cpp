@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/view/Cursor.h"
 
-#include "platform/view/View.h"
+#include "platform/native/NativeDesktop.h"
 
-#include <QGuiApplication>
 #include <QPixmap>
 #include <QPointer>
 #include <QWidget>
@@ -17,12 +16,6 @@ namespace penwick::platform {
 namespace {
 
 constexpr int largestCursor = 128; // points; more than any cursor's own size
-
-// X11 takes the hot spot in device pixels and Qt hands it on as it is given; elsewhere Qt scales.
-double hotSpotScale(double devicePixelRatio)
-{
-    return QGuiApplication::platformName() == QStringLiteral("xcb") ? devicePixelRatio : 1.0;
-}
 
 struct SetCursor
 {
@@ -87,21 +80,21 @@ QCursor Cursor::forScale(double devicePixelRatio) const
     }
     const QSize size = m_data->image.actualSize(QSize(largestCursor, largestCursor));
     const QPixmap pixmap = m_data->image.pixmap(size, devicePixelRatio);
-    const double scale = hotSpotScale(devicePixelRatio);
+    const double scale = NativeDesktop::hotSpotScale(devicePixelRatio);
     const QCursor cursor(pixmap, static_cast<int>(std::lround(m_data->hotSpot.x * scale)),
         static_cast<int>(std::lround(m_data->hotSpot.y * scale)));
     m_data->rendered.emplace_back(devicePixelRatio, cursor);
     return cursor;
 }
 
-void Cursor::set(View &view) const
+void Cursor::set(QWidget &surface) const
 {
     current() = *this;
-    const QCursor shown = forScale(view.widget().devicePixelRatioF());
+    const QCursor shown = forScale(surface.devicePixelRatioF());
     // Each setCursor() goes to the desktop, which is too much for every move of the pointer.
-    if (!view.surface().testAttribute(Qt::WA_SetCursor) || view.surface().cursor() != shown)
-        view.surface().setCursor(shown);
-    lastSet() = { &view.surface(), shown };
+    if (!surface.testAttribute(Qt::WA_SetCursor) || surface.cursor() != shown)
+        surface.setCursor(shown);
+    lastSet() = { &surface, shown };
 }
 
 Cursor Cursor::currentCursor()

@@ -11,9 +11,9 @@
 
 #include <memory>
 
-namespace penwick::platform {
+class QWidget;
 
-class View;
+namespace penwick::platform {
 
 /// Copies are the same cursor; two cursors made from the same artwork are not. GUI thread only.
 class Cursor
@@ -31,9 +31,9 @@ public:
     /// The cursor for a window with `devicePixelRatio`. The image is rendered once for each ratio.
     [[nodiscard]] QCursor forScale(double devicePixelRatio) const;
 
-    /// Shows this cursor now over `view`, until the pointer next enters a view with a cursor of
-    /// its own.
-    void set(View &view) const;
+    /// Shows this cursor now over a view's `surface`, until the pointer next enters a view with a
+    /// cursor of its own.
+    void set(QWidget &surface) const;
 
     /// The cursor that was set last, by set() or by the pointer entering a view; arrow() where
     /// somebody else has given the view's widget another one since.

@@ -372,13 +372,13 @@ void View::refreshCursorRects()
     surface().unsetCursor();
     resetCursorRects();
     if (m_cursor && surface().underMouse())
-        m_cursor->set(*this);
+        m_cursor->set(surface());
 }
 
 void View::pointerEntered()
 {
     if (m_cursor)
-        m_cursor->set(*this);
+        m_cursor->set(surface());
     else
         refreshCursorRects();
 }
