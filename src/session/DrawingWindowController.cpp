@@ -28,9 +28,6 @@ using platform::Rect;
 using platform::require;
 
 constexpr double boardBorder = 3.0; // points
-constexpr int alertPanelAnimation = 5;
-constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
-constexpr int hiddenTitle = 1;
 
 Rect mainScreenFrame()
 {
@@ -243,7 +240,7 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     if (win_type == WindowType::whiteboard && m_sharingNotificationWindow) {
         centreBanner();
         platform::WindowAttributes attributes = m_sharingNotificationWindow->attributes();
-        attributes.animationBehavior = alertPanelAnimation;
+        attributes.animationBehavior = platform::AnimationBehavior::alertPanel;
         m_sharingNotificationWindow->setAttributes(attributes);
     }
 }
@@ -254,14 +251,14 @@ void DrawingWindowController::coverScreen(const QScreen &screen)
     attributes.ignoresMouseEvents = false;
     attributes.isOpaque = false;
     attributes.backgroundColor = Qt::transparent;
-    attributes.collectionBehavior = onAllDesktopsAndBesideFullScreen;
+    attributes.collectionBehavior = platform::everywhere;
     attributes.styleMask |= platform::StyleMask::fullSizeContentView;
     attributes.styleMask &= ~(platform::StyleMask::closable | platform::StyleMask::miniaturizable
         | platform::StyleMask::resizable);
-    attributes.titleVisibility = hiddenTitle;
+    attributes.titleVisibility = platform::TitleVisibility::hidden;
     attributes.titlebarAppearsTransparent = true;
     attributes.hasShadow = false;
-    attributes.level = platform::mainMenuWindowLevel;
+    attributes.level = platform::WindowLevel::mainMenu;
     m_drawingWindow->setAttributes(attributes);
     m_drawingWindow->setFrame(platform::frameOfScreen(screen), Animate::No);
 }

@@ -90,7 +90,7 @@ void DrawingWindowController::setNotificationWindowProperties(platform::Window &
     platform::requireGuiThread();
     platform::WindowAttributes attributes = window.attributes();
     attributes.isOpaque = false;
-    attributes.sharingType = 0;
+    attributes.sharingType = platform::SharingType::none;
     attributes.titlebarAppearsTransparent = true;
     attributes.backgroundColor = Qt::transparent;
     window.setAttributes(attributes);

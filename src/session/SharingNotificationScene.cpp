@@ -39,7 +39,7 @@ std::unique_ptr<QObject> makeSharingNotificationScene()
 {
     auto window = std::make_unique<platform::Window>();
     platform::WindowAttributes attributes;
-    attributes.styleMask = 0; // no frame, only the content
+    attributes.styleMask = {}; // no frame, only the content
     window->setAttributes(attributes);
     Ui::SharingNotification scene;
     scene.setupUi(window.get());

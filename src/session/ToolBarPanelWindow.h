@@ -16,7 +16,7 @@ public:
         : Window(parent)
     { }
     /// All four go to the panel's own constructor as they are.
-    ToolBarPanelWindow(const platform::Rect &contentRect, unsigned styleMask,
+    ToolBarPanelWindow(const platform::Rect &contentRect, platform::StyleMasks styleMask,
         platform::BackingStore backing, bool defer)
         : Window(contentRect, styleMask, backing, defer)
     { }

@@ -15,8 +15,6 @@ namespace {
 using platform::require;
 
 constexpr int settleTime = 200; // ms, between letting go of the panel and pulling it back
-constexpr unsigned onAllDesktopsAndBesideFullScreen = 257;
-constexpr int hiddenTitle = 1;
 
 // The work area of the screen that the panel stands on, or at least its parent.
 platform::Rect reachableBeside(const platform::Rect &parent, const platform::Rect &panel)
@@ -50,16 +48,16 @@ void ToolPanelWindowController::windowDidLoad()
     platform::WindowAttributes attributes = panel.attributes();
     attributes.backgroundColor = Qt::transparent;
     attributes.isOpaque = false;
-    attributes.collectionBehavior = onAllDesktopsAndBesideFullScreen;
+    attributes.collectionBehavior = platform::everywhere;
     attributes.titlebarAppearsTransparent = true;
     attributes.styleMask &= ~(platform::StyleMask::titled | platform::StyleMask::closable
         | platform::StyleMask::miniaturizable | platform::StyleMask::resizable);
     attributes.styleMask |= platform::StyleMask::fullSizeContentView;
-    attributes.titleVisibility = hiddenTitle;
+    attributes.titleVisibility = platform::TitleVisibility::hidden;
     attributes.showsToolbarButton = false;
     attributes.isMovableByWindowBackground = true;
-    attributes.sharingType = 0;
-    attributes.level = platform::mainMenuWindowLevel;
+    attributes.sharingType = platform::SharingType::none;
+    attributes.level = platform::WindowLevel::mainMenu;
     panel.setAttributes(attributes);
     panel.setDelegate(this);
 }

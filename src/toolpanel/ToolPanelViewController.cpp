@@ -33,9 +33,6 @@ constexpr double panelBorderWidth = 0.7; // points
 constexpr double endButtonRadius = 2.0; // points
 constexpr double endFontSize = 12.0; // points
 constexpr double popoverGap = 10.0; // points, between panel and popover
-constexpr int hiddenTitle = 1;
-constexpr int utilityWindowAnimation = 4;
-constexpr unsigned lowestStyleBits = 15; // title bar, its buttons, resizing
 
 template <class View>
 View &outlet(const QPointer<View> &view)
@@ -105,15 +102,15 @@ void ToolPanelViewController::makePopoverWindow(std::unique_ptr<PopoverViewContr
     m_popoverW = std::make_unique<platform::Window>();
     m_popoverW->setObjectName(QStringLiteral("popover"));
     platform::WindowAttributes attributes;
-    attributes.styleMask = platform::StyleMask::unifiedTitleAndToolbar & ~lowestStyleBits;
-    attributes.sharingType = 0;
-    attributes.titleVisibility = hiddenTitle;
+    attributes.styleMask = platform::StyleMask::unifiedTitleAndToolbar;
+    attributes.sharingType = platform::SharingType::none;
+    attributes.titleVisibility = platform::TitleVisibility::hidden;
     attributes.titlebarAppearsTransparent = true;
     attributes.isOpaque = false;
     attributes.backgroundColor = Qt::transparent;
     attributes.isMovable = false;
-    attributes.level = platform::mainMenuWindowLevel;
-    attributes.animationBehavior = utilityWindowAnimation;
+    attributes.level = platform::WindowLevel::mainMenu;
+    attributes.animationBehavior = platform::AnimationBehavior::utilityWindow;
     m_popoverW->setAttributes(attributes);
     const platform::Size size
         = require(m_popoverVc->view(), "the popovers have no view")->frame().size();

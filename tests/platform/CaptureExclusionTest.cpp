@@ -15,8 +15,8 @@ using Identifiers = std::vector<WId>;
 WindowAttributes seen(bool isSeen)
 {
     WindowAttributes attributes;
-    attributes.styleMask = 0;
-    attributes.sharingType = isSeen ? 1 : 0;
+    attributes.styleMask = {};
+    attributes.sharingType = isSeen ? SharingType::readOnly : SharingType::none;
     return attributes;
 }
 
@@ -140,7 +140,7 @@ TEST_F(CaptureExclusion, identifierThatTheDesktopGivesAnewIsTold)
     m_told.clear();
 
     WindowAttributes above = m_banner.attributes();
-    above.level = 24; // another kind of native window
+    above.level = WindowLevel::mainMenu; // another kind of native window
     m_banner.setAttributes(above);
     QCoreApplication::processEvents();
 

@@ -56,7 +56,7 @@ TEST(OwnLook, windowOpenedUnderASheetHasItsOwnSize)
 TEST(OwnLook, openWindowKeepsItsSizeWhenASheetComes)
 {
     WindowAttributes attributes;
-    attributes.styleMask = 0;
+    attributes.styleMask = {};
     Window window;
     window.setAttributes(attributes);
     window.setFrame({ 100, 100, 52, 60 });

@@ -28,7 +28,7 @@ protected:
         : m_content(*new RecordingView(&m_window))
     {
         WindowAttributes borderless;
-        borderless.styleMask = 0;
+        borderless.styleMask = {};
         m_window.setAttributes(borderless);
         m_window.setFrame({ 300.0, 300.0, 200.0, 100.0 });
         m_window.setContentView(&m_content);

@@ -19,12 +19,12 @@ TEST_F(WindowAttribute, newWindowIsAnOrdinaryOne)
 {
     const WindowAttributes &attributes = m_window.attributes();
 
-    EXPECT_EQ(attributes.styleMask, 7U);
-    EXPECT_EQ(attributes.collectionBehavior, 0U);
-    EXPECT_EQ(attributes.level, 0);
-    EXPECT_EQ(attributes.sharingType, 1U);
-    EXPECT_EQ(attributes.titleVisibility, 0U);
-    EXPECT_EQ(attributes.animationBehavior, 0);
+    EXPECT_EQ(attributes.styleMask.toInt(), 7U);
+    EXPECT_EQ(attributes.collectionBehavior, CollectionBehaviors());
+    EXPECT_EQ(attributes.level, WindowLevel::normal);
+    EXPECT_EQ(attributes.sharingType, SharingType::readOnly);
+    EXPECT_EQ(attributes.titleVisibility, TitleVisibility::visible);
+    EXPECT_EQ(attributes.animationBehavior, AnimationBehavior::byDefault);
     EXPECT_FALSE(attributes.titlebarAppearsTransparent);
     EXPECT_TRUE(attributes.hasShadow);
     EXPECT_TRUE(attributes.isOpaque);
@@ -37,12 +37,12 @@ TEST_F(WindowAttribute, newWindowIsAnOrdinaryOne)
 TEST_F(WindowAttribute, everyValueIsKeptAsItWasSet)
 {
     WindowAttributes attributes;
-    attributes.styleMask = 0xFFF1;
-    attributes.collectionBehavior = 257;
-    attributes.level = -3;
-    attributes.sharingType = 0;
-    attributes.titleVisibility = 1;
-    attributes.animationBehavior = 5;
+    attributes.styleMask = StyleMasks::fromInt(0xFFF1);
+    attributes.collectionBehavior = CollectionBehaviors::fromInt(257);
+    attributes.level = static_cast<WindowLevel>(-3);
+    attributes.sharingType = SharingType::none;
+    attributes.titleVisibility = TitleVisibility::hidden;
+    attributes.animationBehavior = AnimationBehavior::alertPanel;
     attributes.titlebarAppearsTransparent = true;
     attributes.hasShadow = false;
     attributes.isOpaque = false;
@@ -56,14 +56,29 @@ TEST_F(WindowAttribute, everyValueIsKeptAsItWasSet)
     EXPECT_EQ(m_window.windowFlags(), windowFlagsFor(attributes));
 }
 
-TEST_F(WindowAttribute, styleMaskHasItsRawValues)
+// What a native window of the desktop that the words come from is sent.
+TEST_F(WindowAttribute, namesHaveTheirRawValues)
 {
-    EXPECT_EQ(StyleMask::titled, 1U);
-    EXPECT_EQ(StyleMask::closable, 2U);
-    EXPECT_EQ(StyleMask::miniaturizable, 4U);
-    EXPECT_EQ(StyleMask::resizable, 8U);
-    EXPECT_EQ(StyleMask::unifiedTitleAndToolbar, 4096U);
-    EXPECT_EQ(StyleMask::fullSizeContentView, 32768U);
+    const auto raw = [](auto value) { return static_cast<int>(value); };
+
+    EXPECT_EQ(raw(StyleMask::titled), 1);
+    EXPECT_EQ(raw(StyleMask::closable), 2);
+    EXPECT_EQ(raw(StyleMask::miniaturizable), 4);
+    EXPECT_EQ(raw(StyleMask::resizable), 8);
+    EXPECT_EQ(raw(StyleMask::unifiedTitleAndToolbar), 4096);
+    EXPECT_EQ(raw(StyleMask::fullSizeContentView), 32768);
+    EXPECT_EQ(raw(CollectionBehavior::canJoinAllSpaces), 1);
+    EXPECT_EQ(raw(CollectionBehavior::fullScreenAuxiliary), 256);
+    EXPECT_EQ(everywhere.toInt(), 257U);
+    EXPECT_EQ(raw(WindowLevel::normal), 0);
+    EXPECT_EQ(raw(WindowLevel::mainMenu), 24);
+    EXPECT_EQ(raw(SharingType::none), 0);
+    EXPECT_EQ(raw(SharingType::readOnly), 1);
+    EXPECT_EQ(raw(TitleVisibility::visible), 0);
+    EXPECT_EQ(raw(TitleVisibility::hidden), 1);
+    EXPECT_EQ(raw(AnimationBehavior::byDefault), 0);
+    EXPECT_EQ(raw(AnimationBehavior::utilityWindow), 4);
+    EXPECT_EQ(raw(AnimationBehavior::alertPanel), 5);
 }
 
 TEST_F(WindowAttribute, windowThatIsNotOpaqueShowsWhatLiesBelow)
@@ -94,7 +109,7 @@ TEST_F(WindowAttribute, onlyWindowsWithATitleTakeTheKeysWhenTheyAreShown)
 {
     EXPECT_FALSE(m_window.testAttribute(Qt::WA_ShowWithoutActivating));
     WindowAttributes borderless;
-    borderless.styleMask = 0;
+    borderless.styleMask = {};
 
     m_window.setAttributes(borderless);
 
@@ -105,7 +120,7 @@ TEST_F(WindowAttribute, windowStaysOnTheScreenWhenItsFlagsChange)
 {
     show(m_window);
     WindowAttributes attributes;
-    attributes.level = mainMenuWindowLevel;
+    attributes.level = WindowLevel::mainMenu;
 
     m_window.setAttributes(attributes);
 
@@ -117,7 +132,7 @@ TEST_F(WindowAttribute, windowStaysOnTheScreenWhenItsFlagsChange)
 TEST_F(WindowAttribute, hiddenWindowStaysHiddenWhenItsFlagsChange)
 {
     WindowAttributes attributes;
-    attributes.level = mainMenuWindowLevel;
+    attributes.level = WindowLevel::mainMenu;
 
     m_window.setAttributes(attributes);
 

@@ -59,8 +59,8 @@ TEST(WindowController, windowFromElsewhereIsTakenWithoutBeingLoaded)
 TEST(WindowController, windowThatTakesNoKeysIsShownWithoutAskingForThem)
 {
     WindowController controller;
-    controller.setWindow(
-        std::make_unique<Window>(Rect { 0, 0, 40, 30 }, 0U, BackingStore::Buffered, false));
+    controller.setWindow(std::make_unique<Window>(
+        Rect { 0, 0, 40, 30 }, StyleMasks(), BackingStore::Buffered, false));
     controller.window()->winId();
     static QStringList warnings;
     warnings.clear();

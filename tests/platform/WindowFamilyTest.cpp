@@ -16,7 +16,7 @@ protected:
     WindowFamily()
     {
         WindowAttributes borderless;
-        borderless.styleMask = 0;
+        borderless.styleMask = {};
         m_child.setAttributes(borderless);
         m_grandchild.setAttributes(borderless);
         m_window.setFrame({ 320.0, 180.0, 640.0, 360.0 });
@@ -259,7 +259,7 @@ TEST_F(WindowFamily, familyIsStillThereAfterTheParentsFlagsChanged)
 {
     showAll();
     WindowAttributes attributes = m_window.attributes();
-    attributes.level = 24;
+    attributes.level = WindowLevel::mainMenu;
 
     m_window.setAttributes(attributes);
 

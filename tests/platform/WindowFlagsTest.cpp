@@ -31,7 +31,7 @@ TEST(WindowFlags, resizableWindowMayBeMaximised)
 TEST(WindowFlags, windowWithoutATitleIsAToolThatTakesNoKeys)
 {
     WindowAttributes attributes;
-    attributes.styleMask = 0;
+    attributes.styleMask = {};
 
     EXPECT_FALSE(canBecomeKey(attributes));
     EXPECT_EQ(windowFlagsFor(attributes),
@@ -44,7 +44,7 @@ TEST(WindowFlags, hiddenTitleOverTheContentLeavesNoTitleBarButTheKeys)
     WindowAttributes attributes;
     attributes.styleMask = StyleMask::titled | StyleMask::fullSizeContentView;
     attributes.titlebarAppearsTransparent = true;
-    attributes.titleVisibility = 1;
+    attributes.titleVisibility = TitleVisibility::hidden;
 
     EXPECT_TRUE(canBecomeKey(attributes));
     EXPECT_EQ(
@@ -58,10 +58,10 @@ TEST(WindowFlags, titleBarStaysWhileAnyOfItsPartsIsSeen)
     shown.titlebarAppearsTransparent = true;
     WindowAttributes opaque = shown;
     opaque.titlebarAppearsTransparent = false;
-    opaque.titleVisibility = 1;
+    opaque.titleVisibility = TitleVisibility::hidden;
     WindowAttributes beside = shown;
     beside.styleMask = StyleMask::titled;
-    beside.titleVisibility = 1;
+    beside.titleVisibility = TitleVisibility::hidden;
 
     for (const WindowAttributes &attributes : { shown, opaque, beside })
         EXPECT_EQ(windowFlagsFor(attributes), Qt::Window | Qt::CustomizeWindowHint | titleBar);
@@ -70,10 +70,10 @@ TEST(WindowFlags, titleBarStaysWhileAnyOfItsPartsIsSeen)
 TEST(WindowFlags, onlyALevelAboveTheOrdinaryOneStaysOnTop)
 {
     WindowAttributes attributes;
-    attributes.level = mainMenuWindowLevel;
+    attributes.level = WindowLevel::mainMenu;
     EXPECT_EQ(windowFlagsFor(attributes), ordinary | Qt::WindowStaysOnTopHint);
 
-    attributes.level = -1;
+    attributes.level = static_cast<WindowLevel>(-1);
     EXPECT_EQ(windowFlagsFor(attributes), ordinary);
 }
 
@@ -86,11 +86,6 @@ TEST(WindowFlags, shadowAndMouseAreTakenAwayByOneFlagEach)
     attributes.hasShadow = true;
     attributes.ignoresMouseEvents = true;
     EXPECT_EQ(windowFlagsFor(attributes), ordinary | Qt::WindowTransparentForInput);
-}
-
-TEST(WindowFlags, mainMenuIsLevelTwentyFour)
-{
-    EXPECT_EQ(mainMenuWindowLevel, 24);
 }
 
 } // namespace penwick::platform

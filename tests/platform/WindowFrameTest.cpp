@@ -98,7 +98,7 @@ TEST_F(WindowFrame, originIsSetWithoutTheSize)
 TEST_F(WindowFrame, borderlessWindowFillsItsFrame)
 {
     WindowAttributes borderless;
-    borderless.styleMask = 0;
+    borderless.styleMask = {};
     m_window.setAttributes(borderless);
     m_window.setFrame(place);
 
@@ -113,7 +113,7 @@ TEST_F(WindowFrame, windowThatLosesItsTitleBarKeepsItsFrame)
     m_window.setFrame(place);
     show(m_window);
     WindowAttributes borderless;
-    borderless.styleMask = 0;
+    borderless.styleMask = {};
 
     m_window.setAttributes(borderless);
     settle(m_window);

@@ -205,7 +205,7 @@ TEST_F(WindowShapeTest, thatTheUserCannotResizeIsLeftAlone)
 {
     showAt(place);
     WindowAttributes attributes = m_window.attributes();
-    attributes.styleMask &= ~StyleMask::resizable;
+    attributes.styleMask.setFlag(StyleMask::resizable, false);
     m_window.setAttributes(attributes);
     settle(m_window);
     pullTo({ 300, 200, 612, 450 });

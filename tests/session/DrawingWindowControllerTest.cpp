@@ -92,12 +92,12 @@ TEST_F(DrawingWindow, loadedWindowHasItsAttributes)
     const platform::WindowAttributes &attributes = controller->drawingWindow()->attributes();
 
     EXPECT_EQ(attributes.backgroundColor, QColor(Qt::white));
-    EXPECT_EQ(attributes.styleMask & platform::StyleMask::resizable, 8U);
-    EXPECT_EQ(attributes.styleMask & platform::StyleMask::titled, 1U);
-    EXPECT_EQ(attributes.styleMask & platform::StyleMask::closable, 2U);
+    EXPECT_EQ((attributes.styleMask & platform::StyleMask::resizable).toInt(), 8U);
+    EXPECT_EQ((attributes.styleMask & platform::StyleMask::titled).toInt(), 1U);
+    EXPECT_EQ((attributes.styleMask & platform::StyleMask::closable).toInt(), 2U);
     EXPECT_TRUE(attributes.hasShadow);
     EXPECT_EQ(attributes.aspectRatio, (platform::Size { 16.0, 9.0 }));
-    EXPECT_EQ(attributes.level, 0);
+    EXPECT_EQ(attributes.level, platform::WindowLevel::normal);
 }
 
 TEST_F(DrawingWindow, titleIsTheKeyWithoutATranslation)

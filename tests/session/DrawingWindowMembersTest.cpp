@@ -236,11 +236,11 @@ TEST_F(DrawingWindowMembers, onlyAWhiteboardsBannerIsCentredBeforeItIsShown)
     for (const WindowType type : { WindowType::annotation, WindowType::imageAnnotation }) {
         static_cast<void>(printedAs(type));
         EXPECT_EQ(banner.frame(), unplaced);
-        EXPECT_EQ(banner.attributes().animationBehavior, 0);
+        EXPECT_EQ(banner.attributes().animationBehavior, platform::AnimationBehavior::byDefault);
     }
     static_cast<void>(printedAs(WindowType::whiteboard));
     EXPECT_EQ(banner.frame().origin(), (Point { 810, 510 }));
-    EXPECT_EQ(banner.attributes().animationBehavior, 5);
+    EXPECT_EQ(banner.attributes().animationBehavior, platform::AnimationBehavior::alertPanel);
 }
 
 TEST_F(DrawingWindowMembers, entryObjectHoldsTheControllerThatItIsGiven)

@@ -269,7 +269,7 @@ TEST(OnAnotherThread, namesAndPlainValuesAreForAnyThread)
     std::thread([] {
         EXPECT_FALSE(penwickSessionEndNotificationKey().isEmpty());
         EXPECT_EQ(windowTypeFromRawValue(1), WindowType::annotation);
-        EXPECT_EQ(platform::WindowAttributes().sharingType, 1U);
+        EXPECT_EQ(platform::WindowAttributes().sharingType, platform::SharingType::readOnly);
     }).join();
 }
 

@@ -153,7 +153,7 @@ TEST_F(SharingBanner, anyWindowIsMadeABannerTheSameWay)
     m_controller->setNotificationWindowProperties(window);
 
     EXPECT_FALSE(window.attributes().isOpaque);
-    EXPECT_EQ(window.attributes().sharingType, 0U);
+    EXPECT_EQ(window.attributes().sharingType, platform::SharingType::none);
     EXPECT_TRUE(window.attributes().titlebarAppearsTransparent);
     EXPECT_EQ(window.attributes().backgroundColor, QColor(Qt::transparent));
     EXPECT_EQ(window.grab().toImage().pixelColor(10, 10).alpha(), 0);

@@ -97,10 +97,12 @@ TEST_F(ToolPanelWindow, panelIsWhatItsFourWordsSay)
 {
     const Rect frame { 10, 20, 60, 400 };
 
-    const ToolBarPanelWindow panel(frame, 8U + 32768U, platform::BackingStore::Buffered, true);
+    const ToolBarPanelWindow panel(frame,
+        platform::StyleMask::resizable | platform::StyleMask::fullSizeContentView,
+        platform::BackingStore::Buffered, true);
 
     EXPECT_EQ(panel.frame(), frame);
-    EXPECT_EQ(panel.attributes().styleMask, 8U + 32768U);
+    EXPECT_EQ(panel.attributes().styleMask.toInt(), 8U + 32768U);
     EXPECT_FALSE(panel.isVisible());
 }
 
@@ -118,15 +120,15 @@ TEST_F(ToolPanelWindow, loadedPanelHasItsAttributes)
     EXPECT_EQ(controller->toolPanelWindow()->windowController(), controller.get());
     EXPECT_EQ(attributes.backgroundColor.alpha(), 0);
     EXPECT_FALSE(attributes.isOpaque);
-    EXPECT_EQ(attributes.collectionBehavior, 257U);
+    EXPECT_EQ(attributes.collectionBehavior.toInt(), 257U);
     EXPECT_TRUE(attributes.titlebarAppearsTransparent);
-    EXPECT_EQ(attributes.styleMask & 15U, 0U);
-    EXPECT_EQ(attributes.styleMask & 32768U, 32768U);
-    EXPECT_EQ(attributes.titleVisibility, 1U);
+    EXPECT_EQ(attributes.styleMask.toInt() & 15U, 0U);
+    EXPECT_EQ(attributes.styleMask.toInt() & 32768U, 32768U);
+    EXPECT_EQ(attributes.titleVisibility, platform::TitleVisibility::hidden);
     EXPECT_FALSE(attributes.showsToolbarButton);
     EXPECT_TRUE(attributes.isMovableByWindowBackground);
-    EXPECT_EQ(attributes.sharingType, 0U);
-    EXPECT_EQ(attributes.level, 24);
+    EXPECT_EQ(attributes.sharingType, platform::SharingType::none);
+    EXPECT_EQ(attributes.level, platform::WindowLevel::mainMenu);
 }
 
 TEST_F(ToolPanelWindow, neverTakesTheKeys)

@@ -62,12 +62,12 @@ TEST_F(WindowKinds, annotationCoversExactlyTheGivenScreen)
     EXPECT_FALSE(attributes.ignoresMouseEvents);
     EXPECT_FALSE(attributes.isOpaque);
     EXPECT_EQ(attributes.backgroundColor, QColor(Qt::transparent));
-    EXPECT_EQ(attributes.collectionBehavior, 257U);
-    EXPECT_EQ(attributes.styleMask, 32768U | 1U);
-    EXPECT_EQ(attributes.titleVisibility, 1U);
+    EXPECT_EQ(attributes.collectionBehavior.toInt(), 257U);
+    EXPECT_EQ(attributes.styleMask.toInt(), 32768U | 1U);
+    EXPECT_EQ(attributes.titleVisibility, platform::TitleVisibility::hidden);
     EXPECT_TRUE(attributes.titlebarAppearsTransparent);
     EXPECT_FALSE(attributes.hasShadow);
-    EXPECT_EQ(attributes.level, 24);
+    EXPECT_EQ(attributes.level, platform::WindowLevel::mainMenu);
     EXPECT_EQ(controller.drawingWindow()->contentView()->layer()->borderWidth, 0.0);
 }
 
@@ -137,8 +137,8 @@ TEST_F(WindowKinds, bannerStandsInTheMiddleAndGoesAfterOneAndAHalfSeconds)
     DrawingWindowController &controller = open(WindowType::whiteboard, primary());
     Window &banner = *controller.sharingNotificationWindow();
     EXPECT_EQ(banner.frame(), (Rect { 810, 510, 300, 60 }));
-    EXPECT_EQ(banner.attributes().animationBehavior, 5);
-    EXPECT_EQ(banner.attributes().sharingType, 0U);
+    EXPECT_EQ(banner.attributes().animationBehavior, platform::AnimationBehavior::alertPanel);
+    EXPECT_EQ(banner.attributes().sharingType, platform::SharingType::none);
     EXPECT_FALSE(banner.attributes().isOpaque);
     EXPECT_FALSE(banner.isVisible());
     controller.showWindow(nullptr);

@@ -10,8 +10,6 @@ namespace penwick::test {
 
 namespace {
 
-using platform::StyleMask::unifiedTitleAndToolbar;
-
 class ToolPanel : public ToolPanelFixture
 {
 protected:
@@ -205,15 +203,15 @@ TEST_F(ToolPanel, popoverWindowHasItsAttributes)
 {
     const platform::WindowAttributes &attributes = popover().attributes();
 
-    EXPECT_EQ(attributes.styleMask, 4096U);
-    EXPECT_EQ(attributes.sharingType, 0U);
-    EXPECT_EQ(attributes.titleVisibility, 1U);
+    EXPECT_EQ(attributes.styleMask.toInt(), 4096U);
+    EXPECT_EQ(attributes.sharingType, platform::SharingType::none);
+    EXPECT_EQ(attributes.titleVisibility, platform::TitleVisibility::hidden);
     EXPECT_TRUE(attributes.titlebarAppearsTransparent);
     EXPECT_FALSE(attributes.showsToolbarButton);
     EXPECT_FALSE(attributes.isMovable);
     EXPECT_EQ(attributes.backgroundColor.alpha(), 0);
     EXPECT_EQ(attributes.level, panel.attributes().level);
-    EXPECT_EQ(attributes.animationBehavior, 4);
+    EXPECT_EQ(attributes.animationBehavior, platform::AnimationBehavior::utilityWindow);
     EXPECT_EQ(popover().frame().size(), bar.popoverVc()->view()->frame().size());
 }
 

@@ -62,7 +62,7 @@ public:
     explicit Window(QWidget *parent = nullptr);
     /// A window of `styleMask` whose frame is `contentRect`; a title bar takes its room from it.
     /// `backing` and `defer` change nothing: the desktop has the window from its first showing on.
-    Window(const Rect &contentRect, unsigned styleMask, BackingStore backing, bool defer);
+    Window(const Rect &contentRect, StyleMasks styleMask, BackingStore backing, bool defer);
     ~Window() override;
 
     // Frame

@@ -5,31 +5,72 @@
 #include <penwick/platform/Geometry.h>
 
 #include <QColor>
+#include <QFlags>
 
 #include <optional>
 
 namespace penwick::platform {
 
-/// Bits of a window's style mask.
-namespace StyleMask {
-constexpr unsigned titled = 1;
-constexpr unsigned closable = 2;
-constexpr unsigned miniaturizable = 4;
-constexpr unsigned resizable = 8;
-constexpr unsigned unifiedTitleAndToolbar = 4096;
-constexpr unsigned fullSizeContentView = 32768;
-} // namespace StyleMask
+/// What a window has around its content. Flags.
+enum class StyleMask : unsigned
+{
+    titled = 1,
+    closable = 2,
+    miniaturizable = 4,
+    resizable = 8,
+    unifiedTitleAndToolbar = 4096,
+    fullSizeContentView = 32768 ///< the content reaches under the title bar
+};
+Q_DECLARE_FLAGS(StyleMasks, StyleMask)
+Q_DECLARE_OPERATORS_FOR_FLAGS(StyleMasks)
+
+/// How a window behaves on virtual desktops and beside windows that fill the screen. Flags.
+enum class CollectionBehavior : unsigned
+{
+    canJoinAllSpaces = 1, ///< it is on all virtual desktops
+    fullScreenAuxiliary = 256 ///< it may stand beside a window that fills the screen
+};
+Q_DECLARE_FLAGS(CollectionBehaviors, CollectionBehavior)
+Q_DECLARE_OPERATORS_FOR_FLAGS(CollectionBehaviors)
+
+/// Windows of a higher level stand above those of a lower one.
+enum class WindowLevel : int
+{
+    normal = 0,
+    mainMenu = 24 ///< above docks too
+};
+
+/// Who may see what a window holds.
+enum class SharingType : unsigned
+{
+    none = 0, ///< not to be seen by a capture of the screen
+    readOnly = 1
+};
+
+enum class TitleVisibility : unsigned
+{
+    visible = 0,
+    hidden = 1
+};
+
+/// How a window appears and disappears.
+enum class AnimationBehavior : int
+{
+    byDefault = 0,
+    utilityWindow = 4,
+    alertPanel = 5
+};
 
 /// What a window is like. Each value is kept as it is set; a value that the desktop does not know
-/// has no effect there.
+/// has no effect there. The enumerations have AppKit's raw values.
 struct WindowAttributes
 {
-    unsigned styleMask = StyleMask::titled | StyleMask::closable | StyleMask::miniaturizable;
-    unsigned collectionBehavior = 0; ///< 1: on all virtual desktops; 256: beside full screen
-    int level = 0; ///< 0: an ordinary window; above 0: over those
-    unsigned sharingType = 1; ///< 0: not to be seen by a capture of the screen
-    unsigned titleVisibility = 0; ///< 1: hidden
-    int animationBehavior = 0;
+    StyleMasks styleMask = StyleMask::titled | StyleMask::closable | StyleMask::miniaturizable;
+    CollectionBehaviors collectionBehavior;
+    WindowLevel level = WindowLevel::normal;
+    SharingType sharingType = SharingType::readOnly;
+    TitleVisibility titleVisibility = TitleVisibility::visible;
+    AnimationBehavior animationBehavior = AnimationBehavior::byDefault;
     bool titlebarAppearsTransparent = false;
     bool hasShadow = true;
     bool isOpaque = true;

@@ -53,6 +53,6 @@ double NativeDesktop::hotSpotScale(double devicePixelRatio)
 
 void NativeDesktop::keepContentRatio(QWindow &, const QSize &) { }
 
-void NativeDesktop::applyAttributes(QWindow &, const NativeWindowValues &) { }
+void NativeDesktop::applyAttributes(QWindow &, const WindowAttributes &) { }
 
 } // namespace penwick::platform

@@ -3,7 +3,7 @@
 // of its own.
 #pragma once
 
-#include "platform/native/NativeWindowValues.h"
+#include <penwick/platform/WindowAttributes.h>
 
 #include <QMargins>
 #include <QPoint>
@@ -57,9 +57,9 @@ public:
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that
     /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);
-    /// Applies what the desktop can do of `values` once `window` is on the screen, such as showing
+    /// Applies what the desktop can do of `attributes` once `window` is on the screen, such as showing
     /// it on every virtual desktop or keeping it out of captures.
-    virtual void applyAttributes(QWindow &window, const NativeWindowValues &values);
+    virtual void applyAttributes(QWindow &window, const WindowAttributes &attributes);
 };
 
 /// The desktop of this build's platform; null where the running application is not on it.

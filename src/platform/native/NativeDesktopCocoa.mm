@@ -29,17 +29,18 @@ public:
             native.contentAspectRatio = NSMakeSize(content.width(), content.height());
     }
 
-    void applyAttributes(QWindow &window, const NativeWindowValues &values) override
+    void applyAttributes(QWindow &window, const WindowAttributes &attributes) override
     {
         NSWindow *const native = nativeWindow(window);
-        native.styleMask = values.styleMask;
-        native.collectionBehavior = values.collectionBehavior;
-        native.level = values.level;
-        native.sharingType = static_cast<NSWindowSharingType>(values.sharingType);
-        native.titleVisibility = static_cast<NSWindowTitleVisibility>(values.titleVisibility);
-        native.titlebarAppearsTransparent = values.titlebarAppearsTransparent;
-        native.animationBehavior = static_cast<NSWindowAnimationBehavior>(values.animationBehavior);
-        native.hasShadow = values.hasShadow;
+        native.styleMask = attributes.styleMask.toInt();
+        native.collectionBehavior = attributes.collectionBehavior.toInt();
+        native.level = static_cast<NSWindowLevel>(attributes.level);
+        native.sharingType = static_cast<NSWindowSharingType>(attributes.sharingType);
+        native.titleVisibility = static_cast<NSWindowTitleVisibility>(attributes.titleVisibility);
+        native.titlebarAppearsTransparent = attributes.titlebarAppearsTransparent;
+        native.animationBehavior
+            = static_cast<NSWindowAnimationBehavior>(attributes.animationBehavior);
+        native.hasShadow = attributes.hasShadow;
     }
 
 private:

@@ -18,10 +18,10 @@ public:
         return QOperatingSystemVersion::current() >= QOperatingSystemVersion::Windows10_2004;
     }
 
-    void applyAttributes(QWindow &window, const NativeWindowValues &values) override
+    void applyAttributes(QWindow &window, const WindowAttributes &attributes) override
     {
         SetWindowDisplayAffinity(reinterpret_cast<HWND>(window.winId()),
-            values.isLeftOutOfCaptures ? WDA_EXCLUDEFROMCAPTURE : WDA_NONE);
+            attributes.sharingType == SharingType::none ? WDA_EXCLUDEFROMCAPTURE : WDA_NONE);
     }
 };
 

@@ -90,10 +90,10 @@ public:
         m_frames.keepContentRatio(static_cast<xcb_window_t>(window.winId()), content);
     }
 
-    void applyAttributes(QWindow &window, const NativeWindowValues &values) override
+    void applyAttributes(QWindow &window, const WindowAttributes &attributes) override
     {
         // Nothing on this desktop keeps a window out of a capture; the host has to leave it out.
-        if (values.isOnAllDesktops)
+        if (attributes.collectionBehavior.testFlag(CollectionBehavior::canJoinAllSpaces))
             askToRoot(static_cast<xcb_window_t>(window.winId()), m_desktop, allDesktops);
     }
 

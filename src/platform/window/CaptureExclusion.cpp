@@ -3,7 +3,6 @@
 
 #include "platform/foundation/GuiThread.h"
 #include "platform/native/NativeDesktop.h"
-#include "platform/native/NativeWindowValues.h"
 #include "platform/window/WindowPrivate.h"
 
 #include <QEvent>
@@ -16,7 +15,7 @@ namespace {
 
 bool isNotToBeSeen(const Window &window)
 {
-    return nativeWindowValues(window.attributes()).isLeftOutOfCaptures;
+    return window.attributes().sharingType == SharingType::none;
 }
 
 } // namespace

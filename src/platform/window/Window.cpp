@@ -46,7 +46,7 @@ Window::Window(QWidget *parent)
     applyAttributes();
 }
 
-Window::Window(const Rect &contentRect, unsigned styleMask, BackingStore, bool)
+Window::Window(const Rect &contentRect, StyleMasks styleMask, BackingStore, bool)
     : Window()
 {
     WindowAttributes attributes;
@@ -382,7 +382,7 @@ void Window::setVisible(bool visible)
     QWidget::setVisible(visible);
     if (!visible)
         return hideFamily();
-    NativeDesktop::instance().applyAttributes(*windowHandle(), nativeWindowValues(m_attributes));
+    NativeDesktop::instance().applyAttributes(*windowHandle(), m_attributes);
     showFamily();
 }
 

@@ -10,15 +10,16 @@ bool hasVisibleTitleBar(const WindowAttributes &attributes)
 {
     if (!canBecomeKey(attributes))
         return false;
-    return !((attributes.styleMask & StyleMask::fullSizeContentView)
-        && attributes.titlebarAppearsTransparent && attributes.titleVisibility == 1);
+    return !(attributes.styleMask.testFlag(StyleMask::fullSizeContentView)
+        && attributes.titlebarAppearsTransparent
+        && attributes.titleVisibility == TitleVisibility::hidden);
 }
 
 } // namespace
 
 bool canBecomeKey(const WindowAttributes &attributes)
 {
-    return (attributes.styleMask & StyleMask::titled) != 0;
+    return attributes.styleMask.testFlag(StyleMask::titled);
 }
 
 Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes)
@@ -29,13 +30,13 @@ Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes)
         flags |= Qt::WindowTitleHint | Qt::WindowSystemMenuHint;
     else
         flags |= Qt::FramelessWindowHint;
-    if (attributes.styleMask & StyleMask::closable)
+    if (attributes.styleMask.testFlag(StyleMask::closable))
         flags |= Qt::WindowCloseButtonHint;
-    if (attributes.styleMask & StyleMask::miniaturizable)
+    if (attributes.styleMask.testFlag(StyleMask::miniaturizable))
         flags |= Qt::WindowMinimizeButtonHint;
-    if (attributes.styleMask & StyleMask::resizable)
+    if (attributes.styleMask.testFlag(StyleMask::resizable))
         flags |= Qt::WindowMaximizeButtonHint;
-    if (attributes.level > 0)
+    if (attributes.level > WindowLevel::normal)
         flags |= Qt::WindowStaysOnTopHint;
     if (!attributes.hasShadow)
         flags |= Qt::NoDropShadowWindowHint;

@@ -8,8 +8,9 @@
 
 namespace penwick::platform {
 
-/// Level of the main menu: above every ordinary window and above docks.
-constexpr int mainMenuWindowLevel = 24;
+/// Of what is wherever its user goes.
+constexpr CollectionBehaviors everywhere
+    = CollectionBehavior::canJoinAllSpaces | CollectionBehavior::fullScreenAuxiliary;
 
 /// Whether the window may get the keys: only one that has a title bar, hidden or not.
 [[nodiscard]] bool canBecomeKey(const WindowAttributes &attributes);
