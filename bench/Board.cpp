@@ -5,6 +5,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/Window.h>
 
@@ -55,13 +56,14 @@ Board::Board(int strokes)
 {
     platform::Window &window = *platform::require(m_window->drawingWindow(), "no window opened");
     m_controller = platform::require(
-        dynamic_cast<DrawViewController *>(window.contentViewController()), "no draw controller");
+        dynamic_cast<DrawViewController *>(contentOf(window).contentViewController()),
+        "no draw controller");
     m_canvas = platform::require(m_controller->drawingView(), "the board has no canvas");
     m_window->showWindow(nullptr);
     settle();
     resize(canvasWidth, canvasHeight);
     settle();
-    window.makeFirstResponder(m_canvas);
+    contentOf(window).makeFirstResponder(m_canvas);
     Pen pen(7);
     scribble(pen, strokes);
 }

@@ -5,6 +5,7 @@
 
 #include "appearance/PenwickBundle.h"
 #include "platform/view/ViewOf.h"
+#include "platform/window/WindowContent.h"
 #include "textbox/TnTextBox.h"
 
 #include <penwick/platform/Window.h>
@@ -53,19 +54,19 @@ public:
         , m_box(TnTextBox::create({ corner.x, corner.y, 200, 30 }, 24.0, Qt::black))
     {
         m_paper->setWantsLayer(true);
-        m_window.adoptScene();
-        m_window.setContentView(m_paper);
+        contentOf(m_window).adoptScene();
+        contentOf(m_window).setContentView(m_paper);
         m_window.resize(1280, 720);
         m_window.show();
         m_window.activateWindow();
         m_box->setTextBoxDelegate(&m_owner);
         m_paper->addSubview(m_box);
-        m_window.makeFirstResponder(m_box.get());
+        contentOf(m_window).makeFirstResponder(m_box.get());
         settle();
     }
 
     TnTextBox &box() { return *m_box; }
-    void end() { m_window.makeFirstResponder(m_paper); }
+    void end() { contentOf(m_window).makeFirstResponder(m_paper); }
 
 private:
     Owner m_owner;

@@ -234,7 +234,9 @@ void DrawViewController::handleToolSelection(const QString &selectedTool)
         clearIfThereIsAnything();
         goBackToDrawing();
     } else if (selectedTool == Tools::state) {
-        require(view.window(), "the canvas to be ended is in no window")->close();
+        require(qobject_cast<platform::Window *>(view.widget().window()),
+            "the canvas to be ended is in no window")
+            ->close();
     } else if (selectedTool == Tools::undo) {
         history().undoAction();
         goBackToDrawing();

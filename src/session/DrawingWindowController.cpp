@@ -9,6 +9,7 @@
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/GuiThread.h"
 #include "platform/view/View.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WindowFlags.h"
 #include "session/PictureFit.h"
 #include "session/ToolPanelWindowController.h"
@@ -211,7 +212,8 @@ void DrawingWindowController::createWindowForApplication(WindowType win_type, QS
     m_minWindowWidth = screenFrame.width * 2 / 3;
     m_minWindowHeight = screenFrame.height * 2 / 3;
     require(m_drawingWindow.data(), "the drawing window is gone")->setScreen(&screen);
-    if (auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView()))
+    if (auto *const canvas
+        = dynamic_cast<DrawingCanvasView *>(platform::contentOf(*m_drawingWindow).contentView()))
         canvas->setCoversWindow(win_type == WindowType::whiteboard);
     switch (win_type) {
     case WindowType::annotation:
@@ -271,8 +273,8 @@ void DrawingWindowController::placeAsBoard(const Rect &frame)
 
 void DrawingWindowController::showBoardBorder()
 {
-    platform::View &canvas
-        = *require(m_drawingWindow->contentView(), "the drawing window has no content view");
+    platform::View &canvas = *require(platform::contentOf(*m_drawingWindow).contentView(),
+        "the drawing window has no content view");
     setViewBorder(canvas, TnhColors::borderGreenColor, boardBorder, 0.0);
 }
 
@@ -289,7 +291,8 @@ void DrawingWindowController::setAnnotationImage(
 
 DrawViewController &DrawingWindowController::content() const
 {
-    return *require(dynamic_cast<DrawViewController *>(m_drawingWindow->contentViewController()),
+    return *require(dynamic_cast<DrawViewController *>(
+                        platform::contentOf(*m_drawingWindow).contentViewController()),
         "the drawing window's content is no drawing");
 }
 

@@ -9,6 +9,7 @@
 #include "platform/foundation/KeptShape.h"
 #include "platform/foundation/OneShotTimer.h"
 #include "platform/foundation/StandardOutput.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WorkArea.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -201,7 +202,8 @@ void DrawingWindowController::hideThePopover()
     platform::requireGuiThread();
     if (!m_drawingWindow)
         return;
-    auto *const canvas = dynamic_cast<DrawingCanvasView *>(m_drawingWindow->contentView());
+    auto *const canvas
+        = dynamic_cast<DrawingCanvasView *>(platform::contentOf(*m_drawingWindow).contentView());
     if (canvas && canvas->popoverWindow())
         canvas->popoverWindow()->orderOut();
 }

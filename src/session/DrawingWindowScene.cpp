@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "session/DrawingWindowScene.h"
+#include "platform/window/WindowContent.h"
 
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
@@ -15,14 +16,14 @@ std::unique_ptr<QObject> makeDrawingWindowScene()
     auto window = std::make_unique<platform::Window>();
     Ui::DrawingWindow scene;
     scene.setupUi(window.get());
-    window->adoptScene();
+    platform::contentOf(*window).adoptScene();
     scene.drawingView->setWantsLayer(true); // its border, and those of the text boxes on it
 
     auto content = std::make_unique<DrawViewController>();
     content->setDrawingView(scene.drawingView);
     content->setAnnotatedImageView(scene.annotatedImageView);
     content->setView(*scene.drawingView);
-    window->setContentViewController(std::move(content));
+    platform::contentOf(*window).setContentViewController(std::move(content));
 
     auto controller = std::make_unique<DrawingWindowController>();
     window->setDelegate(controller.get());

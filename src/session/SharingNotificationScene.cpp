@@ -2,6 +2,7 @@
 #include "session/SharingNotificationScene.h"
 
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WorkArea.h"
 #include "session/BannerLabel.h"
 #include "session/SharingNotificationViewController.h"
@@ -44,11 +45,11 @@ std::unique_ptr<QObject> makeSharingNotificationScene()
     Ui::SharingNotification scene;
     scene.setupUi(window.get());
     growFor(scene, *window);
-    window->adoptScene();
+    platform::contentOf(*window).adoptScene();
 
     auto content = std::make_unique<SharingNotificationViewController>();
     content->setView(*scene.bannerView);
-    window->setContentViewController(std::move(content));
+    platform::contentOf(*window).setContentViewController(std::move(content));
 
     auto controller = std::make_unique<platform::WindowController>();
     controller->setWindow(std::move(window));

@@ -4,6 +4,7 @@
 #include "appearance/Theme.h"
 #include "platform/scene/ButtonImages.h"
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
 #include "toolpanel/ToolPanelViewController.h"
@@ -50,11 +51,11 @@ std::unique_ptr<QObject> makeToolPanelScene(const platform::Bundle &bundle)
         button->setAction([bar = content.get()](
                               platform::Button &sender) { bar->OnToolBarItemSelection(sender); });
     }
-    panel->adoptScene();
+    platform::contentOf(*panel).adoptScene();
     content->outlets() = outletsOf(scene);
     content->setView(*scene.toolPanelRoot);
     panel->expectChildWindow(*content->popoverW());
-    panel->setContentViewController(std::move(content));
+    platform::contentOf(*panel).setContentViewController(std::move(content));
 
     auto controller = std::make_unique<ToolPanelWindowController>();
     controller->setToolPanelWindow(panel.get());

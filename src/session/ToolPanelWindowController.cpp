@@ -3,6 +3,7 @@
 
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/OneShotTimer.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WindowFlags.h"
 #include "platform/window/WorkArea.h"
 #include "session/PanelClamp.h"
@@ -37,7 +38,8 @@ ToolPanelViewController &ToolPanelWindowController::content() const
 {
     const ToolBarPanelWindow *const panel
         = require(m_toolPanelWindow.data(), "the tool bar has no panel");
-    return *require(dynamic_cast<ToolPanelViewController *>(panel->contentViewController()),
+    return *require(dynamic_cast<ToolPanelViewController *>(
+                        platform::contentOf(*panel).contentViewController()),
         "the panel's content is no tool bar");
 }
 

@@ -30,7 +30,7 @@ void PopoverViewController::setPopoverViews(std::unique_ptr<PopoverView> text,
     m_brushPopoverView = std::move(brush);
     for (PopoverView *const view : { textPopoverView(), colorPopoverView(), brushPopoverView() }) {
         if (view)
-            view->setViewController(this);
+            view->setNextResponder(this);
     }
 }
 

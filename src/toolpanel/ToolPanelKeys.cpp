@@ -5,6 +5,7 @@
 #include "canvas/DrawingCanvasView.h"
 #include "platform/view/View.h"
 #include "platform/view/ViewInput.h"
+#include "platform/window/WindowContent.h"
 #include "toolpanel/ToolKeys.h"
 #include "toolpanel/ToolPanelButton.h"
 
@@ -70,7 +71,7 @@ bool ToolPanelViewController::performPopoverKey(const QKeyEvent &event)
         hidePopover();
         return true;
     }
-    const platform::View *const popover = m_popoverW->contentView();
+    const platform::View *const popover = platform::contentOf(*m_popoverW).contentView();
     const std::vector<platform::View *> options = popover->subviews().front()->subviews();
     const auto index = static_cast<std::size_t>(optionForKey(event));
     if (index >= options.size())

@@ -13,7 +13,7 @@
 #include "platform/view/OwnLook.h"
 #include "platform/view/PlainView.h"
 #include "platform/view/Workspace.h"
-#include "platform/window/WindowFlags.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WorkArea.h"
 #include "toolpanel/PopoverView.h"
 #include "toolpanel/PopoverViewController.h"
@@ -115,7 +115,7 @@ void ToolPanelViewController::makePopoverWindow(std::unique_ptr<PopoverViewContr
     const platform::Size size
         = require(m_popoverVc->view(), "the popovers have no view")->frame().size();
     m_popoverW->setFrame({ 0.0, 0.0, size.width, size.height });
-    m_popoverW->setContentViewController(std::move(popovers));
+    platform::contentOf(*m_popoverW).setContentViewController(std::move(popovers));
 }
 
 void ToolPanelViewController::observe()
@@ -148,13 +148,14 @@ void ToolPanelViewController::connectToDrawing()
 {
     platform::Window *const drawingWindow
         = require(panelWindow().parentWindow(), "the tool panel belongs to no drawing window");
-    platform::WindowController *const controller
-        = require(drawingWindow->windowController(), "the drawing window has no controller");
+    auto *const controller = require(
+        dynamic_cast<platform::WindowController *>(platform::contentOf(*drawingWindow).responder()),
+        "the drawing window has no controller");
     platform::Window *const window
         = require(controller->window(), "the drawing window's controller has no window");
-    auto *const drawing
-        = require(dynamic_cast<DrawViewController *>(window->contentViewController()),
-            "the drawing window's content is no drawing");
+    auto *const drawing = require(
+        dynamic_cast<DrawViewController *>(platform::contentOf(*window).contentViewController()),
+        "the drawing window's content is no drawing");
     m_toolSelectionDelegate = drawing;
     m_popoverVc->setToolPopoverDelegate(drawing);
     m_popoverVc->setToolPanelOptionDelegate(this);
@@ -304,7 +305,7 @@ void ToolPanelViewController::showPopoverIfRequired(PopoverChoice choice)
         return;
     }
     m_visiblePopover = choice;
-    m_popoverW->setContentView(popover);
+    platform::contentOf(*m_popoverW).setContentView(popover);
     panelWindow().addChildWindow(*m_popoverW);
 }
 

@@ -117,6 +117,8 @@ TEST(Architecture, treeWasFound)
     EXPECT_EQ(tree().moduleOf("include/penwick/platform/Window.h"), "window");
     EXPECT_EQ(tree().moduleOf("include/penwick/platform/NotificationCenter.h"), "foundation");
     EXPECT_EQ(tree().moduleOf("include/penwick/Penwick.h"), "session");
+    EXPECT_EQ(tree().roomOf("src/platform/window/Window.cpp"), "window/Window");
+    EXPECT_EQ(tree().roomOf("include/penwick/platform/Window.h"), "window/Window");
 }
 
 TEST(Architecture, foldersIncludeOnlyWhatTheyDependOn)
@@ -168,6 +170,53 @@ TEST(Architecture, foldersDependOnOneAnotherOneWay)
     for (const auto &[name, module] : tree().modules())
         finder.walk(name);
 
+    EXPECT_EQ(finder.circles(), Findings {});
+}
+
+TEST(Architecture, platformStandsInFiveFloors)
+{
+    const std::vector<std::string> floors { "foundation", "native", "view", "window", "scene" };
+    std::set<std::string> below;
+    Findings findings;
+    for (const std::string &name : floors) {
+        ASSERT_EQ(tree().modules().count(name), 1U) << name;
+        EXPECT_EQ(tree().modules().at(name).folder, "src/platform/" + name);
+        for (const std::string &known : tree().modules().at(name).depends) {
+            if (!below.count(known))
+                findings.push_back(name + " depends on " + known);
+        }
+        below.insert(name);
+    }
+    for (const auto &[name, module] : tree().modules()) {
+        if (isBelow(module.folder, "src/platform") && !below.count(name))
+            findings.push_back(name + " is on no floor");
+    }
+
+    EXPECT_EQ(findings, Findings {});
+}
+
+// A header and its sources are one room: what the source includes, the header's class knows.
+TEST(Architecture, roomsOfAFolderKnowOneAnotherOneWay)
+{
+    std::map<std::string, std::set<std::string>> known;
+    for (const std::string &file : files({ "src", "include" })) {
+        std::set<std::string> &others = known[tree().roomOf(file)];
+        for (const Include &include : tree().includes(file)) {
+            const std::string target = tree().resolved(include, file);
+            if (!target.empty() && tree().moduleOf(target) == tree().moduleOf(file))
+                others.insert(tree().roomOf(target));
+        }
+        others.erase(tree().roomOf(file));
+    }
+    CircleFinder finder([&known](const std::string &room) {
+        return std::vector<std::string>(known[room].begin(), known[room].end());
+    });
+
+    for (const std::string &file : files({ "src", "include" }))
+        finder.walk(tree().roomOf(file));
+
+    EXPECT_GE(known["view/View"].size(), 4U);
+    EXPECT_EQ(known["window/Window"].count("window/WindowParts"), 1U); // by its source alone
     EXPECT_EQ(finder.circles(), Findings {});
 }
 

@@ -24,7 +24,7 @@ std::string contents(const fs::path &file)
 
 bool isSource(const fs::path &file)
 {
-    return file.extension() == ".h" || file.extension() == ".cpp";
+    return file.extension() == ".h" || file.extension() == ".cpp" || file.extension() == ".mm";
 }
 
 bool startsWith(const std::string &text, const std::string &start)
@@ -120,6 +120,11 @@ std::string SourceTree::resolved(const Include &include, const std::string &file
             return place + include.name;
     }
     return {};
+}
+
+std::string SourceTree::roomOf(const std::string &file) const
+{
+    return moduleOf(file) + '/' + fs::path(file).stem().string();
 }
 
 std::string SourceTree::moduleOf(const std::string &file) const

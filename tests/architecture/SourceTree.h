@@ -45,6 +45,9 @@ public:
     /// Name of the module that `file` belongs to. A public header belongs to the module that
     /// names it among its sources. Empty for what belongs to none.
     [[nodiscard]] std::string moduleOf(const std::string &file) const;
+    /// Name of the room that `file` belongs to, which is a header with the sources of its name:
+    /// "module/name".
+    [[nodiscard]] std::string roomOf(const std::string &file) const;
 
 private:
     void readModule(const std::string &file, const std::string &text);

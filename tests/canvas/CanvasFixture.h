@@ -9,6 +9,7 @@
 #include "history/NotificationNames.h"
 #include "history/SubviewOperation.h"
 #include "history/UndoRedoManager.h"
+#include "platform/window/WindowContent.h"
 #include "support/NotificationRecorder.h"
 #include "textbox/TnTextBox.h"
 
@@ -95,12 +96,12 @@ protected:
         setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         window.setFrame({ 100, 100, width, height });
         canvas = new DrawingCanvasView(&window);
-        window.adoptScene();
+        contentOf(window).adoptScene();
         auto content = std::make_unique<DrawViewController>();
         controller = content.get();
         controller->setDrawingView(canvas);
         controller->setView(*canvas);
-        window.setContentViewController(std::move(content));
+        contentOf(window).setContentViewController(std::move(content));
         window.show();
         activate(window);
         window.resize(width, height); // a frame would have the title bar in it
@@ -156,7 +157,7 @@ protected:
     {
         const QString tool = canvas->currentSelectedTool();
         canvas->setCurrentSelectedTool(QStringLiteral("text"));
-        window.makeFirstResponder(canvas);
+        contentOf(window).makeFirstResponder(canvas);
         click(point);
         canvas->setCurrentSelectedTool(tool);
         settle();
@@ -177,7 +178,7 @@ protected:
     std::int64_t placedTextBox(Point point)
     {
         const std::int64_t id = writtenTextBox(point);
-        window.makeFirstResponder(canvas);
+        contentOf(window).makeFirstResponder(canvas);
         settle();
         return id;
     }

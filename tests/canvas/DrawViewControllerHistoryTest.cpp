@@ -4,6 +4,7 @@
 
 #include "history/NotificationNames.h"
 #include "platform/view/ImageView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/NotificationCenter.h>
 
@@ -169,11 +170,11 @@ TEST_F(DrawViewControllerHistoryTest, clearWithNothingButAHiddenSubviewClears)
 TEST_F(DrawViewControllerHistoryTest, clearWhileABoxIsEditedLeavesNobodyFirstResponder)
 {
     writtenTextBox({ 20, 100 });
-    ASSERT_EQ(window.firstResponder(), canvas->subviews().front());
+    ASSERT_EQ(contentOf(window).firstResponder(), canvas->subviews().front());
 
     controller->handleToolSelection(clear);
 
-    EXPECT_EQ(window.firstResponder(), nullptr);
+    EXPECT_EQ(contentOf(window).firstResponder(), nullptr);
     EXPECT_TRUE(canvas->subviews().empty());
     EXPECT_EQ(history().undoStack().size(), 1);
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Text boxes that leave a canvas: by themselves or because the history says so.
 #include "canvas/CanvasFixture.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 namespace {
@@ -29,7 +30,7 @@ TEST_F(
 
     EXPECT_EQ(idsOf(model().textBoxArray()), Ids { kept });
     EXPECT_EQ(idsOf(canvas->textBoxArray()), Ids { kept });
-    EXPECT_EQ(window.firstResponder(), window.contentView());
+    EXPECT_EQ(contentOf(window).firstResponder(), contentOf(window).contentView());
     EXPECT_EQ(box->superview(), nullptr);
     EXPECT_EQ(history().undoStack().last().elementId, id);
     EXPECT_EQ(history().undoStack().last().actionAssociated, ActionType::erase);
@@ -68,7 +69,7 @@ TEST_F(DrawViewControllerSubviewTest, deletionOfAnUnknownBoxOnlyRepaintsAndTakes
     controller->shouldDeleteTheTextBox(-1);
 
     EXPECT_EQ(idsOf(model().textBoxArray()), Ids { kept });
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(history().undoStack().size(), 1);
     EXPECT_EQ(recorder.take(), Posts());
 }

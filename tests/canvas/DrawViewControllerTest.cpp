@@ -5,6 +5,7 @@
 
 #include "history/NotificationNames.h"
 #include "platform/view/ImageView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/NotificationCenter.h>
 
@@ -36,8 +37,8 @@ TEST_F(DrawViewControllerTest, loadedControllerHasAnEmptyModelWithItsHistoryAndT
     EXPECT_EQ(canvas->cursor().hotSpot(), QPoint(0, 20));
     EXPECT_EQ(
         canvas->cursor().pixmap().toImage(), canvas->cursorType().forScale(1.0).pixmap().toImage());
-    EXPECT_EQ(window.contentView(), canvas);
-    EXPECT_EQ(window.contentViewController(), controller);
+    EXPECT_EQ(contentOf(window).contentView(), canvas);
+    EXPECT_EQ(contentOf(window).contentViewController(), controller);
     EXPECT_EQ(recorder.take(), Posts());
 }
 
@@ -218,14 +219,14 @@ TEST_F(DrawViewControllerTest, drawingToolsBecomeCurrentAndLastAndBringTheirCurs
 TEST_F(DrawViewControllerTest, onlyTheTextToolTakesTheFirstResponder)
 {
     for (const QString &tool : { brush, eraser, undo, redo, clear }) {
-        window.makeFirstResponder(nullptr);
+        contentOf(window).makeFirstResponder(nullptr);
         controller->handleToolSelection(tool);
-        EXPECT_EQ(window.firstResponder(), nullptr) << tool.toStdString();
+        EXPECT_EQ(contentOf(window).firstResponder(), nullptr) << tool.toStdString();
     }
 
     controller->handleToolSelection(text);
 
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
 }
 
 TEST_F(DrawViewControllerTest, firstClickAfterChoosingTheTextToolMakesABox)

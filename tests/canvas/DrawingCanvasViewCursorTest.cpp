@@ -16,7 +16,7 @@ TEST_F(DrawingCanvasViewCursorTest, toolsCursorIsOverTheWholeCanvas)
     const Cursor cursor = getCursorOfType(QStringLiteral("Eraser_Cursor"));
     canvas->setCursorType(cursor);
 
-    window.invalidateCursorRects(*canvas);
+    canvas->refreshCursorRects();
 
     EXPECT_EQ(canvas->cursor().pixmap().toImage(), cursor.forScale(1.0).pixmap().toImage());
     EXPECT_EQ(canvas->cursor().hotSpot(), QPoint(0, 20));

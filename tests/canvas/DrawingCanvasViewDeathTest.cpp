@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What stops the process when a canvas is used.
 #include "canvas/CanvasFixture.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 namespace {
@@ -110,7 +111,7 @@ TEST_F(DrawingCanvasViewDeathTest, eraserThatHitsForAControllerWithoutACanvasIsF
 TEST_F(DrawingCanvasViewDeathTest, textReleaseWithoutADelegateOrModelIsFatal)
 {
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     press({ 50, 60 });
 
     controller->setDrawingCanvasModel(nullptr);
@@ -126,7 +127,7 @@ TEST_F(DrawingCanvasViewDeathTest, textReleaseForADelegateThatOwnsNoTextBoxesIsF
     idle.setModel(controller->drawingCanvasModel());
     canvas->setDrawingCanvasDelegate(&idle);
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     press({ 50, 60 });
 
     EXPECT_DEATH(release({ 50, 60 }),
@@ -139,7 +140,7 @@ TEST_F(DrawingCanvasViewDeathTest, newTextBoxThatDoesNotReachTheCanvasIsFatal)
     idle.setModel(controller->drawingCanvasModel());
     canvas->setDrawingCanvasDelegate(&idle);
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     press({ 50, 60 });
 
     EXPECT_DEATH(

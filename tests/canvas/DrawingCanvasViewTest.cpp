@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a canvas starts with, and the brush and the popover under the pointer.
 #include "canvas/CanvasFixture.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 namespace {
@@ -60,7 +61,7 @@ TEST_F(DrawingCanvasViewTest, brushPressBeginsAStrokeInTheModelAndTakesTheFirstR
 
     press({ 50, 60 });
 
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(canvas->startPoint(), (Point { 50, 60 }));
     EXPECT_FALSE(canvas->isDragged());
     ASSERT_EQ(model().pathArray().size(), 1);
@@ -100,7 +101,7 @@ TEST_F(DrawingCanvasViewTest, hairlineMarksItsSmoothEdgeWhichIsWiderThanItsBoxGr
 
 TEST_F(DrawingCanvasViewTest, eachBrushDragAddsASegmentAndMarksOnlyItsBoxGrownByTheWidth)
 {
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     settle();
     PaintRecorder painted(*canvas);
     press({ 50, 60 });
@@ -168,7 +169,7 @@ TEST_F(DrawingCanvasViewTest, releaseElsewhereWithoutADragKeepsTheCopyAndRepaint
 
 TEST_F(DrawingCanvasViewTest, clickWithoutADragLeavesNoMarkButAnEmptyStrokeWithItsRecord)
 {
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     settle();
     PaintRecorder painted(*canvas);
 
@@ -285,15 +286,15 @@ TEST_F(DrawingCanvasViewTest, unknownToolDoesNothingButTakeTheFirstResponderWhen
 {
     const std::int64_t kept = stroke({ { 20, 50 }, { 200, 50 } });
     static_cast<void>(recorder.take());
-    window.makeFirstResponder(nullptr);
+    contentOf(window).makeFirstResponder(nullptr);
     for (const char *const tool : { "color", "state", "Brush", "" }) {
         canvas->setCurrentSelectedTool(QString::fromLatin1(tool));
         press({ 50, 50 });
-        EXPECT_EQ(window.firstResponder(), nullptr) << tool;
+        EXPECT_EQ(contentOf(window).firstResponder(), nullptr) << tool;
         drag({ 60, 50 });
-        EXPECT_EQ(window.firstResponder(), canvas) << tool;
+        EXPECT_EQ(contentOf(window).firstResponder(), canvas) << tool;
         release({ 60, 50 });
-        window.makeFirstResponder(nullptr);
+        contentOf(window).makeFirstResponder(nullptr);
     }
 
     EXPECT_EQ(idsOf(model().pathArray()), Ids { kept });
@@ -310,7 +311,7 @@ TEST_F(DrawingCanvasViewTest, pressInTheKeyWindowHidesThePopoverAndDrawsWithTheL
     activate(window);
     canvas->setPopoverWindow(&popover);
     canvas->setCurrentSelectedTool(QStringLiteral("color"));
-    ASSERT_TRUE(window.isKeyWindow());
+    ASSERT_TRUE(contentOf(window).isKeyWindow());
 
     press({ 50, 60 });
 
@@ -339,7 +340,7 @@ TEST_F(DrawingCanvasViewTest, pressInAWindowThatIsNotKeyLeavesPopoverAndTool)
     activate(popover);
     canvas->setPopoverWindow(&popover);
     canvas->setCurrentSelectedTool(QStringLiteral("color"));
-    ASSERT_FALSE(window.isKeyWindow());
+    ASSERT_FALSE(contentOf(window).isKeyWindow());
 
     press({ 50, 60 });
 

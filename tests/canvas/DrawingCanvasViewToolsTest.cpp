@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The eraser and the text tool under the pointer.
 #include "canvas/CanvasFixture.h"
+#include "platform/window/WindowContent.h"
 
 #include <QApplication>
 
@@ -17,12 +18,12 @@ using DrawingCanvasViewToolsTest = CanvasFixture;
 TEST_F(DrawingCanvasViewToolsTest, eraserPressNeitherErasesNorTakesTheFirstResponder)
 {
     stroke({ { 20, 50 }, { 200, 50 } });
-    window.makeFirstResponder(nullptr);
+    contentOf(window).makeFirstResponder(nullptr);
     canvas->setCurrentSelectedTool(eraser);
 
     press({ 100, 50 });
 
-    EXPECT_EQ(window.firstResponder(), nullptr);
+    EXPECT_EQ(contentOf(window).firstResponder(), nullptr);
     EXPECT_EQ(model().pathArray().size(), 1);
 }
 
@@ -62,7 +63,7 @@ TEST_F(DrawingCanvasViewToolsTest, eraserDragThatHitsNothingMarksNothing)
     drag({ 100, 120 });
     settle();
 
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(painted.take(), std::vector<QRect>());
     EXPECT_EQ(recorder.take(), Posts());
 }
@@ -121,7 +122,7 @@ TEST_F(DrawingCanvasViewToolsTest, textClickPlacesABoxBelowAndRightOfItAndGivesI
     canvas->setCurrentSelectedTool(text);
     canvas->setBrushColor(QColor(255, 58, 104));
     canvas->setTextFontSize(36.0);
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
 
     click({ 60, 100 });
 
@@ -133,7 +134,7 @@ TEST_F(DrawingCanvasViewToolsTest, textClickPlacesABoxBelowAndRightOfItAndGivesI
     EXPECT_EQ(entry.textBox->textColor(), QColor(255, 58, 104)); // at full alpha
     EXPECT_EQ(idsOf(canvas->textBoxArray()), Ids { entry.textId });
     EXPECT_EQ(canvas->subviews(), std::vector<platform::View *> { entry.textBox.get() });
-    EXPECT_EQ(window.firstResponder(), entry.textBox.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), entry.textBox.get());
     EXPECT_TRUE(model().pathArray().isEmpty());
     EXPECT_EQ(recorder.take(), Posts { "enableUndo true" });
 }
@@ -141,42 +142,42 @@ TEST_F(DrawingCanvasViewToolsTest, textClickPlacesABoxBelowAndRightOfItAndGivesI
 TEST_F(DrawingCanvasViewToolsTest, textClickWhileABoxIsEditedOnlyEndsTheEditing)
 {
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
     click({ 20, 100 });
     QTest::keyClicks(model().textBoxArray().last().textBox.get(), QStringLiteral("Text"));
     static_cast<void>(recorder.take());
 
     click({ 20, 160 });
     EXPECT_EQ(model().textBoxArray().size(), 1);
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(recorder.take(), Posts());
 
     click({ 20, 160 });
     EXPECT_EQ(model().textBoxArray().size(), 2);
-    EXPECT_EQ(window.firstResponder(), model().textBoxArray().last().textBox.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), model().textBoxArray().last().textBox.get());
 }
 
 TEST_F(DrawingCanvasViewToolsTest, textClickThatTremblesWhileABoxIsEditedOnlyEndsTheEditing)
 {
     canvas->setCurrentSelectedTool(text);
     writtenTextBox({ 20, 100 });
-    ASSERT_NE(window.firstResponder(), canvas);
+    ASSERT_NE(contentOf(window).firstResponder(), canvas);
     const double almost = QApplication::startDragDistance() - 1;
 
     press({ 20, 160 });
     drag({ 21, 160 });
     drag({ 20 + almost, 160 });
-    EXPECT_NE(window.firstResponder(), canvas); // it may still become a drag
+    EXPECT_NE(contentOf(window).firstResponder(), canvas); // it may still become a drag
     release({ 20 + almost, 160 });
 
     EXPECT_EQ(model().textBoxArray().size(), 1);
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
 }
 
 TEST_F(DrawingCanvasViewToolsTest, boxOfAReleaseBesideTheCanvasStandsWhereItIsSeen)
 {
     canvas->setCurrentSelectedTool(QStringLiteral("text"));
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
 
     press({ 250, 20 });
     release({ 340, -60 });
@@ -193,7 +194,7 @@ TEST_F(DrawingCanvasViewToolsTest, textDragEndsTheEditingAndItsReleasePlacesABox
 
     press({ 20, 160 });
     drag({ 20 + enough, 160 });
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     release({ 20 + enough, 160 });
 
     ASSERT_EQ(model().textBoxArray().size(), 2);
@@ -215,22 +216,22 @@ TEST_F(DrawingCanvasViewToolsTest, eraserDragOfAPixelIsADrag)
 TEST_F(DrawingCanvasViewToolsTest, textClickWhileNobodyIsFirstResponderOnlyMakesTheCanvasIt)
 {
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(nullptr);
+    contentOf(window).makeFirstResponder(nullptr);
 
     click({ 20, 100 });
 
     EXPECT_TRUE(model().textBoxArray().isEmpty());
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
 }
 
 TEST_F(DrawingCanvasViewToolsTest, textPressAloneDoesNothing)
 {
     canvas->setCurrentSelectedTool(text);
-    window.makeFirstResponder(nullptr);
+    contentOf(window).makeFirstResponder(nullptr);
 
     press({ 20, 100 });
 
-    EXPECT_EQ(window.firstResponder(), nullptr);
+    EXPECT_EQ(contentOf(window).firstResponder(), nullptr);
     EXPECT_TRUE(model().textBoxArray().isEmpty());
     EXPECT_TRUE(model().pathArray().isEmpty());
 }

@@ -6,6 +6,7 @@
 #include "platform/ViewFixture.h"
 #include "platform/scene/Bundle.h"
 #include "platform/scene/ButtonImages.h"
+#include "platform/window/WindowContent.h"
 
 #include <QAccessible>
 #include <QPixmap>
@@ -140,11 +141,11 @@ TEST_F(ButtonTest, withoutAnActionIsTurnedOnOnly)
 
 TEST_F(ButtonTest, neverTakesTheKeys)
 {
-    m_window.makeFirstResponder(&m_content);
+    contentOf(m_window).makeFirstResponder(&m_content);
 
     QTest::mouseClick(m_button.get(), Qt::LeftButton);
 
-    EXPECT_EQ(m_window.firstResponder(), &m_content);
+    EXPECT_EQ(contentOf(m_window).firstResponder(), &m_content);
     EXPECT_EQ(m_button->focusPolicy(), Qt::NoFocus);
 }
 

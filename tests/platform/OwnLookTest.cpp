@@ -2,6 +2,7 @@
 // What a host's style does to a view or a window is taken back.
 #include "platform/view/OwnLook.h"
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/Window.h>
 
@@ -77,7 +78,7 @@ TEST(OwnLook, viewKeepsItsSizeAndPaintsNoForeignBackground)
     const auto view = makeView<PlainView>();
     PlainView root;
     root.addSubview(view);
-    window.setContentView(&root);
+    contentOf(window).setContentView(&root);
     view->setFrame({ 10, 10, 30, 20 });
     window.show();
     QCoreApplication::processEvents();
@@ -88,7 +89,7 @@ TEST(OwnLook, viewKeepsItsSizeAndPaintsNoForeignBackground)
     EXPECT_EQ(view->size(), QSize(30, 20));
     EXPECT_FALSE(view->testAttribute(Qt::WA_StyledBackground));
     EXPECT_EQ(view->geometry().left(), 10);
-    window.setContentView(nullptr);
+    contentOf(window).setContentView(nullptr);
 }
 
 TEST(OwnLook, editorIsFilledByItsText)
@@ -99,7 +100,7 @@ TEST(OwnLook, editorIsFilledByItsText)
     const auto editor = makeView<Editor>();
     PlainView root;
     root.addSubview(editor);
-    window.setContentView(&root);
+    contentOf(window).setContentView(&root);
     editor->setFrame({ 10, 10, 200, 100 });
     window.show();
     QCoreApplication::processEvents();
@@ -107,7 +108,7 @@ TEST(OwnLook, editorIsFilledByItsText)
     EXPECT_EQ(editor->viewport()->geometry(), QRect(0, 0, 200, 100));
     editor->setFrame({ 10, 10, 240, 120 });
     EXPECT_EQ(editor->viewport()->geometry(), QRect(0, 0, 240, 120));
-    window.setContentView(nullptr);
+    contentOf(window).setContentView(nullptr);
 }
 
 TEST(OwnLook, editorKeepsItsFont)

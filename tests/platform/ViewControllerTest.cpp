@@ -3,6 +3,7 @@
 #include "platform/view/ViewController.h"
 
 #include "platform/RecordingView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/Window.h>
 
@@ -52,10 +53,10 @@ TEST(ViewController, windowsContentIsTheViewOfItsContentController)
     controller->setView(*view);
     ViewController *const taken = controller.get();
 
-    window.setContentViewController(std::move(controller));
+    contentOf(window).setContentViewController(std::move(controller));
 
-    EXPECT_EQ(window.contentViewController(), taken);
-    EXPECT_EQ(window.contentView(), view);
+    EXPECT_EQ(contentOf(window).contentViewController(), taken);
+    EXPECT_EQ(contentOf(window).contentView(), view);
 }
 
 } // namespace penwick::platform

@@ -61,7 +61,7 @@ using ViewCursorDeathTest = ViewCursor;
 TEST_F(ViewCursor, pointerThatEntersSetsTheDeclaredCursor)
 {
     m_view->setDeclared(m_cursor);
-    m_window.invalidateCursorRects(*m_view);
+    m_view->refreshCursorRects();
 
     enter(*m_view);
 
@@ -73,7 +73,7 @@ TEST_F(ViewCursor, invalidatedViewDeclaresItsCursorAtOnce)
 {
     m_view->setDeclared(m_cursor);
 
-    m_window.invalidateCursorRects(*m_view);
+    m_view->refreshCursorRects();
 
     EXPECT_TRUE(m_view->testAttribute(Qt::WA_SetCursor));
     EXPECT_EQ(m_view->cursor().hotSpot(), QPoint(3, 4));
@@ -93,7 +93,7 @@ TEST_F(ViewCursor, entryGivesBackTheDeclaredCursorAfterAnotherWasSet)
 {
     const Cursor other(square(8), { 1.0, 2.0 });
     m_view->setDeclared(m_cursor);
-    m_window.invalidateCursorRects(*m_view);
+    m_view->refreshCursorRects();
     other.set(*m_view);
     ASSERT_EQ(m_view->cursor().hotSpot(), QPoint(1, 2));
 
@@ -106,10 +106,10 @@ TEST_F(ViewCursor, entryGivesBackTheDeclaredCursorAfterAnotherWasSet)
 TEST_F(ViewCursor, viewThatDeclaresNothingAnyMoreHasNoCursorOfItsOwn)
 {
     m_view->setDeclared(m_cursor);
-    m_window.invalidateCursorRects(*m_view);
+    m_view->refreshCursorRects();
     m_view->setDeclared(std::nullopt);
 
-    m_window.invalidateCursorRects(*m_view);
+    m_view->refreshCursorRects();
 
     EXPECT_FALSE(m_view->testAttribute(Qt::WA_SetCursor));
 }

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "platform/RecordingView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/Window.h>
 
@@ -31,8 +32,8 @@ protected:
         borderless.styleMask = {};
         m_window.setAttributes(borderless);
         m_window.setFrame({ 300.0, 300.0, 200.0, 100.0 });
-        m_window.setContentView(&m_content);
-        m_window.adoptScene();
+        contentOf(m_window).setContentView(&m_content);
+        contentOf(m_window).adoptScene();
         m_window.show();
         EXPECT_TRUE(QTest::qWaitForWindowExposed(&m_window));
         EXPECT_EQ(m_content.frame(), (Rect { 0.0, 0.0, 200.0, 100.0 }));

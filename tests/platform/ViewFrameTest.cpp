@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Where views are: frames from the bottom left, and their conversion.
 #include "platform/ViewFixture.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::platform {
 
@@ -160,7 +161,7 @@ TEST_F(ViewFrame, sceneGivesFramesFromThePlacesOfItsWidgets)
     auto *const inner = new RecordingView(outer);
     inner->setGeometry(1, 2, 20, 30);
 
-    window.adoptScene();
+    contentOf(window).adoptScene();
 
     EXPECT_EQ(outer->frame(), (Rect { 10.0, 25.0, 60.0, 50.0 }));
     EXPECT_EQ(inner->frame(), (Rect { 1.0, 18.0, 20.0, 30.0 }));

@@ -2,6 +2,7 @@
 // Subviews: their order, who keeps them, and what happens when they leave.
 #include "platform/ViewFixture.h"
 #include "platform/view/ViewHost.h"
+#include "platform/window/WindowContent.h"
 
 #include <QPointer>
 
@@ -211,7 +212,7 @@ TEST_F(ViewTree, heldSubviewOutlivesItsWindow)
         Window window;
         auto *const content = new RecordingView(&window);
         content->addSubview(view);
-        window.makeFirstResponder(view.get());
+        contentOf(window).makeFirstResponder(view.get());
         window.show();
     }
 
@@ -272,12 +273,12 @@ TEST_F(ViewTree, viewThatRemovesItselfInsideItsEventStaysValidUntilTheEventIsOve
 TEST_F(ViewTree, firstResponderThatIsRemovedResignsBeforeItLeaves)
 {
     const auto view = added({ 0.0, 0.0, 10.0, 10.0 });
-    m_window.makeFirstResponder(view.get());
+    contentOf(m_window).makeFirstResponder(view.get());
 
     view->removeFromSuperview();
 
     EXPECT_EQ(view->take(), (Log { "resign", "left" }));
-    EXPECT_EQ(m_window.firstResponder(), nullptr);
+    EXPECT_EQ(contentOf(m_window).firstResponder(), nullptr);
 }
 
 TEST_F(ViewTree, firstResponderInsideARemovedViewResigns)
@@ -285,31 +286,31 @@ TEST_F(ViewTree, firstResponderInsideARemovedViewResigns)
     const auto outer = added({ 0.0, 0.0, 100.0, 100.0 });
     const auto inner = makeView<RecordingView>();
     outer->addSubview(inner);
-    m_window.makeFirstResponder(inner.get());
+    contentOf(m_window).makeFirstResponder(inner.get());
     static_cast<void>(inner->take());
 
     outer->removeFromSuperview();
 
     EXPECT_EQ(inner->take(), (Log { "resign", "left" }));
-    EXPECT_EQ(m_window.firstResponder(), nullptr);
+    EXPECT_EQ(contentOf(m_window).firstResponder(), nullptr);
 }
 
 TEST_F(ViewTree, firstResponderElsewhereStaysWhenAViewIsRemoved)
 {
     const auto view = added({ 0.0, 0.0, 10.0, 10.0 });
     const auto other = added({ 0.0, 0.0, 10.0, 10.0 });
-    m_window.makeFirstResponder(other.get());
+    contentOf(m_window).makeFirstResponder(other.get());
 
     view->removeFromSuperview();
 
-    EXPECT_EQ(m_window.firstResponder(), other.get());
+    EXPECT_EQ(contentOf(m_window).firstResponder(), other.get());
     EXPECT_EQ(other->take(), Log {});
 }
 
 TEST_F(ViewTree, viewThatRemovesItselfAsItResignsLeavesOnce)
 {
     const auto view = added({ 0.0, 0.0, 10.0, 10.0 });
-    m_window.makeFirstResponder(view.get());
+    contentOf(m_window).makeFirstResponder(view.get());
     view->setReaction([self = view.get()](const std::string &what) {
         if (what == "resign")
             self->removeFromSuperview();
@@ -325,7 +326,7 @@ TEST_F(ViewTree, viewsThatGoWhileOthersAreRemovedAreNotRemovedTwice)
 {
     const auto first = added({ 0.0, 0.0, 10.0, 10.0 });
     const auto second = added({ 0.0, 0.0, 10.0, 10.0 });
-    m_window.makeFirstResponder(first.get());
+    contentOf(m_window).makeFirstResponder(first.get());
     first->setReaction([other = second.get()](const std::string &what) {
         if (what == "resign")
             other->removeFromSuperview();

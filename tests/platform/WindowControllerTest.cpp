@@ -3,6 +3,7 @@
 #include <penwick/platform/WindowController.h>
 
 #include "platform/WindowFixture.h"
+#include "platform/window/WindowContent.h"
 
 #include <QPointer>
 
@@ -20,7 +21,7 @@ public:
     {
         ++m_loads;
         EXPECT_NE(window(), nullptr);
-        EXPECT_EQ(window()->windowController(), this);
+        EXPECT_EQ(contentOf(*window()).responder(), this);
     }
 
     [[nodiscard]] int loads() const { return m_loads; }
@@ -52,7 +53,7 @@ TEST(WindowController, windowFromElsewhereIsTakenWithoutBeingLoaded)
     const WindowController controller(std::move(window));
 
     EXPECT_EQ(controller.window(), taken);
-    EXPECT_EQ(taken->windowController(), &controller);
+    EXPECT_EQ(contentOf(*taken).responder(), &controller);
     EXPECT_EQ(WindowController(nullptr).window(), nullptr);
 }
 
@@ -83,7 +84,7 @@ TEST(WindowController, shownWindowIsTheKeyWindow)
     controller.showWindow(nullptr);
 
     EXPECT_TRUE(controller.window()->isVisible());
-    EXPECT_TRUE(QTest::qWaitFor([&] { return controller.window()->isKeyWindow(); }));
+    EXPECT_TRUE(QTest::qWaitFor([&] { return contentOf(*controller.window()).isKeyWindow(); }));
 }
 
 TEST(WindowController, controllerWithoutAWindowShowsNothing)

@@ -2,6 +2,7 @@
 // A window's one frame: asked, gliding, granted.
 #include "platform/RecordingView.h"
 #include "platform/WindowFixture.h"
+#include "platform/window/WindowContent.h"
 
 #include <QVariantAnimation>
 #include <QWindow>
@@ -211,7 +212,7 @@ TEST_F(WindowFrame, delegateThatIsGoneIsNotTold)
 TEST_F(WindowFrame, contentViewFillsTheWindow)
 {
     auto *const content = new RecordingView(&m_window);
-    m_window.setContentView(content);
+    contentOf(m_window).setContentView(content);
     m_window.setFrame(place);
     show(m_window);
 
@@ -228,11 +229,11 @@ TEST_F(WindowFrame, contentViewFillsTheWindow)
 TEST_F(WindowFrame, contentViewThatDiesIsNotTheContentAnyMore)
 {
     auto *const content = new RecordingView(&m_window);
-    m_window.setContentView(content);
+    contentOf(m_window).setContentView(content);
 
     delete content;
 
-    EXPECT_EQ(m_window.contentView(), nullptr);
+    EXPECT_EQ(contentOf(m_window).contentView(), nullptr);
 }
 
 TEST_F(WindowFrame, windowsNeverEndTheHost)

@@ -7,6 +7,7 @@
 #include "history/UndoRedoManager.h"
 
 #include "appearance/PenwickBundle.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/platform/Window.h>
 
@@ -115,8 +116,8 @@ public:
     {
         setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
         m_window.resize(static_cast<int>(side), static_cast<int>(side));
-        m_window.adoptScene();
-        m_window.setContentView(&m_canvas);
+        contentOf(m_window).adoptScene();
+        contentOf(m_window).setContentView(&m_canvas);
         m_controller.setDrawingView(&m_canvas);
         m_controller.setView(m_canvas);
         for (const PlainStroke &stroke : drawing) {

@@ -6,6 +6,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
 #include "platform/foundation/FatalError.h"
+#include "platform/window/WindowContent.h"
 #include "strokes/CoverageMask.h"
 #include "strokes/PixelLayer.h"
 #include "strokes/StrokePainter.h"
@@ -37,13 +38,13 @@ PaintSession::PaintSession(std::uint32_t seed)
     setPenwickBundle(std::make_shared<platform::Bundle>(QStringLiteral(":/penwick/images")));
     m_window.setFrame({ 20, 20, side, side });
     m_canvas = new DrawingCanvasView(&m_window);
-    m_window.adoptScene();
+    contentOf(m_window).adoptScene();
     auto content = std::make_unique<DrawViewController>();
     m_controller = content.get();
     content->setDrawingView(m_canvas);
     content->setView(*m_canvas);
     m_canvas->setCoversWindow(m_coversWindow);
-    m_window.setContentViewController(std::move(content));
+    contentOf(m_window).setContentViewController(std::move(content));
     m_window.show();
     QCoreApplication::processEvents();
     m_window.resize(side, side); // a frame would have the title bar in it

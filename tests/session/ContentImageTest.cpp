@@ -5,6 +5,7 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 #include "textbox/TnTextBox.h"
 
 #include <QScrollBar>
@@ -35,11 +36,11 @@ protected:
     [[nodiscard]] platform::Window &window() const { return *m_controller->drawingWindow(); }
     [[nodiscard]] DrawingCanvasView &canvas() const
     {
-        return dynamic_cast<DrawingCanvasView &>(*window().contentView());
+        return dynamic_cast<DrawingCanvasView &>(*contentOf(window()).contentView());
     }
     [[nodiscard]] DrawViewController &drawing() const
     {
-        return dynamic_cast<DrawViewController &>(*window().contentViewController());
+        return dynamic_cast<DrawViewController &>(*contentOf(window()).contentViewController());
     }
 
     void drag(QPoint from, QPoint to) const
@@ -60,7 +61,7 @@ protected:
     TnTextBox &edit(QPoint place, const QString &text) const
     {
         drawing().handleToolSelection(QStringLiteral("text"));
-        window().makeFirstResponder(&canvas());
+        contentOf(window()).makeFirstResponder(&canvas());
         send(QEvent::MouseButtonPress, place, Qt::LeftButton);
         send(QEvent::MouseButtonRelease, place, Qt::NoButton);
         TnTextBox &box = *drawing().drawingCanvasModel()->textBoxArray().last().textBox;
@@ -68,7 +69,7 @@ protected:
         return box;
     }
 
-    void leave() const { window().makeFirstResponder(&canvas()); }
+    void leave() const { contentOf(window()).makeFirstResponder(&canvas()); }
 
     /// The content without the outermost points, where the canvas has its border.
     [[nodiscard]] QRect insideBorder() const

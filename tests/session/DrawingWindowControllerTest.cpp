@@ -4,6 +4,7 @@
 
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 #include "session/DrawingWindowScene.h"
 
 #include <QTest>
@@ -177,7 +178,8 @@ TEST_F(DrawingWindow, canvasFillsTheWindowAndHasAGreenBorder)
     controller->showWindow(nullptr);
     ASSERT_TRUE(QTest::qWaitForWindowExposed(controller->window()));
 
-    auto *const canvas = dynamic_cast<DrawingCanvasView *>(controller->window()->contentView());
+    auto *const canvas = dynamic_cast<DrawingCanvasView *>(
+        platform::contentOf(*controller->window()).contentView());
     ASSERT_NE(canvas, nullptr);
     EXPECT_EQ(canvas->frame(), contentOf(*controller->window()));
     ASSERT_NE(canvas->layer(), nullptr);
@@ -190,13 +192,14 @@ TEST_F(DrawingWindow, canvasFillsTheWindowAndHasAGreenBorder)
 TEST_F(DrawingWindow, imageLiesUnderTheCanvasAndIsNotOneOfItsSubviews)
 {
     const auto controller = loaded();
-    auto *const content
-        = dynamic_cast<DrawViewController *>(controller->drawingWindow()->contentViewController());
+    auto *const content = dynamic_cast<DrawViewController *>(
+        platform::contentOf(*controller->drawingWindow()).contentViewController());
     ASSERT_NE(content, nullptr);
     const QObjectList children = controller->drawingWindow()->children();
 
     ASSERT_NE(content->annotatedImageView(), nullptr);
-    EXPECT_EQ(content->drawingView(), controller->drawingWindow()->contentView());
+    EXPECT_EQ(
+        content->drawingView(), platform::contentOf(*controller->drawingWindow()).contentView());
     EXPECT_LT(
         children.indexOf(content->annotatedImageView()), children.indexOf(content->drawingView()));
     EXPECT_TRUE(content->drawingView()->subviews().empty());

@@ -5,6 +5,7 @@
 #include "appearance/PenwickBundle.h"
 #include "platform/scene/Bundle.h"
 #include "platform/view/ViewController.h"
+#include "platform/window/WindowContent.h"
 #include "session/DrawingWindowScene.h"
 #include "session/ToolPanelScene.h"
 
@@ -75,7 +76,7 @@ TEST_F(DrawingWindowStopDeathTest, loadingWithoutResourcesStopsTheProcess)
 
 TEST_F(DrawingWindowStopDeathTest, boardWithoutACanvasStopsTheProcess)
 {
-    window().setContentView(nullptr);
+    contentOf(window()).setContentView(nullptr);
 
     EXPECT_DEATH(reopenAs(WindowType::whiteboard),
         "penwick: fatal error: the drawing window has no content view");
@@ -83,9 +84,9 @@ TEST_F(DrawingWindowStopDeathTest, boardWithoutACanvasStopsTheProcess)
 
 TEST_F(DrawingWindowStopDeathTest, imageForAnotherContentStopsTheProcess)
 {
-    platform::View *const canvas = window().contentView();
-    window().setContentViewController(nullptr);
-    ASSERT_EQ(window().contentView(), canvas);
+    platform::View *const canvas = contentOf(window()).contentView();
+    contentOf(window()).setContentViewController(nullptr);
+    ASSERT_EQ(contentOf(window()).contentView(), canvas);
 
     EXPECT_DEATH(reopenAs(WindowType::imageAnnotation),
         "penwick: fatal error: the drawing window's content is no drawing");

@@ -2,6 +2,7 @@
 // What the drawing window's controller and the entry object hold, and who may set it.
 #include "session/SessionFixture.h"
 
+#include "platform/window/WindowContent.h"
 #include "session/DrawingWindowScene.h"
 #include "session/ToolPanelWindowController.h"
 
@@ -71,7 +72,7 @@ TEST_F(DrawingWindowMembers, controllerOfAWindowFromElsewhereHasNothingElse)
     const DrawingWindowController controller(std::move(window));
 
     EXPECT_EQ(controller.window(), taken);
-    EXPECT_EQ(taken->windowController(), &controller);
+    EXPECT_EQ(contentOf(*taken).responder(), &controller);
     EXPECT_EQ(taken->windowTitle(), QStringLiteral("Elsewhere")) << "it was not loaded";
     EXPECT_EQ(controller.drawingWindow(), nullptr);
     EXPECT_EQ(controller.drawingWindowOrigin(), std::nullopt);

@@ -4,6 +4,7 @@
 
 #include "appearance/PenwickBundle.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 #include "session/DrawingWindowScene.h"
 #include "session/SharingNotificationScene.h"
 #include "session/ToolPanelScene.h"
@@ -265,9 +266,10 @@ TEST_F(DrawingWindowToolBar, popoverIsHiddenWhenAnotherWindowTakesOver)
 TEST_F(DrawingWindowToolBar, popoverThatIsNotThereNeedNotBeHidden)
 {
     m_controller->hideThePopover(); // not shown
-    dynamic_cast<DrawingCanvasView &>(*drawing().contentView()).setPopoverWindow(nullptr);
+    dynamic_cast<DrawingCanvasView &>(*contentOf(drawing()).contentView())
+        .setPopoverWindow(nullptr);
     m_controller->hideThePopover();
-    drawing().setContentView(nullptr);
+    contentOf(drawing()).setContentView(nullptr);
     m_controller->hideThePopover();
     m_controller->setDrawingWindow(nullptr);
     m_controller->hideThePopover();
@@ -299,7 +301,7 @@ TEST_F(DrawingWindowToolBar, placementAndResizeWithoutOneSaySo)
 {
     DrawingWindowController controller;
     Window window;
-    window.setContentView(nullptr);
+    contentOf(window).setContentView(nullptr);
     testing::internal::CaptureStdout();
 
     controller.windowDidResize();

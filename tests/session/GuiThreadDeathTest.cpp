@@ -162,31 +162,9 @@ const Operation operations[] {
     { "Window", "addChildWindow", [](Subject &s) { s.window.addChildWindow(s.banner); } },
     OF_WINDOW(parentWindow),
     OF_WINDOW(childWindows),
-    OF_WINDOW(contentView),
-    { "Window", "setContentView", [](Subject &s) { s.window.setContentView(nullptr); } },
-    OF_WINDOW(contentViewController),
-    { "Window", "setContentViewController",
-        [](Subject &s) { s.bareWindow->setContentViewController(nullptr); } },
     OF_WINDOW(contentImage),
-    OF_WINDOW(windowController),
-    { "Window", "setWindowController", [](Subject &s) { s.window.setWindowController(nullptr); } },
     OF_WINDOW(delegate),
     { "Window", "setDelegate", [](Subject &s) { s.window.setDelegate(nullptr); } },
-    OF_WINDOW(firstResponder),
-    { "Window", "makeFirstResponder",
-        [](Subject &s) { static_cast<void>(s.window.makeFirstResponder(nullptr)); } },
-    OF_WINDOW(isKeyWindow),
-    { "Window", "forgetView",
-        [](Subject &s) {
-            static platform::View *const view = s.window.contentView();
-            s.window.forgetView(*view);
-        } },
-    OF_WINDOW(adoptScene),
-    { "Window", "invalidateCursorRects",
-        [](Subject &s) {
-            static platform::View *const view = s.window.contentView();
-            s.window.invalidateCursorRects(*view);
-        } },
     OF_WINDOW(orderFront),
     OF_WINDOW(orderOut),
     { "Window", "setVisible", [](Subject &s) { s.window.setVisible(true); } },

@@ -6,6 +6,7 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "textbox/TnTextBox.h"
 #include "toolpanel/PopoverView.h"
@@ -197,12 +198,12 @@ protected:
 
     void addBoxes(Pictures &all)
     {
-        auto &drawing
-            = dynamic_cast<DrawViewController &>(*m_board->window()->contentViewController());
+        auto &drawing = dynamic_cast<DrawViewController &>(
+            *contentOf(*m_board->window()).contentViewController());
         DrawingCanvasView &canvas = *drawing.drawingView();
         drawing.handleToolSelection(QStringLiteral("text"));
         QWindow &window = *m_board->window()->windowHandle();
-        if (m_board->window()->firstResponder() != &canvas)
+        if (contentOf(*m_board->window()).firstResponder() != &canvas)
             QTest::mouseClick(&window, Qt::LeftButton, {}, { 300, 100 });
         QTest::mouseClick(&window, Qt::LeftButton, {}, { 300, 200 });
         TnTextBox &box = *canvas.textBoxArray().last().textBox;

@@ -3,6 +3,7 @@
 // banner grows.
 #include "session/SessionFixture.h"
 
+#include "platform/window/WindowContent.h"
 #include "session/BannerLabel.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -135,7 +136,7 @@ TEST_F(HostWords, bannerGrowsForALongerText)
     const platform::Window &banner = *m_board->sharingNotificationWindow();
     EXPECT_GT(banner.frame().width, 400);
     EXPECT_EQ(banner.frame().height, 60);
-    EXPECT_EQ(banner.contentView()->frame().width, banner.frame().width);
+    EXPECT_EQ(contentOf(banner).contentView()->frame().width, banner.frame().width);
     EXPECT_GE(bannerLabel().width(), bannerLabel().widthOfText());
     EXPECT_LT(bannerLabel().width(), bannerLabel().widthOfText() + 1);
     EXPECT_EQ(banner.frame().width - bannerLabel().width(), 16);

@@ -4,6 +4,7 @@
 
 #include "canvas/DrawViewController.h"
 #include "platform/view/View.h"
+#include "platform/window/WindowContent.h"
 #include "session/PictureFit.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
@@ -47,7 +48,7 @@ protected:
     [[nodiscard]] platform::ImageView &imageView() const
     {
         return *dynamic_cast<DrawViewController &>(
-            *m_controller->drawingWindow()->contentViewController())
+            *contentOf(*m_controller->drawingWindow()).contentViewController())
                     .annotatedImageView();
     }
     [[nodiscard]] const Window &panel() const

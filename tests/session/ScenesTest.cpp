@@ -7,6 +7,7 @@
 #include "canvas/DrawingCanvasView.h"
 #include "platform/view/Layer.h"
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
 #include "toolpanel/ToolPanelViewController.h"
@@ -30,7 +31,8 @@ protected:
 
     [[nodiscard]] DrawingCanvasView &canvas() const
     {
-        return dynamic_cast<DrawingCanvasView &>(*m_board->drawingWindow()->contentView());
+        return dynamic_cast<DrawingCanvasView &>(
+            *contentOf(*m_board->drawingWindow()).contentView());
     }
     [[nodiscard]] const platform::Window &panel() const
     {
@@ -73,8 +75,8 @@ TEST_F(Scenes, canvasCoversTheWindowOfAWhiteBoardAlone)
 TEST_F(Scenes, imageLiesInTheWindowOfItsSceneFromTheCornerThatStays)
 {
     open(WindowType::imageAnnotation); // without an image it stays as it was loaded
-    const auto &content
-        = dynamic_cast<DrawViewController &>(*m_board->drawingWindow()->contentViewController());
+    const auto &content = dynamic_cast<DrawViewController &>(
+        *contentOf(*m_board->drawingWindow()).contentViewController());
     const platform::ImageView &image = *content.annotatedImageView();
 
     EXPECT_EQ(image.frame().origin(), (platform::Point { 0, 0 }));

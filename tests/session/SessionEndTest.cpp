@@ -3,6 +3,7 @@
 #include "session/SessionFixture.h"
 
 #include "canvas/DrawViewController.h"
+#include "platform/window/WindowContent.h"
 
 #include <QPointer>
 
@@ -62,8 +63,8 @@ TEST_F(SessionEnd, closingIsYesForAnImageAnnotation)
 TEST_F(SessionEnd, endButtonCloses)
 {
     const auto controller = opened();
-    auto *const content
-        = dynamic_cast<DrawViewController *>(controller->window()->contentViewController());
+    auto *const content = dynamic_cast<DrawViewController *>(
+        contentOf(*controller->window()).contentViewController());
     ASSERT_NE(content, nullptr);
 
     content->handleToolSelection(QStringLiteral("state"));
@@ -128,7 +129,8 @@ TEST_F(SessionEnd, hostMayDropEverythingInsideTheNews)
 TEST_F(SessionEnd, hostMayDropEverythingInsideTheNewsOfTheEndButton)
 {
     const QPointer<platform::Window> window = opened()->window();
-    auto *const content = dynamic_cast<DrawViewController *>(window->contentViewController());
+    auto *const content
+        = dynamic_cast<DrawViewController *>(contentOf(*window).contentViewController());
     ASSERT_NE(content, nullptr);
     setReaction([&] { m_penwick.reset(); });
 

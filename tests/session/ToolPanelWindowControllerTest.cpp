@@ -8,6 +8,7 @@
 #include "toolpanel/ToolPanelViewController.h"
 
 #include "appearance/PenwickBundle.h"
+#include "platform/window/WindowContent.h"
 
 #include <QTest>
 #include <QTimer>
@@ -73,7 +74,7 @@ TEST_F(ToolPanelWindow, controllerOfAWindowFromElsewhereHasNothingElse)
     const ToolPanelWindowController controller(std::move(window));
 
     EXPECT_EQ(controller.window(), taken);
-    EXPECT_EQ(taken->windowController(), &controller);
+    EXPECT_EQ(contentOf(*taken).responder(), &controller);
     EXPECT_EQ(taken->delegate(), nullptr) << "it was not loaded";
     EXPECT_EQ(controller.toolPanelWindow(), nullptr);
     EXPECT_EQ(controller.popoverWindow(), nullptr);
@@ -117,7 +118,7 @@ TEST_F(ToolPanelWindow, loadedPanelHasItsAttributes)
     const platform::WindowAttributes &attributes = controller->toolPanelWindow()->attributes();
 
     EXPECT_EQ(controller->window(), controller->toolPanelWindow());
-    EXPECT_EQ(controller->toolPanelWindow()->windowController(), controller.get());
+    EXPECT_EQ(contentOf(*controller->toolPanelWindow()).responder(), controller.get());
     EXPECT_EQ(attributes.backgroundColor.alpha(), 0);
     EXPECT_FALSE(attributes.isOpaque);
     EXPECT_EQ(attributes.collectionBehavior.toInt(), 257U);
@@ -137,7 +138,7 @@ TEST_F(ToolPanelWindow, neverTakesTheKeys)
     EXPECT_TRUE(m_panel.testAttribute(Qt::WA_ShowWithoutActivating));
     show();
 
-    EXPECT_TRUE(m_board->window()->isKeyWindow());
+    EXPECT_TRUE(contentOf(*m_board->window()).isKeyWindow());
 }
 
 TEST_F(ToolPanelWindow, buttonsLieInsideThePanelAndApart)
@@ -282,7 +283,7 @@ TEST_F(ToolPanelWindowDeathTest, pressWithoutAPanelStopsTheProcess)
 
 TEST_F(ToolPanelWindowDeathTest, pressWithAnotherContentStopsTheProcess)
 {
-    m_panel.setContentViewController(nullptr);
+    contentOf(m_panel).setContentViewController(nullptr);
 
     EXPECT_DEATH(
         m_controller.mouseDown(), "penwick: fatal error: the panel's content is no tool bar");
@@ -290,7 +291,7 @@ TEST_F(ToolPanelWindowDeathTest, pressWithAnotherContentStopsTheProcess)
 
 TEST_F(ToolPanelWindowDeathTest, pressBeforeThePopoverWindowIsThereStopsTheProcess)
 {
-    m_panel.setContentViewController(std::make_unique<ToolPanelViewController>());
+    contentOf(m_panel).setContentViewController(std::make_unique<ToolPanelViewController>());
 
     EXPECT_DEATH(
         m_controller.mouseDown(), "penwick: fatal error: the tool bar has no popover window");

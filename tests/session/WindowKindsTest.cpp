@@ -4,6 +4,7 @@
 
 #include "canvas/DrawViewController.h"
 #include "platform/view/View.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 
 #include <QElapsedTimer>
@@ -32,7 +33,7 @@ protected:
     [[nodiscard]] static platform::ImageView &imageViewOf(DrawingWindowController &controller)
     {
         return *dynamic_cast<DrawViewController &>(
-            *controller.drawingWindow()->contentViewController())
+            *contentOf(*controller.drawingWindow()).contentViewController())
                     .annotatedImageView();
     }
 
@@ -68,7 +69,7 @@ TEST_F(WindowKinds, annotationCoversExactlyTheGivenScreen)
     EXPECT_TRUE(attributes.titlebarAppearsTransparent);
     EXPECT_FALSE(attributes.hasShadow);
     EXPECT_EQ(attributes.level, platform::WindowLevel::mainMenu);
-    EXPECT_EQ(controller.drawingWindow()->contentView()->layer()->borderWidth, 0.0);
+    EXPECT_EQ(contentOf(*controller.drawingWindow()).contentView()->layer()->borderWidth, 0.0);
 }
 
 TEST_F(WindowKinds, toolBarStandsTwentyPointsInsideTheAnnotation)
@@ -92,7 +93,7 @@ TEST_F(WindowKinds, imageWindowsOuterFrameIsTheImagesSizeInPoints)
     EXPECT_EQ(imageViewOf(controller).frame(), (Rect { 0, 0, 400, 300 }));
     EXPECT_EQ(imageViewOf(controller).image(), image);
     EXPECT_EQ(imageViewOf(controller).imageFrameStyle(), platform::ImageFrameStyle::Photo);
-    EXPECT_EQ(controller.drawingWindow()->contentView()->layer()->borderWidth, 3.0);
+    EXPECT_EQ(contentOf(*controller.drawingWindow()).contentView()->layer()->borderWidth, 3.0);
 }
 
 TEST_F(WindowKinds, imageWindowWithoutATitleKeepsTheBoards)
@@ -171,7 +172,8 @@ TEST_F(WindowKinds, bannersGroundIsTranslucentWithRoundCorners)
 {
     DrawingWindowController &controller = open(WindowType::whiteboard, primary());
 
-    const platform::Layer &layer = *controller.sharingNotificationWindow()->contentView()->layer();
+    const platform::Layer &layer
+        = *contentOf(*controller.sharingNotificationWindow()).contentView()->layer();
     EXPECT_EQ(layer.backgroundColor.rgb(), qRgb(85, 85, 85));
     EXPECT_NEAR(layer.backgroundColor.alphaF(), 0.5, 0.001);
     EXPECT_EQ(layer.borderWidth, 0.0);

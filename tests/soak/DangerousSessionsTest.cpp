@@ -5,6 +5,7 @@
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ToolPanelButton.h"
 #include "toolpanel/ToolPanelViewController.h"
@@ -59,7 +60,7 @@ protected:
 
 DrawingCanvasView &canvasOf(const DrawingWindowController &board)
 {
-    return dynamic_cast<DrawingCanvasView &>(*board.drawingWindow()->contentView());
+    return dynamic_cast<DrawingCanvasView &>(*contentOf(*board.drawingWindow()).contentView());
 }
 
 } // namespace

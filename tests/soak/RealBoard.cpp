@@ -5,6 +5,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
 #include "history/UndoRedoManager.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "textbox/DeleteTextBoxButton.h"
 #include "textbox/TnTextBox.h"
@@ -78,7 +79,7 @@ void RealBoard::open(WindowType type)
 
 DrawViewController &RealBoard::controller() const
 {
-    return dynamic_cast<DrawViewController &>(*window().contentViewController());
+    return dynamic_cast<DrawViewController &>(*contentOf(window()).contentViewController());
 }
 
 DrawingCanvasView &RealBoard::canvas() const

@@ -7,6 +7,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
 #include "history/UndoRedoManager.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "soak/PlainBoard.h"
 #include "textbox/DeleteTextBoxButton.h"
@@ -108,7 +109,7 @@ std::string RealBoard::panelInWords() const
     words += "\npopover ";
     if (bar().popoverW()->isVisible()) {
         const auto *const first = dynamic_cast<ToolOptionsButton *>(
-            bar().popoverW()->contentView()->subviews().at(0)->subviews().at(0));
+            contentOf(*bar().popoverW()).contentView()->subviews().at(0)->subviews().at(0));
         words += first->identifier().section(QLatin1Char('#'), 0, 0).toStdString();
     }
     return words;
@@ -156,7 +157,7 @@ std::string RealBoard::inWords(const std::string &posted) const
         words += " " + nameOf(entry.textId);
     words += "\nundo" + stack(history.undoStack()) + "\nredo" + stack(history.redoStack());
     words += "\ncount " + std::to_string(history.undoCount()) + "\nviews" + viewsInWords();
-    words += "\nresponder " + nameOf(window().firstResponder());
+    words += "\nresponder " + nameOf(contentOf(window()).firstResponder());
     words += "\ntool " + view.currentSelectedTool().toStdString() + " after "
         + view.lastSelecedTool().toStdString();
     words += "\ncolor " + colorMap().key(view.brushColor()).toStdString() + " thickness "

@@ -2,6 +2,7 @@
 // The mark beside a text box: where it stands and what it looks like.
 #include "textbox/DeleteTextBoxButton.h"
 
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 #include <QPainter>
@@ -245,7 +246,7 @@ TEST_F(DeleteTextBoxButtonTest, pressDoesNotEndTheEditing)
 
     pressOn(*box->deleteTextButton(), { 10, 10 });
 
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_TRUE(box->isEditable());
 }
 

@@ -4,6 +4,7 @@
 
 #include "appearance/Theme.h"
 #include "canvas/CanvasFixture.h"
+#include "platform/window/WindowContent.h"
 
 #include <QApplication>
 #include <QClipboard>
@@ -60,7 +61,7 @@ protected:
     /// Ends whatever is edited.
     void leave()
     {
-        window.makeFirstResponder(canvas);
+        contentOf(window).makeFirstResponder(canvas);
         settle();
     }
 

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Text boxes through the whole history with the canvas on the screen.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 namespace penwick::test {
@@ -123,7 +124,7 @@ TEST_F(TextBoxHistoryTest, boxErasedByBackspaceComesBack)
     QTest::keyClick(box.get(), Qt::Key_Backspace);
     settle();
     EXPECT_EQ(boxes(), Views {});
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
 
     undo();
     EXPECT_EQ(boxes(), Views { box.get() });
@@ -285,7 +286,7 @@ TEST_F(TextBoxHistoryTest, undoOfAStrokeGoesOnWithTheEditing)
 
     EXPECT_TRUE(model().pathArray().isEmpty());
     EXPECT_TRUE(box->isEditable());
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_EQ(visibleButtons(), 1);
 }
 

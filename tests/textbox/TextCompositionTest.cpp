@@ -2,6 +2,7 @@
 // What an input method composes in a box.
 #include "textbox/TextComposition.h"
 
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 #include <QInputMethodEvent>
@@ -72,7 +73,7 @@ TEST_F(TextCompositionTest, isEndedByEscapeFirstAndTheEditingOnlyThen)
     EXPECT_EQ(compositionIn(*box), QString());
     EXPECT_EQ(box->toPlainText(), m_half); // the input method has let the key through
     EXPECT_TRUE(box->isEditable());
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
 
     QTest::keyClick(box.get(), Qt::Key_Escape);
     EXPECT_FALSE(box->isEditable());

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What stops the process when a text box is used.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 namespace penwick::test {
@@ -31,7 +32,7 @@ TEST_F(TnTextBoxDeathTest, leavingAnEmptyBoxWithoutADelegateStopsTheProcess)
     const auto box = newBox();
     box->setTextBoxDelegate(nullptr);
 
-    EXPECT_DEATH(window.makeFirstResponder(canvas), noDelegate);
+    EXPECT_DEATH(contentOf(window).makeFirstResponder(canvas), noDelegate);
 }
 
 TEST_F(TnTextBoxDeathTest, delegateThatIsGoneStopsTheProcess)

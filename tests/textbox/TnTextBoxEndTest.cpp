@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // How a text box is deleted.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 #include <algorithm>
@@ -61,7 +62,7 @@ TEST_F(TnTextBoxEndTest, otherKeysOnAPlacedBoxDoNothing)
 
     EXPECT_EQ(box->superview(), canvas);
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
 }
 
 TEST_F(TnTextBoxEndTest, backspaceInABoxThatIsEditedDeletesACharacter)

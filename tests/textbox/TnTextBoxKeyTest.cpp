@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Editing: keys that end it, the clipboard and the editor's own undo.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 #include <ostream>
@@ -32,7 +33,7 @@ TEST_P(TnTextBoxEndingKeyTest, endsEditingSoThatTheNextClickMakesABox)
     QTest::keyClick(box.get(), GetParam().key);
 
     EXPECT_FALSE(box->isEditable());
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
 
     controller->handleToolSelection(QStringLiteral("text"));
@@ -47,7 +48,7 @@ TEST_P(TnTextBoxEndingKeyTest, inAnEmptyBoxDeletesIt)
     QTest::keyClick(box.get(), GetParam().key);
 
     EXPECT_EQ(box->superview(), nullptr);
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
 }
 
 TEST_P(TnTextBoxEndingKeyTest, onAPlacedBoxKeepsItPlaced)
@@ -208,7 +209,7 @@ TEST_F(TnTextBoxKeyTest, losingTheFocusToSomethingElseDoesNotEndEditing)
     EXPECT_TRUE(box->isEditable());
     EXPECT_TRUE(box->hasDashedBorder());
     EXPECT_EQ(box->superview(), canvas);
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
 }
 
 } // namespace

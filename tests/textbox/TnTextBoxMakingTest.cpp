@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What a text box is like as it is made.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 #include <QTextDocument>
@@ -78,7 +79,7 @@ TEST_F(TnTextBoxMakingTest, boxThatWasNotCustomizedIsEditedAndLeft)
     const auto box = platform::makeView<TnTextBox>(Rect { 20, 100, 200, 30 });
     box->setTextBoxDelegate(&owner);
     canvas->addSubview(box);
-    window.makeFirstResponder(box.get());
+    contentOf(window).makeFirstResponder(box.get());
     QTest::keyClicks(box.get(), QStringLiteral("Hello"));
     leave();
 
@@ -172,7 +173,7 @@ TEST_F(TnTextBoxMakingTest, newBoxOnACanvasIsEditedWithItsDeleteButtonBesideIt)
     const auto box = newBox();
 
     EXPECT_EQ(box->frame(), (Rect { 20, 100, 200, 30 }));
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_TRUE(box->hasFocus());
     EXPECT_TRUE(box->isEditable());
     EXPECT_EQ(borderWidth(*box), 0.0);

@@ -3,6 +3,7 @@
 #include "textbox/TextBoxFixture.h"
 
 #include "appearance/ToolCursors.h"
+#include "platform/window/WindowContent.h"
 
 #include <QMenu>
 #include <QScrollBar>
@@ -43,7 +44,7 @@ TEST_F(TnTextBoxPointerTest, dragOfAPlacedBoxKeepsThePointUnderThePointer)
     releaseOn(*box, { 30, 10 });
     EXPECT_EQ(box->frame(), (Rect { 34, before.y - 20, before.width, before.height }));
     EXPECT_EQ(box->panGesture().state(), State::Ended);
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_FALSE(box->isEditable());
 }
 
@@ -350,7 +351,7 @@ TEST_F(TnTextBoxPointerTest, otherButtonsOnAPlacedBoxDoNothing)
     }
 
     EXPECT_FALSE(box->isEditable());
-    EXPECT_EQ(window.firstResponder(), canvas);
+    EXPECT_EQ(contentOf(window).firstResponder(), canvas);
     EXPECT_EQ(box->frame(), before);
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
 }
@@ -364,7 +365,7 @@ TEST_F(TnTextBoxPointerTest, otherButtonsInABoxThatIsEditedDrawNothingAndGoOnEdi
         clickOn(*box, { 30, 10 }, button);
 
     EXPECT_TRUE(model().pathArray().isEmpty());
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_TRUE(box->isEditable());
 }
 

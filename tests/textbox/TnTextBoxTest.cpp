@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The two modes of a text box.
+#include "platform/window/WindowContent.h"
 #include "textbox/TextBoxFixture.h"
 
 namespace penwick::test {
@@ -33,7 +34,7 @@ TEST_F(TnTextBoxTest, emptyBoxThatIsLeftRemovesItselfAndReportsItsHashOnce)
     const auto box = newBox();
     box->setTextBoxDelegate(&owner);
 
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
 
     EXPECT_EQ(owner.reports, Ids { box->hash() });
     EXPECT_EQ(box->superview(), nullptr);
@@ -87,7 +88,7 @@ TEST_F(TnTextBoxTest, clickOnAPlacedBoxSelectsItAndKeepsItPlaced)
 
     clickOn(*box, { 50, 15 });
 
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     EXPECT_FALSE(box->isEditable());
     EXPECT_FALSE(box->hasDashedBorder());
     EXPECT_EQ(borderWidth(*box), 3.0);
@@ -117,7 +118,7 @@ TEST_F(TnTextBoxTest, doubleClickOnAPlacedBoxEditsItAgain)
     EXPECT_TRUE(box->hasDashedBorder());
     EXPECT_EQ(borderWidth(*box), 0.0);
     EXPECT_FALSE(box->deleteTextButton()->isHidden());
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
     QTest::keyClick(box.get(), Qt::Key_End);
     QTest::keyClicks(box.get(), QStringLiteral("!"));
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello!"));
@@ -143,7 +144,7 @@ TEST_F(TnTextBoxTest, clickOnAnotherBoxLeavesTheOneThatIsEdited)
 
     clickOn(*placed, { 20, 15 });
 
-    EXPECT_EQ(window.firstResponder(), placed.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), placed.get());
     EXPECT_FALSE(edited->isEditable());
     EXPECT_TRUE(edited->deleteTextButton()->isHidden());
 }
@@ -154,7 +155,7 @@ TEST_F(TnTextBoxTest, pressMakesItFirstResponder)
 
     pressOn(*box, { 50, 15 });
 
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
 }
 
 TEST_F(TnTextBoxTest, itIsFirstResponderBeforeTheEditorHearsOfThePress)
@@ -163,7 +164,7 @@ TEST_F(TnTextBoxTest, itIsFirstResponderBeforeTheEditorHearsOfThePress)
     platform::View *responder = nullptr;
     const QObject context; // goes before what it writes to
     QObject::connect(box.get(), &QTextEdit::selectionChanged, &context,
-        [&] { responder = window.firstResponder(); });
+        [&] { responder = contentOf(window).firstResponder(); });
 
     // With Shift the editor selects up to the press, and nothing before it does.
     QMouseEvent press(QEvent::MouseButtonPress, QPointF(7, 15),
@@ -191,11 +192,11 @@ TEST_F(TnTextBoxTest, releaseMakesItFirstResponder)
 {
     const auto box = placedBox();
     pressOn(*box, { 50, 15 });
-    window.makeFirstResponder(canvas);
+    contentOf(window).makeFirstResponder(canvas);
 
     releaseOn(*box, { 50, 15 });
 
-    EXPECT_EQ(window.firstResponder(), box.get());
+    EXPECT_EQ(contentOf(window).firstResponder(), box.get());
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 #include "toolpanel/ToolPanelFixture.h"
 
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 
@@ -211,11 +212,11 @@ TEST_F(PopoverChoiceTest, popoverThatGivesTheKeysUpCloses)
             press(tools[index]);
         if (!isPopoverShown()) // the first press of a tool only chooses it
             press(tools[index]);
-        ASSERT_EQ(popover().contentView(), views[index]);
-        ASSERT_TRUE(popover().makeFirstResponder(views[index]));
+        ASSERT_EQ(contentOf(popover()).contentView(), views[index]);
+        ASSERT_TRUE(contentOf(popover()).makeFirstResponder(views[index]));
         EXPECT_TRUE(isPopoverShown());
 
-        EXPECT_TRUE(popover().makeFirstResponder(nullptr));
+        EXPECT_TRUE(contentOf(popover()).makeFirstResponder(nullptr));
         EXPECT_FALSE(isPopoverShown()) << tools[index];
     }
 }
@@ -230,7 +231,7 @@ TEST_F(PopoverChoiceTest, viewMadeInCodeHasItsFrame)
 TEST_F(PopoverChoiceTest, popoverTakesItsColoursInTheWindow)
 {
     for (PopoverView *const view : popoverViews()) {
-        popover().setContentView(view);
+        contentOf(popover()).setContentView(view);
         const platform::Layer *const layer = view->layer();
 
         ASSERT_NE(layer, nullptr);

@@ -6,6 +6,7 @@
 #include "canvas/DrawingCanvasModel.h"
 #include "canvas/DrawingCanvasView.h"
 #include "history/NotificationNames.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelWindowController.h"
 #include "toolpanel/ButtonLook.h"
 #include "toolpanel/ContrastSetting.h"
@@ -55,7 +56,7 @@ protected:
 
     [[nodiscard]] DrawViewController &drawViewController() const
     {
-        return *dynamic_cast<DrawViewController *>(drawing.contentViewController());
+        return *dynamic_cast<DrawViewController *>(contentOf(drawing).contentViewController());
     }
     [[nodiscard]] DrawingCanvasView &canvas() const { return *drawViewController().drawingView(); }
     [[nodiscard]] platform::Window &popover() const { return *bar.popoverW(); }

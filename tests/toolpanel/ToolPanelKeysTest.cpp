@@ -2,6 +2,7 @@
 // Keys on a board and its tool bar, as they come from the desktop: which of them work the bar when.
 #include "toolpanel/ToolPanelFixture.h"
 
+#include "platform/window/WindowContent.h"
 #include "textbox/TnTextBox.h"
 
 #include <QKeyEvent>
@@ -25,7 +26,7 @@ protected:
     void click(QPoint place) { click(drawing, place); }
     void type(Qt::Key key, Qt::KeyboardModifiers modifiers = {})
     {
-        platform::View *const responder = drawing.firstResponder();
+        platform::View *const responder = contentOf(drawing).firstResponder();
         QTest::keyClick(responder ? &responder->widget() : &drawing, key, modifiers);
     }
     void repeat(Qt::Key key, Qt::KeyboardModifiers modifiers = {})

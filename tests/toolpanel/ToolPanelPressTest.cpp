@@ -3,6 +3,7 @@
 #include "toolpanel/ToolPanelFixture.h"
 
 #include "canvas/DrawingCanvasModel.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 
@@ -272,7 +273,7 @@ TEST_F(ToolPanelPress, firstPopoverIsPutIntoTheWindowAsThePanelsChild)
 {
     press("brush");
 
-    EXPECT_EQ(popover().contentView(), bar.popoverVc()->brushPopoverView());
+    EXPECT_EQ(contentOf(popover()).contentView(), bar.popoverVc()->brushPopoverView());
     EXPECT_EQ(popover().parentWindow(), &panel);
     EXPECT_TRUE(bar.popoverVc()->brushPopoverView()->widget().isVisible());
 }
@@ -284,7 +285,7 @@ TEST_F(ToolPanelPress, otherPopoverTakesItsPlaceInTheWindow)
 
     press("color");
 
-    EXPECT_EQ(popover().contentView(), bar.popoverVc()->colorPopoverView());
+    EXPECT_EQ(contentOf(popover()).contentView(), bar.popoverVc()->colorPopoverView());
     EXPECT_TRUE(bar.popoverVc()->colorPopoverView()->widget().isVisible());
     EXPECT_FALSE(bar.popoverVc()->brushPopoverView()->widget().isVisible());
     EXPECT_EQ(panel.childWindows(), std::vector<platform::Window *> { &popover() });
@@ -294,13 +295,13 @@ TEST_F(ToolPanelPress, otherPopoverTakesItsPlaceInTheWindow)
 TEST_F(ToolPanelPress, samePopoverIsOnlyShownAgain)
 {
     press("color");
-    popover().setContentView(bar.popoverVc()->textPopoverView());
+    contentOf(popover()).setContentView(bar.popoverVc()->textPopoverView());
     press("color");
 
     press("color");
 
     // Had it been put in again, this would be the colours' view.
-    EXPECT_EQ(popover().contentView(), bar.popoverVc()->textPopoverView());
+    EXPECT_EQ(contentOf(popover()).contentView(), bar.popoverVc()->textPopoverView());
     EXPECT_TRUE(isPopoverShown());
 }
 

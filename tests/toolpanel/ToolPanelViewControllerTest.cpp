@@ -5,6 +5,7 @@
 #include "appearance/PenwickBundle.h"
 #include "appearance/Theme.h"
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 
 namespace penwick::test {
 
@@ -139,13 +140,13 @@ TEST_F(ToolPanel, assignedDelegateHearsOfThePressesAndItsCanvasSaysTheTool)
 
 TEST_F(ToolPanel, popoverWindowHasItsContentControllerFromTheStart)
 {
-    EXPECT_EQ(popover().contentViewController(), bar.popoverVc());
-    EXPECT_EQ(popover().contentView(), bar.popoverVc()->textPopoverView());
+    EXPECT_EQ(contentOf(popover()).contentViewController(), bar.popoverVc());
+    EXPECT_EQ(contentOf(popover()).contentView(), bar.popoverVc()->textPopoverView());
     EXPECT_FALSE(isPopoverShown());
 
     press("color");
-    EXPECT_EQ(popover().contentViewController(), bar.popoverVc());
-    EXPECT_EQ(popover().contentView(), bar.popoverVc()->colorPopoverView());
+    EXPECT_EQ(contentOf(popover()).contentViewController(), bar.popoverVc());
+    EXPECT_EQ(contentOf(popover()).contentView(), bar.popoverVc()->colorPopoverView());
 
     const QPointer<PopoverViewController> popovers = bar.popoverVc();
     m_board.reset();

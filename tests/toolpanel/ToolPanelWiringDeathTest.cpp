@@ -5,6 +5,7 @@
 #include "appearance/PenwickBundle.h"
 #include "platform/scene/Bundle.h"
 #include "platform/view/PlainView.h"
+#include "platform/window/WindowContent.h"
 #include "session/ToolPanelScene.h"
 #include "toolpanel/PopoverInterface.h"
 
@@ -22,7 +23,7 @@ TEST_F(ToolPanelWiringDeathTest, parentWhoseControllerHasNoWindowStops)
     const auto show = [] {
         platform::WindowController controller;
         platform::Window parent;
-        parent.setWindowController(&controller);
+        contentOf(parent).setResponder(&controller);
         parent.show();
         const auto scene = makeToolPanelScene(*penwickBundle());
         auto &stranger = dynamic_cast<ToolPanelWindowController &>(*scene);

@@ -4,6 +4,7 @@
 
 #include <penwick/Export.h>
 #include <penwick/platform/Geometry.h>
+#include <penwick/platform/ScreenFrame.h>
 #include <penwick/platform/WindowAttributes.h>
 
 #include <QImage>
@@ -13,13 +14,9 @@
 #include <memory>
 #include <vector>
 
-class QScreen;
-
 namespace penwick::platform {
 
-class View;
-class ViewController;
-class WindowController;
+class WindowParts;
 
 /// Told of what happens to a window, once for each thing that happened. A delegate is a QObject.
 class PENWICK_EXPORT WindowDelegate
@@ -117,13 +114,6 @@ public:
 
     // Content
 
-    [[nodiscard]] View *contentView() const;
-    /// Lets `view` fill the window's content. A view from outside is borrowed: it comes into this
-    /// window and leaves it again when another one takes its place.
-    void setContentView(View *view);
-    [[nodiscard]] ViewController *contentViewController() const;
-    /// Takes `controller`, whose view must be one of this window's own.
-    void setContentViewController(std::unique_ptr<ViewController> controller);
     /// The picture of what has been drawn, as large as the window's content, in its device pixels
     /// and with their number a point as its devicePixelRatio(): the paper (transparent in a layer
     /// over a screen) or the picture that is drawn on, the strokes, the texts. No border, caret,
@@ -134,27 +124,10 @@ public:
     /// as long as the window is there. Null where the content has no size or there is no memory
     /// for it.
     [[nodiscard]] QImage contentImage() const;
-    [[nodiscard]] WindowController *windowController() const;
-    void setWindowController(WindowController *controller);
     [[nodiscard]] WindowDelegate *delegate() const; ///< null without one, or once it is gone
     void setDelegate(WindowDelegate *delegate); ///< weak
 
-    // Responders
-
-    /// The view that gets the keys; null: the window itself does. Kept while the window is not
-    /// active.
-    [[nodiscard]] View *firstResponder() const;
-    /// Makes `view` (null: the window itself) the first responder, after the present one has
-    /// resigned. Returns whether it is the first responder now.
-    bool makeFirstResponder(View *view);
-    /// Whether this is the window that gets the keys.
-    [[nodiscard]] bool isKeyWindow() const;
-    void forgetView(const View &view); ///< `view` is being destroyed
-    /// Makes views of the widgets that a scene built in this window.
-    void adoptScene();
-
-    /// Takes the cursors of `view` as it declares them now.
-    void invalidateCursorRects(View &view);
+    // Showing and closing
 
     /// Puts the window in front of the others without making it the key window. A child of a
     /// window that is not on the screen comes up together with that one.
@@ -190,22 +163,18 @@ protected:
 private:
     void applyAttributes();
     void orderIn();
-    void releaseContentView();
+    void prepareBackdrop();
     void tellDelegate(void (WindowDelegate::*what)());
     void showFamily();
     void hideFamily();
-    [[nodiscard]] std::vector<View *> topViews() const;
+    void raiseFamily();
+    void takeFamilyAlong(QPoint delta) const;
+    [[nodiscard]] bool canShow() const;
 
-    class Private;
-    const std::unique_ptr<Private> d; // keeps native headers out of this file
+    const std::unique_ptr<WindowParts> d; // what no host needs
     WindowAttributes m_attributes;
     QPointer<QObject> m_delegateObject;
     WindowDelegate *m_delegate = nullptr;
-    View *m_contentView = nullptr;
-    View *m_firstResponder = nullptr;
 };
-
-/// `screen`'s area, in points, y up, from the primary screen's bottom left corner.
-[[nodiscard]] PENWICK_EXPORT Rect frameOfScreen(const QScreen &screen);
 
 } // namespace penwick::platform

@@ -3,12 +3,11 @@
 #pragma once
 
 #include <penwick/Export.h>
+#include <penwick/platform/WindowResponder.h>
 
 #include <QObject>
 
 #include <memory>
-
-class QKeyEvent;
 
 namespace penwick::platform {
 
@@ -16,7 +15,7 @@ class Window;
 
 /// Owns a window, which is destroyed together with its controller. GUI thread only: on another
 /// thread, or without a QApplication, its operations stop the process.
-class PENWICK_EXPORT WindowController : public QObject
+class PENWICK_EXPORT WindowController : public QObject, public WindowResponder
 {
     Q_OBJECT
 
@@ -42,12 +41,9 @@ public:
 
     /// The window has been loaded.
     virtual void windowDidLoad();
-    /// The left button went down where no view of the window took it.
-    virtual void mouseDown();
-    /// The left button that mouseDown() was called for was let go again.
-    virtual void mouseUp();
-    /// A key went down that no view of the window took. Returns whether the controller acted on it.
-    virtual bool keyDown(const QKeyEvent &event);
+    void mouseDown() override;
+    void mouseUp() override;
+    bool keyDown(const QKeyEvent &event) override;
 
 private:
     std::unique_ptr<Window> m_window;

@@ -3,7 +3,6 @@
 
 #include "platform/foundation/FatalError.h"
 #include "platform/foundation/ObjectIdentifier.h"
-#include "platform/view/ViewController.h"
 #include "platform/view/ViewHost.h"
 #include "platform/view/ViewInput.h"
 
@@ -42,19 +41,9 @@ View::~View()
     }
 }
 
-ViewController *View::viewController() const
-{
-    return m_viewController;
-}
-
-void View::setViewController(ViewController *controller)
-{
-    m_viewController = controller;
-}
-
 bool View::resignFirstResponder()
 {
-    return !m_viewController || m_viewController->resignFirstResponder();
+    return !m_nextResponder.get() || m_nextResponder.get()->resignFirstResponder();
 }
 
 void View::pressIsComing()

@@ -6,10 +6,10 @@
 
 #include <penwick/platform/Geometry.h>
 
+#include "platform/foundation/WeakReference.h"
 #include "platform/view/Cursor.h"
 #include "platform/view/Layer.h"
-
-#include <QPointer>
+#include "platform/view/NextResponder.h"
 
 #include <cstdint>
 #include <memory>
@@ -22,7 +22,6 @@ class QWidget;
 namespace penwick::platform {
 
 class PanGestureRecognizer;
-class ViewController;
 class ViewHost;
 
 /// Which end of a pen a pointer is; none of a mouse or a finger.
@@ -68,9 +67,8 @@ public:
     /// The widget that shows the view's content: itself, or the viewport of a scrolling widget.
     [[nodiscard]] virtual QWidget &surface() const = 0;
 
-    /// The controller that answers for the view; null without one. Weak.
-    [[nodiscard]] ViewController *viewController() const;
-    void setViewController(ViewController *controller);
+    /// Lets `responder`, a QObject, answer for the view. Weak; null: nobody.
+    void setNextResponder(NextResponder *responder) { m_nextResponder = responder; }
 
     /// Identity: unique in the process, the same for the view's whole life.
     [[nodiscard]] std::int64_t hash() const { return m_hash; }
@@ -165,8 +163,8 @@ public:
     virtual void viewDidMoveToWindow() { }
     /// The size of the superview has changed; it was `former`.
     virtual void superviewDidResize(Size /*former*/) { }
-    /// Asks the view to stop being the first responder; returns whether it does. A view with a
-    /// controller returns the controller's answer.
+    /// Asks the view to stop being the first responder; returns whether it does. A view with a next
+    /// responder returns that one's answer.
     virtual bool resignFirstResponder();
 
     /// Paints the view as content, and above it its subviews, the lowest first, each in its place;
@@ -217,7 +215,7 @@ private:
     const std::int64_t m_hash;
     Rect m_frame;
     View *m_superview = nullptr;
-    QPointer<ViewController> m_viewController;
+    WeakReference<NextResponder> m_nextResponder;
     std::vector<Subview> m_subviews;
     bool m_isHidden = false;
     bool m_isAboveSiblings = false;

@@ -11,7 +11,7 @@ ViewController::~ViewController() = default;
 void ViewController::setView(View &view)
 {
     m_view = &view;
-    view.setViewController(this);
+    view.setNextResponder(this);
     viewDidLoad();
 }
 

@@ -2,6 +2,8 @@
 // The controller of a view.
 #pragma once
 
+#include "platform/view/NextResponder.h"
+
 #include <QObject>
 
 namespace penwick::platform {
@@ -10,7 +12,7 @@ class View;
 
 /// Joins a view that a scene built to the rest of the component. Owned by the window whose content
 /// the view is, or by another controller. GUI thread only.
-class ViewController : public QObject
+class ViewController : public QObject, public NextResponder
 {
     Q_OBJECT
 
@@ -30,7 +32,7 @@ public:
     virtual void viewWillAppear() { }
     /// Asks, for a view whose class does not decide this itself, whether it stops being the first
     /// responder.
-    virtual bool resignFirstResponder() { return true; }
+    bool resignFirstResponder() override { return true; }
 
 private:
     View *m_view = nullptr;

@@ -35,8 +35,6 @@ public:
     [[nodiscard]] virtual bool isKeyWindow() const = 0;
     /// What the window shows where no view paints.
     [[nodiscard]] virtual QColor backgroundColor() const = 0;
-    /// Closes the window, as its user would.
-    virtual void close() = 0;
     /// `view` leaves the window, or is being destroyed.
     virtual void forgetView(const View &view) = 0;
 

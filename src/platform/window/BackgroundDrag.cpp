@@ -1,23 +1,20 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/BackgroundDrag.h"
 
-#include <penwick/platform/Window.h>
-
 #include "platform/window/ScreenCoordinates.h"
 
 namespace penwick::platform {
 
-void BackgroundDrag::begin(const Window &window, QPoint pointer)
+void BackgroundDrag::begin(const Rect &frame, QPoint pointer)
 {
-    const WindowAttributes &attributes = window.attributes();
-    if (attributes.isMovable && attributes.isMovableByWindowBackground)
-        m_grab = pointer - toDesktop(window.frame()).topLeft();
+    m_grab = pointer - toDesktop(frame).topLeft();
 }
 
-void BackgroundDrag::goOn(Window &window, QPoint pointer) const
+std::optional<Rect> BackgroundDrag::moved(const Rect &frame, QPoint pointer) const
 {
-    if (m_grab)
-        window.setFrame(fromDesktop(QRect(pointer - *m_grab, toDesktop(window.frame()).size())));
+    if (!m_grab)
+        return std::nullopt;
+    return fromDesktop(QRect(pointer - *m_grab, toDesktop(frame).size()));
 }
 
 } // namespace penwick::platform

@@ -2,21 +2,22 @@
 // Moves a window with the pointer.
 #pragma once
 
+#include <penwick/platform/Geometry.h>
+
 #include <QPoint>
 
 #include <optional>
 
 namespace penwick::platform {
 
-class Window;
-
-/// One drag of a window by its background. Places are in Qt's desktop coordinates, y down.
+/// One drag of a window by its background. The pointer is in Qt's desktop coordinates, y down.
 class BackgroundDrag
 {
 public:
-    /// Takes hold at `pointer`, if the window's attributes let it be moved that way.
-    void begin(const Window &window, QPoint pointer);
-    void goOn(Window &window, QPoint pointer) const;
+    /// Takes hold of a window that has `frame`.
+    void begin(const Rect &frame, QPoint pointer);
+    /// Where the window that has `frame` is to go; nothing while it is not held.
+    [[nodiscard]] std::optional<Rect> moved(const Rect &frame, QPoint pointer) const;
     void end() { m_grab.reset(); }
 
 private:

@@ -1,44 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/CaptureExclusion.h"
 
-#include "platform/foundation/GuiThread.h"
-#include "platform/native/NativeDesktop.h"
-#include "platform/window/WindowPrivate.h"
-
 #include <QEvent>
+#include <QWidget>
 
 #include <algorithm>
 
 namespace penwick::platform {
 
-namespace {
-
-bool isNotToBeSeen(const Window &window)
-{
-    return window.attributes().sharingType == SharingType::none;
-}
-
-} // namespace
-
-bool Window::isKeptOutOfCaptures() const
-{
-    requireGuiThread();
-    return isNotToBeSeen(*this) && NativeDesktop::instance().keepsWindowsOutOfCaptures();
-}
-
-std::vector<WId> Window::windowsToLeaveOutOfCaptures() const
-{
-    requireGuiThread();
-    return d->captures.identifiers();
-}
-
-void Window::expectChildWindow(Window &child)
-{
-    requireGuiThread();
-    d->captures.add(child.d->captures);
-}
-
-CaptureExclusion::CaptureExclusion(Window &window)
+CaptureExclusion::CaptureExclusion(QWidget &window)
     : m_window(window)
 {
     window.installEventFilter(this);
@@ -72,13 +42,13 @@ void CaptureExclusion::onChildGone()
     check();
 }
 
-std::vector<Window *> CaptureExclusion::windows() const
+std::vector<QWidget *> CaptureExclusion::windows() const
 {
-    std::vector<Window *> windows;
-    if (isNotToBeSeen(m_window))
+    std::vector<QWidget *> windows;
+    if (m_isLeftOut)
         windows.push_back(&m_window);
     for (const auto &child : m_children) {
-        const std::vector<Window *> above = child->windows();
+        const std::vector<QWidget *> above = child->windows();
         windows.insert(windows.end(), above.begin(), above.end());
     }
     return windows;
@@ -88,7 +58,7 @@ std::vector<WId> CaptureExclusion::identifiers()
 {
     std::vector<WId> identifiers;
     std::vector<Known> known;
-    for (Window *const window : windows()) {
+    for (QWidget *const window : windows()) {
         identifiers.push_back(window->winId());
         known.push_back({ window, identifiers.back() });
     }
@@ -109,13 +79,13 @@ bool CaptureExclusion::isAsKnown(const std::vector<Known> &present) const
 void CaptureExclusion::check()
 {
     std::vector<Known> present;
-    for (const Window *const window : windows())
+    for (const QWidget *const window : windows())
         present.push_back({ window, window->internalWinId() });
     const bool isNews = !isAsKnown(present);
     m_known = std::move(present);
     const QPointer<CaptureExclusion> parent = m_parent; // whoever is told may end the window
     if (isNews)
-        Q_EMIT m_window.windowsToLeaveOutOfCapturesChanged();
+        Q_EMIT changed();
     if (parent)
         parent->check();
 }

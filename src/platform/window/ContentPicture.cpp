@@ -5,6 +5,7 @@
 
 #include "platform/foundation/GuiThread.h"
 #include "platform/view/View.h"
+#include "platform/window/WindowParts.h"
 
 #include <QImage>
 #include <QPainter>
@@ -21,7 +22,7 @@ QImage Window::contentImage() const
     image.setDevicePixelRatio(scale);
     image.fill(m_attributes.backgroundColor);
     QPainter painter(&image);
-    for (View *const view : topViews())
+    for (View *const view : d->content.topViews())
         view->paintContent(painter);
     return image;
 }

@@ -4,8 +4,10 @@
 #include "platform/foundation/GuiThread.h"
 #include "platform/native/NativeDesktop.h"
 #include "platform/view/View.h"
+#include "platform/view/ViewController.h"
+#include "platform/window/ScreenCoordinates.h"
 #include "platform/window/WindowFlags.h"
-#include "platform/window/WindowPrivate.h"
+#include "platform/window/WindowParts.h"
 
 #include <QWindow>
 
@@ -23,19 +25,31 @@ QWidget *checked(QWidget *parent)
     return parent;
 }
 
+bool isLeftOut(const WindowAttributes &attributes)
+{
+    return attributes.sharingType == SharingType::none;
+}
+
+// The shape that a window keeps while its user resizes it, if it does and can be resized at all.
+std::optional<Size> keptRatio(const WindowAttributes &attributes)
+{
+    const bool isResizable = attributes.styleMask.testFlag(StyleMask::resizable);
+    return isResizable ? attributes.aspectRatio : std::nullopt;
+}
+
 } // namespace
 
 WindowDelegate::~WindowDelegate() = default;
 
 Window::Window(QWidget *parent)
     : QWidget(checked(parent), Qt::Window)
-    , d(std::make_unique<Private>(*this))
+    , d(std::make_unique<WindowParts>(*this, *this))
 {
     setAttribute(Qt::WA_QuitOnClose, false);
     setAttribute(Qt::WA_AlwaysShowToolTips); // a panel is never the active window
     const FrameTracker *const tracker = d->tracker;
     connect(tracker, &FrameTracker::rescaled, this, [this] { WindowBackdrop::rescale(*this); });
-    connect(tracker, &FrameTracker::shifted, this, [this](QPoint by) { d->family.takeAlong(by); });
+    connect(tracker, &FrameTracker::shifted, this, [this](QPoint by) { takeFamilyAlong(by); });
     const auto tell = [this](auto signal, void (WindowDelegate::*what)()) {
         connect(d->tracker, signal, this, [this, what] { tellDelegate(what); });
     };
@@ -43,6 +57,10 @@ Window::Window(QWidget *parent)
     tell(&FrameTracker::moved, &WindowDelegate::windowDidMove);
     tell(&FrameTracker::resized, &WindowDelegate::windowDidResize);
     connect(tracker, &FrameTracker::settled, this, &Window::frameSettled);
+    connect(
+        d->shape, &WindowShape::corrected, this, [this](const Rect &frame) { setFrame(frame); });
+    connect(&d->captures, &CaptureExclusion::changed, this,
+        &Window::windowsToLeaveOutOfCapturesChanged);
     applyAttributes();
 }
 
@@ -58,11 +76,9 @@ Window::Window(const Rect &contentRect, StyleMasks styleMask, BackingStore, bool
 Window::~Window()
 {
     requireGuiThreadAtEnd();
-    // A view that is destroyed together with its window does not resign.
-    m_firstResponder = nullptr;
+    d->content.end();
     for (Window *const child : childWindows())
         child->hide();
-    releaseContentView();
 }
 
 // Frame
@@ -109,6 +125,9 @@ void Window::setAttributes(const WindowAttributes &attributes)
 
 void Window::applyAttributes()
 {
+    d->captures.setLeftOut(isLeftOut(m_attributes));
+    d->shape->setRatio(keptRatio(m_attributes));
+    d->content.setBackgroundColor(m_attributes.backgroundColor);
     setAttribute(Qt::WA_TranslucentBackground, !m_attributes.isOpaque);
     setAttribute(Qt::WA_ShowWithoutActivating, !canBecomeKey(m_attributes));
     const Qt::WindowFlags flags = windowFlagsFor(m_attributes);
@@ -119,71 +138,42 @@ void Window::applyAttributes()
             show();
     }
     update();
-    if (m_contentView) // it may show the background itself
-        m_contentView->setNeedsDisplay();
 }
 
-// Content
-
-View *Window::contentView() const
+bool Window::showsWhatIsBelow() const
 {
     requireGuiThread();
-    return m_contentView;
+    return m_attributes.isOpaque || NativeDesktop::instance().isCompositing();
 }
 
-void Window::setContentView(View *view)
+void Window::prepareBackdrop()
 {
-    requireGuiThread();
-    if (view != m_contentView)
-        releaseContentView();
-    m_contentView = view;
-    if (!view)
+    d->backdrop.clear(*this);
+    if (showsWhatIsBelow())
         return;
-    if (view->widget().parentWidget() != this) {
-        d->isContentBorrowed = true;
-        view->widget().setParent(this);
-        view->announceWindow();
-        view->widget().show();
-    }
-    view->setFrame({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
+    const QRect area = toDesktop(frame());
+    View *const content = d->content.contentView();
+    if (canBecomeKey(m_attributes))
+        d->backdrop.takePicture(area);
+    else if (content && content->layer())
+        WindowBackdrop::cutCorners(*this, area.size(), content->layer()->cornerRadius);
 }
 
-void Window::releaseContentView()
-{
-    if (!m_contentView || !std::exchange(d->isContentBorrowed, false))
-        return;
-    m_contentView->widget().hide();
-    m_contentView->widget().setParent(nullptr);
-    m_contentView = nullptr;
-}
+// Captures
 
-ViewController *Window::contentViewController() const
+bool Window::isKeptOutOfCaptures() const
 {
     requireGuiThread();
-    return d->contentViewController.get();
+    return isLeftOut(m_attributes) && NativeDesktop::instance().keepsWindowsOutOfCaptures();
 }
 
-void Window::setContentViewController(std::unique_ptr<ViewController> controller)
+std::vector<WId> Window::windowsToLeaveOutOfCaptures() const
 {
     requireGuiThread();
-    d->contentViewController = std::move(controller);
-    if (d->contentViewController) {
-        d->contentViewController->setParent(this); // so that findChild() finds it
-        setContentView(d->contentViewController->view());
-    }
+    return d->captures.identifiers();
 }
 
-WindowController *Window::windowController() const
-{
-    requireGuiThread();
-    return d->windowController;
-}
-
-void Window::setWindowController(WindowController *controller)
-{
-    requireGuiThread();
-    d->windowController = controller;
-}
+// Delegate
 
 void Window::tellDelegate(void (WindowDelegate::*what)())
 {
@@ -204,145 +194,14 @@ void Window::setDelegate(WindowDelegate *delegate)
     m_delegate = delegate;
 }
 
-void Window::adoptScene()
-{
-    requireGuiThread();
-    d->tracker->request({ 0.0, 0.0, static_cast<double>(width()), static_cast<double>(height()) });
-    for (View *const view : topViews()) {
-        view->adoptScene();
-        view->announceWindow();
-    }
-}
-
-std::vector<View *> Window::topViews() const
-{
-    std::vector<View *> views;
-    for (QObject *const child : children()) {
-        if (auto *const view = dynamic_cast<View *>(child))
-            views.push_back(view);
-    }
-    return views;
-}
-
-// Responders
-
-View *Window::firstResponder() const
-{
-    requireGuiThread();
-    return m_firstResponder;
-}
-
-bool Window::isKeyWindow() const
-{
-    requireGuiThread();
-    return isActiveWindow();
-}
-
-bool Window::makeFirstResponder(View *view)
-{
-    requireGuiThread();
-    if (view != m_firstResponder) {
-        View *const previous = m_firstResponder;
-        // There is no first responder while the previous one resigns, because it may remove itself
-        // from the window.
-        m_firstResponder = nullptr;
-        if (previous && !previous->resignFirstResponder()) {
-            m_firstResponder = previous;
-            return false;
-        }
-        // The previous one may have made another view first responder. That one stays, if no other
-        // is wanted.
-        if (view || !m_firstResponder)
-            m_firstResponder = view && view->window() == &d->content ? view : nullptr;
-    }
-    QWidget &receiver = m_firstResponder ? m_firstResponder->widget() : *this;
-    receiver.setFocus(Qt::OtherFocusReason);
-    return m_firstResponder == view;
-}
-
-void Window::forgetView(const View &view)
-{
-    requireGuiThread();
-    if (m_firstResponder == &view)
-        m_firstResponder = nullptr;
-    if (m_contentView == &view)
-        m_contentView = nullptr;
-}
-
-void Window::invalidateCursorRects(View &view)
-{
-    requireGuiThread();
-    view.refreshCursorRects();
-}
-
-// Child windows
-
-void Window::addChildWindow(Window &child)
-{
-    requireGuiThread();
-    if (child.parentWindow() != this) {
-        if (Window *const former = child.parentWindow())
-            former->d->family.remove(child);
-        child.d->family.setParent(this);
-        d->family.add(child);
-        d->captures.add(child.d->captures);
-    }
-    if (child.d->family.canShow())
-        child.orderFront();
-}
-
-void Window::removeChildWindow(Window &child)
-{
-    requireGuiThread();
-    d->captures.remove(child.d->captures);
-    if (child.parentWindow() != this)
-        return;
-    d->family.remove(child);
-    child.d->family.setParent(nullptr);
-    if (child.windowHandle())
-        child.windowHandle()->setTransientParent(nullptr);
-}
-
-Window *Window::parentWindow() const
-{
-    requireGuiThread();
-    return d->family.parent();
-}
-
-std::vector<Window *> Window::childWindows() const
-{
-    requireGuiThread();
-    return d->family.children();
-}
-
 // Showing and closing
-
-void Window::showFamily()
-{
-    for (Window *const child : childWindows()) {
-        if (!child->d->family.isOrderedIn() || child->isVisible())
-            continue;
-        // Some desktops have minimised the child together with this window before it was hidden.
-        child->setWindowState(child->windowState() & ~Qt::WindowMinimized);
-        child->show();
-    }
-}
-
-void Window::hideFamily()
-{
-    for (Window *const child : childWindows()) {
-        const bool comesBack = child->d->family.isOrderedIn();
-        child->hide();
-        child->d->family.setOrderedIn(comesBack);
-    }
-}
 
 void Window::orderFront()
 {
     requireGuiThread();
     show();
     raise();
-    raiseChildrenOf(*this);
+    raiseFamily();
 }
 
 void Window::orderOut()
@@ -357,8 +216,8 @@ void Window::orderIn()
         return;
     d->family.setOrderedIn(true);
     d->isClosed = false;
-    if (d->contentViewController)
-        d->contentViewController->viewWillAppear();
+    if (ViewController *const controller = d->content.contentViewController())
+        controller->viewWillAppear();
     tellDelegate(&WindowDelegate::windowWillAppear);
 }
 
@@ -369,10 +228,10 @@ void Window::setVisible(bool visible)
         orderIn();
     else
         d->family.setOrderedIn(false);
-    if (visible && !d->family.canShow())
+    if (visible && !canShow())
         return;
     if (visible && !isVisible()) {
-        d->backdrop.prepare(*this);
+        prepareBackdrop();
         d->tracker->prepareToShow();
         // Only the native windows are joined. A widget's child would be destroyed with its parent,
         // but a window may outlive the one that it stands above.

@@ -1,19 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/WindowBackdrop.h"
 
-#include <penwick/platform/Window.h>
-
-#include "platform/foundation/GuiThread.h"
-#include "platform/native/NativeDesktop.h"
-#include "platform/view/View.h"
-#include "platform/window/ScreenCoordinates.h"
-#include "platform/window/WindowFlags.h"
-
 #include <QBitmap>
 #include <QGuiApplication>
 #include <QLoggingCategory>
 #include <QPainter>
 #include <QScreen>
+#include <QWidget>
 #include <QWindow>
 
 namespace penwick::platform {
@@ -45,31 +38,27 @@ QPixmap pictureOf(const QRect &area)
 
 } // namespace
 
-bool Window::showsWhatIsBelow() const
-{
-    requireGuiThread();
-    return attributes().isOpaque || NativeDesktop::instance().isCompositing();
-}
-
-void WindowBackdrop::prepare(Window &window)
+void WindowBackdrop::clear(QWidget &window)
 {
     m_picture = QPixmap();
     window.clearMask();
-    if (window.showsWhatIsBelow())
-        return;
-    const QRect area = toDesktop(window.frame());
-    if (canBecomeKey(window.attributes())) {
-        m_picture = pictureOf(area);
-        qCInfo(desktopLog,
-            "no compositing manager: a transparent layer shows a picture of what "
-            "was below it when it opened");
-    } else if (window.contentView() && window.contentView()->layer()) {
-        window.setMask(rounded(area.size(), window.contentView()->layer()->cornerRadius));
-    }
+}
+
+void WindowBackdrop::takePicture(const QRect &area)
+{
+    m_picture = pictureOf(area);
+    qCInfo(desktopLog,
+        "no compositing manager: a transparent layer shows a picture of what "
+        "was below it when it opened");
+}
+
+void WindowBackdrop::cutCorners(QWidget &window, QSize size, double radius)
+{
+    window.setMask(rounded(size, radius));
 }
 
 // The toolkit keeps the shape in the pixels of the scale that it was set with.
-void WindowBackdrop::rescale(Window &window)
+void WindowBackdrop::rescale(QWidget &window)
 {
     if (!window.mask().isEmpty())
         window.windowHandle()->setMask(window.mask());

@@ -5,21 +5,24 @@
 #include <QPixmap>
 
 class QPainter;
+class QWidget;
 
 namespace penwick::platform {
-
-class Window;
 
 /// Without a compositing manager, transparent pixels are black. A layer over the screen then shows
 /// a picture of what was there when it opened, and a small window has its corners cut off.
 class WindowBackdrop
 {
 public:
-    /// Prepares the showing of `window`, which has its frame. Each time that it takes a picture, it
-    /// tells the log why.
-    void prepare(Window &window);
-    /// Cuts off the corners of `window` again, which has come to a screen of another scale.
-    static void rescale(Window &window);
+    /// Leaves neither the picture nor cut corners to `window`.
+    void clear(QWidget &window);
+    /// Takes a picture of `area`, in Qt's desktop coordinates, which a window is about to cover.
+    /// Tells the log each time why.
+    void takePicture(const QRect &area);
+    /// Cuts off the corners of `window`, which is to have `size`.
+    static void cutCorners(QWidget &window, QSize size, double radius);
+    /// Cuts them off again after `window` has come to a screen of another scale.
+    static void rescale(QWidget &window);
     /// Paints the picture, if there is one.
     [[nodiscard]] bool paint(QPainter &painter) const;
 

@@ -4,8 +4,7 @@
 
 #include "platform/foundation/GuiThread.h"
 #include "platform/view/OwnLook.h"
-#include "platform/view/View.h"
-#include "platform/window/WindowPrivate.h"
+#include "platform/window/WindowParts.h"
 
 #include <QCloseEvent>
 #include <QCoreApplication>
@@ -60,7 +59,8 @@ void Window::closeEvent(QCloseEvent *event)
 
 void Window::keyPressEvent(QKeyEvent *event)
 {
-    if (d->windowController && d->windowController->keyDown(*event))
+    WindowResponder *const responder = d->content.responder();
+    if (responder && responder->keyDown(*event))
         event->accept();
     else
         QWidget::keyPressEvent(event);
@@ -72,16 +72,19 @@ void Window::mousePressEvent(QMouseEvent *event)
     if (event->button() != Qt::LeftButton)
         return;
     d->glide->halt(); // the window stops where the user takes hold of it
-    d->drag.begin(*this, event->globalPosition().toPoint());
-    if (d->windowController)
-        d->windowController->mouseDown();
+    if (m_attributes.isMovable && m_attributes.isMovableByWindowBackground)
+        d->drag.begin(frame(), event->globalPosition().toPoint());
+    if (WindowResponder *const responder = d->content.responder())
+        responder->mouseDown();
 }
 
 void Window::mouseMoveEvent(QMouseEvent *event)
 {
     event->accept();
-    if (event->buttons().testFlag(Qt::LeftButton))
-        d->drag.goOn(*this, event->globalPosition().toPoint());
+    if (!event->buttons().testFlag(Qt::LeftButton))
+        return;
+    if (const auto moved = d->drag.moved(frame(), event->globalPosition().toPoint()))
+        setFrame(*moved);
 }
 
 void Window::mouseReleaseEvent(QMouseEvent *event)
@@ -90,19 +93,14 @@ void Window::mouseReleaseEvent(QMouseEvent *event)
     if (event->button() != Qt::LeftButton)
         return;
     d->drag.end();
-    if (d->windowController)
-        d->windowController->mouseUp();
+    if (WindowResponder *const responder = d->content.responder())
+        responder->mouseUp();
 }
 
 void Window::resizeEvent(QResizeEvent *event)
 {
     QWidget::resizeEvent(event);
-    for (View *const view : topViews()) {
-        if (view == m_contentView)
-            setContentView(view);
-        else
-            view->place();
-    }
+    d->content.place();
 }
 
 void Window::paintEvent(QPaintEvent *event)

@@ -1,51 +1,44 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/WindowFamily.h"
 
-#include <penwick/platform/Window.h>
-
 namespace penwick::platform {
+
+WindowFamily::WindowFamily(Window &window)
+    : m_window(window)
+{ }
+
+WindowFamily::~WindowFamily()
+{
+    leaveParent();
+    for (WindowFamily *const child : m_children)
+        child->m_parent = nullptr;
+}
+
+void WindowFamily::leaveParent()
+{
+    if (m_parent)
+        std::erase(m_parent->m_children, this);
+    m_parent = nullptr;
+}
+
+Window *WindowFamily::parent() const
+{
+    return m_parent ? &m_parent->m_window : nullptr;
+}
 
 std::vector<Window *> WindowFamily::children() const
 {
     std::vector<Window *> children;
-    for (const auto &child : m_children) {
-        if (child)
-            children.push_back(child);
-    }
+    for (WindowFamily *const child : m_children)
+        children.push_back(&child->m_window);
     return children;
 }
 
-void WindowFamily::add(Window &child)
+void WindowFamily::add(WindowFamily &child)
 {
-    m_children.emplace_back(&child);
-}
-
-void WindowFamily::remove(const Window &child)
-{
-    std::erase_if(m_children, [&child](const auto &each) { return each == &child; });
-}
-
-bool WindowFamily::canShow() const
-{
-    return !m_parent || (m_parent->isVisible() && !m_parent->isMinimized());
-}
-
-void WindowFamily::takeAlong(QPoint delta) const
-{
-    for (Window *const child : children()) {
-        const Point origin = child->frame().origin();
-        child->setFrameOrigin({ origin.x + delta.x(), origin.y - delta.y() });
-    }
-}
-
-void raiseChildrenOf(const Window &window)
-{
-    for (Window *const child : window.childWindows()) {
-        if (!child->isVisible())
-            continue;
-        child->raise();
-        raiseChildrenOf(*child);
-    }
+    child.leaveParent();
+    child.m_parent = this;
+    m_children.push_back(&child);
 }
 
 } // namespace penwick::platform

@@ -2,9 +2,6 @@
 // Which windows stand above which, and are on the screen only together.
 #pragma once
 
-#include <QPoint>
-#include <QPointer>
-
 #include <vector>
 
 namespace penwick::platform {
@@ -15,31 +12,31 @@ class Window;
 class WindowFamily
 {
 public:
-    [[nodiscard]] Window *parent() const { return m_parent; }
+    /// Takes no more than the address of `window`.
+    explicit WindowFamily(Window &window);
+    ~WindowFamily();
+    WindowFamily(const WindowFamily &) = delete;
+    WindowFamily &operator=(const WindowFamily &) = delete;
+
+    /// Null without one.
+    [[nodiscard]] Window *parent() const;
     /// In the order of adding.
     [[nodiscard]] std::vector<Window *> children() const;
-    void add(Window &child);
-    void remove(const Window &child);
-    void setParent(Window *parent) { m_parent = parent; }
+    /// Makes `child`, whose parent may be another one, the last of the children.
+    void add(WindowFamily &child);
+    /// Without a parent nothing happens.
+    void leaveParent();
 
     /// Whether the window was asked to the screen: it is there, or will be as soon as its parent
     /// is.
     [[nodiscard]] bool isOrderedIn() const { return m_isOrderedIn; }
     void setOrderedIn(bool isOrderedIn) { m_isOrderedIn = isOrderedIn; }
-    /// Whether the parent, if there is one, is on the screen.
-    [[nodiscard]] bool canShow() const;
-
-    /// Moves the children by `delta` of Qt's desktop.
-    void takeAlong(QPoint delta) const;
 
 private:
-    QPointer<Window> m_parent;
-    std::vector<QPointer<Window>> m_children;
+    Window &m_window;
+    WindowFamily *m_parent = nullptr;
+    std::vector<WindowFamily *> m_children;
     bool m_isOrderedIn = false;
 };
-
-/// Brings the windows above `window` to the front again, after `window` itself was brought there. A
-/// window manager keeps this order by itself; where there is none, nobody else does.
-void raiseChildrenOf(const Window &window);
 
 } // namespace penwick::platform

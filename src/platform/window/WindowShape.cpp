@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/WindowShape.h"
 
-#include <penwick/platform/Window.h>
-
 #include "platform/foundation/KeptShape.h"
 #include "platform/native/NativeDesktop.h"
 #include "platform/window/FrameTracker.h"
 #include "platform/window/ScreenCoordinates.h"
 #include "platform/window/WorkArea.h"
+
+#include <QWidget>
 
 #include <cmath>
 #include <utility>
@@ -31,7 +31,7 @@ bool hasShape(const Size &size, const Size &ratio)
 
 } // namespace
 
-WindowShape::WindowShape(Window &window, FrameTracker &tracker)
+WindowShape::WindowShape(QWidget &window, FrameTracker &tracker)
     : QObject(&tracker)
     , m_window(window)
     , m_tracker(tracker)
@@ -41,16 +41,10 @@ WindowShape::WindowShape(Window &window, FrameTracker &tracker)
     connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
     connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
     connect(&tracker, &FrameTracker::resizedByDesktop, this, [this](const Rect &asked) {
-        if (isKept() && hasShape(asked.size(), *m_window.attributes().aspectRatio))
+        if (m_ratio && hasShape(asked.size(), *m_ratio))
             await(false);
     });
     connect(&tracker, &FrameTracker::settled, this, &WindowShape::rememberFrame);
-}
-
-bool WindowShape::isKept() const
-{
-    const WindowAttributes &attributes = m_window.attributes();
-    return attributes.aspectRatio && (attributes.styleMask & StyleMask::resizable);
 }
 
 // The hint is written before the desktop is asked for a frame, because some desktops measure what
@@ -60,9 +54,8 @@ void WindowShape::update()
     if (!m_window.windowHandle())
         return;
     const Rect frame = m_tracker.frame();
-    const bool hasRatio = isKept()
-        && std::abs(heightFor(frame.width, *m_window.attributes().aspectRatio) - frame.height)
-            < 1.0;
+    const bool hasRatio
+        = m_ratio && std::abs(heightFor(frame.width, *m_ratio) - frame.height) < 1.0;
     // The hint is about the content, because that is what a desktop constrains. It has the very
     // size of this frame's content, so that the frame itself can still be asked for.
     const QSize content = toDesktop(frame).marginsRemoved(m_tracker.margins()).size();
@@ -112,14 +105,14 @@ void WindowShape::rest()
 
 void WindowShape::correct()
 {
-    if (!isKept() || isArranged())
+    if (!m_ratio || isArranged())
         return;
-    const Rect pulled = m_window.frame();
-    const Size ratio = *m_window.attributes().aspectRatio;
+    const Rect pulled = m_tracker.frame();
+    const Size ratio = *m_ratio;
     const bool isChanged = m_before != Rect() && m_before.size() != pulled.size();
     if (hasShape(pulled.size(), ratio) || (m_isPulled && !isChanged))
         return;
-    m_window.setFrame(shaped(pulled, ratio));
+    Q_EMIT corrected(shaped(pulled, ratio));
     m_isAnswering = true;
 }
 

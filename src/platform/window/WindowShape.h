@@ -11,18 +11,23 @@
 namespace penwick::platform {
 
 class FrameTracker;
-class Window;
 
-/// Asks the desktop to keep the aspect ratio of a window's attributes, while the window's frame has
-/// it. Where the desktop does not, and the user has given the frame another shape, the frame is
-/// corrected. A window that the user cannot resize is left alone.
+/// Asks the desktop to keep a window's aspect ratio, while the window's frame has it. Where the
+/// desktop does not, and the user has given the frame another shape, the frame is to be corrected.
 class WindowShape final : public QObject
 {
     Q_OBJECT
 
 public:
     /// Borrows both; `tracker` follows `window` and owns this object.
-    WindowShape(Window &window, FrameTracker &tracker);
+    WindowShape(QWidget &window, FrameTracker &tracker);
+
+    /// The width and height of the shape to be kept; nothing leaves the window alone.
+    void setRatio(const std::optional<Size> &ratio) { m_ratio = ratio; }
+
+Q_SIGNALS:
+    /// The window is to have `frame` instead of the one that its user has given it.
+    void corrected(const penwick::platform::Rect &frame);
 
 private:
     void update();
@@ -32,11 +37,11 @@ private:
     void correct();
     void rememberFrame();
     [[nodiscard]] Rect shaped(const Rect &changed, const Size &ratio) const;
-    [[nodiscard]] bool isKept() const;
     [[nodiscard]] bool isArranged() const;
 
-    Window &m_window;
+    QWidget &m_window;
     FrameTracker &m_tracker;
+    std::optional<Size> m_ratio;
     Rect m_before; // the frame that the user began to pull; empty before the first one
     bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
     bool m_isByHand = false; // the pointer was held during the pull

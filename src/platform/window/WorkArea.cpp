@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/window/WorkArea.h"
 
-#include <penwick/platform/Window.h>
+#include <penwick/platform/ScreenFrame.h>
 
 #include "platform/foundation/FatalError.h"
 #include "platform/window/ScreenCoordinates.h"

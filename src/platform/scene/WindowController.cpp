@@ -4,6 +4,7 @@
 #include <penwick/platform/Window.h>
 
 #include "platform/foundation/GuiThread.h"
+#include "platform/window/WindowContent.h"
 #include "platform/window/WindowFlags.h"
 
 #include <utility>
@@ -25,7 +26,7 @@ WindowController::WindowController(std::unique_ptr<Window> window)
 {
     m_window = std::move(window);
     if (m_window)
-        m_window->setWindowController(this);
+        contentOf(*m_window).setResponder(this);
 }
 
 Window *WindowController::window() const
@@ -38,7 +39,7 @@ void WindowController::setWindow(std::unique_ptr<Window> window)
 {
     requireGuiThread();
     m_window = std::move(window);
-    m_window->setWindowController(this);
+    contentOf(*m_window).setResponder(this);
     windowDidLoad();
 }
 

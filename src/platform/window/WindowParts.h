@@ -2,10 +2,6 @@
 // What a window is made of; for the files of Window alone.
 #pragma once
 
-#include <penwick/platform/Window.h>
-#include <penwick/platform/WindowController.h>
-
-#include "platform/view/ViewController.h"
 #include "platform/window/BackgroundDrag.h"
 #include "platform/window/CaptureExclusion.h"
 #include "platform/window/FrameTracker.h"
@@ -17,31 +13,31 @@
 
 namespace penwick::platform {
 
-class Window::Private
+/// Each part knows the widget at most, and no part knows the window.
+class WindowParts
 {
 public:
-    explicit Private(Window &window)
-        : tracker(new FrameTracker(window))
+    /// `widget` is `window`, of which only the address is taken.
+    WindowParts(QWidget &widget, Window &window)
+        : tracker(new FrameTracker(widget))
         , glide(new Glide(*tracker))
-        , shape(new WindowShape(window, *tracker))
-        , captures(window)
-        , content(window)
+        , shape(new WindowShape(widget, *tracker))
+        , captures(widget)
+        , family(window)
+        , content(widget, *tracker)
     { }
 
     FrameTracker *const tracker; // a child of the window
     Glide *const glide; // a child of the tracker
     WindowShape *const shape; // a child of the tracker
     CaptureExclusion captures;
-    WindowContent content;
     WindowFamily family;
-    std::unique_ptr<ViewController> contentViewController;
-    QPointer<WindowController> windowController;
     WindowBackdrop backdrop;
     BackgroundDrag drag;
     bool isClosed = false;
     bool isMain = false;
     bool isMinimised = false;
-    bool isContentBorrowed = false;
+    WindowContent content; // the first to go
 };
 
 } // namespace penwick::platform
