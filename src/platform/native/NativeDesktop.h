@@ -57,8 +57,8 @@ public:
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that
     /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);
-    /// Applies what the desktop can do of `attributes` once `window` is on the screen, such as showing
-    /// it on every virtual desktop or keeping it out of captures.
+    /// Applies what the desktop can do of `attributes` once `window` is on the screen, such as
+    /// showing it on every virtual desktop or keeping it out of captures.
     virtual void applyAttributes(QWindow &window, const WindowAttributes &attributes);
 };
 
