@@ -2,7 +2,9 @@
 // What an editor leaves behind when it is hidden: nothing.
 #include "textbox/TextBoxFixture.h"
 
+#include <QDragEnterEvent>
 #include <QMenu>
+#include <QMimeData>
 
 namespace penwick::test {
 namespace {
@@ -27,12 +29,59 @@ private:
 class EditorHidingTest : public TextBoxFixture
 {
 protected:
+    EditorHidingTest() { m_dragged.setText(QStringLiteral("from elsewhere")); }
+
+    void dragOverIt()
+    {
+        QDragEnterEvent enter({ 20, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
+        QCoreApplication::sendEvent(m_box->viewport(), &enter);
+        QDragMoveEvent move({ 21, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
+        QCoreApplication::sendEvent(m_box->viewport(), &move);
+    }
+
+    QMimeData m_dragged;
     const std::shared_ptr<TnTextBox> m_box = newBox();
     LeaveCounter m_counter { *m_box->viewport() };
 };
 
 TEST_F(EditorHidingTest, withoutADragNoneEnds)
 {
+    m_box->hide();
+
+    EXPECT_EQ(m_counter.leaves(), 0);
+}
+
+TEST_F(EditorHidingTest, dragOverItEndsOnce)
+{
+    dragOverIt();
+
+    m_box->hide();
+    EXPECT_EQ(m_counter.leaves(), 1);
+
+    m_box->show();
+    m_box->hide();
+    EXPECT_EQ(m_counter.leaves(), 1);
+}
+
+TEST_F(EditorHidingTest, dragThatLeftBeforeHasEnded)
+{
+    dragOverIt();
+    QDragLeaveEvent leave;
+    QCoreApplication::sendEvent(m_box->viewport(), &leave);
+    ASSERT_EQ(m_counter.leaves(), 1);
+
+    m_box->hide();
+
+    EXPECT_EQ(m_counter.leaves(), 1);
+}
+
+TEST_F(EditorHidingTest, dragThatWasDroppedBeforeHasEnded)
+{
+    dragOverIt();
+    QDropEvent drop({ 21, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
+    QCoreApplication::sendEvent(m_box->viewport(), &drop);
+    ASSERT_EQ(m_box->toPlainText(), QStringLiteral("from elsewhere"));
+
     m_box->hide();
 
     EXPECT_EQ(m_counter.leaves(), 0);

@@ -6,6 +6,8 @@
 #include "textbox/TextBoxFixture.h"
 
 #include <QInputMethodEvent>
+#include <QTextBlock>
+#include <QTextLayout>
 
 namespace penwick::test {
 namespace {
@@ -17,6 +19,24 @@ protected:
     {
         QInputMethodEvent event(text, {});
         QCoreApplication::sendEvent(&box, &event);
+    }
+
+    /// What is composed underlined, as input methods do.
+    static void composeUnderlined(TnTextBox &box, const QString &text)
+    {
+        QTextCharFormat underlined;
+        underlined.setFontUnderline(true);
+        const int length = static_cast<int>(text.size());
+        QInputMethodEvent event(text, { { QInputMethodEvent::TextFormat, 0, length, underlined } });
+        QCoreApplication::sendEvent(&box, &event);
+    }
+
+    /// Puts the insertion point elsewhere without ending what is composed.
+    static void moveTo(TnTextBox &box, int position)
+    {
+        QTextCursor caret = box.textCursor();
+        caret.setPosition(position);
+        box.setTextCursor(caret);
     }
 
     static void commit(TnTextBox &box, const QString &text)
@@ -125,6 +145,75 @@ TEST_F(TextCompositionTest, inALineThatTheCaretHasLeftIsPartOfTheTextOnceTheBoxI
     EXPECT_EQ(text.remove(m_half), QStringLiteral("two\nlines"));
     EXPECT_EQ(box->toPlainText().size(), 13);
     EXPECT_EQ(compositionIn(*box), QString());
+}
+
+TEST_F(TextCompositionTest, inALineThatTheCaretHasLeftStandsWhereItWasComposed)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one\ntwo"));
+    moveTo(*box, 2);
+    composeUnderlined(*box, m_half);
+    moveTo(*box, 5);
+    ASSERT_EQ(compositionIn(*box), m_half);
+
+    leave();
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("onkanje\ntwo"));
+    EXPECT_EQ(compositionIn(*box), QString());
+    const QTextLayout &line = *box->document()->firstBlock().layout();
+    EXPECT_EQ(line.preeditAreaPosition(), -1);
+    EXPECT_TRUE(line.formats().isEmpty()) << "text is not underlined";
+}
+
+TEST_F(TextCompositionTest, inALineThatBecameShorterStandsAtItsEnd)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one\ntwo"));
+    moveTo(*box, 3);
+    compose(*box, m_half);
+    moveTo(*box, 5);
+    QTextCursor end(box->document());
+    end.setPosition(1);
+    end.setPosition(3, QTextCursor::KeepAnchor);
+    end.removeSelectedText();
+    ASSERT_EQ(box->toPlainText(), QStringLiteral("o\ntwo"));
+
+    leave();
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("okanj\ntwo"));
+}
+
+TEST_F(TextCompositionTest, replacesNothingThatIsSelectedElsewhere)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one\ntwo"));
+    compose(*box, m_half);
+    QTextCursor word = box->textCursor();
+    word.setPosition(0);
+    word.setPosition(3, QTextCursor::KeepAnchor);
+    box->setTextCursor(word);
+
+    leave();
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("one\ntwokanj"));
+}
+
+TEST_F(TextCompositionTest, droppedInALineThatTheCaretHasLeftLeavesNoLookThere)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one\ntwo"));
+    moveTo(*box, 2);
+    composeUnderlined(*box, QString(16, QLatin1Char('m')));
+    ASSERT_GT(box->frame().width, 200.0);
+    moveTo(*box, 5);
+
+    compose(*box, QStringLiteral("ka"));
+
+    EXPECT_EQ(compositionIn(*box), QStringLiteral("ka"));
+    const QTextLayout &line = *box->document()->firstBlock().layout();
+    EXPECT_EQ(line.preeditAreaPosition(), -1);
+    EXPECT_TRUE(line.formats().isEmpty());
+    EXPECT_EQ(box->frame().width, 200.0);
 }
 
 TEST_F(TextCompositionTest, goesOnInTheLineToWhichTheCaretHasGone)

@@ -8,6 +8,7 @@
 #include <QTextBlock>
 #include <QTextDocument>
 #include <QTextOption>
+#include <QWheelEvent>
 
 namespace penwick::test {
 namespace {
@@ -105,6 +106,51 @@ TEST_F(TextEditorTest, readOnlyOneThatGetsTheFocusShowsNoCaret)
     settle();
 
     EXPECT_FALSE(isCaretSeen(*box));
+}
+
+TEST_F(TextEditorTest, keyThatMovesNothingShowsTheCaretAgain)
+{
+    QApplication::setCursorFlashTime(200);
+    const auto box = newBox();
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !isCaretSeen(*box); })) << "it blinks";
+
+    QApplication::setCursorFlashTime(0); // steady from now on, so that the test has time to look
+    QTest::keyClick(box.get(), Qt::Key_Home);
+    settle();
+
+    EXPECT_TRUE(isCaretSeen(*box));
+}
+
+TEST_F(TextEditorTest, placedOneTakesNothingFromTheClipboard)
+{
+    const auto box = placedBox();
+
+    paste(*box, QStringLiteral("more"));
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TextEditorTest, wheelOverTextThatIsAllSeenIsNotItsOwn)
+{
+    const auto box = placedBox();
+    const auto isTurnTaken = [&box](Qt::KeyboardModifiers modifiers) {
+        QWheelEvent turn(QPointF(20, 15), box->mapToGlobal(QPointF(20, 15)), {}, { 0, -120 },
+            Qt::NoButton, modifiers, Qt::NoScrollPhase, false);
+        QCoreApplication::sendEvent(box->viewport(), &turn);
+        return turn.isAccepted();
+    };
+    EXPECT_FALSE(isTurnTaken({}));
+
+    doubleClickOn(*box, { 50, 15 });
+    paste(*box, QStringLiteral("\n").repeated(30));
+    leave();
+    ASSERT_GT(box->verticalScrollBar()->maximum(), 0);
+    EXPECT_TRUE(isTurnTaken({}));
+    EXPECT_GT(box->verticalScrollBar()->value(), 0);
+
+    box->verticalScrollBar()->setValue(0);
+    EXPECT_FALSE(isTurnTaken(Qt::ControlModifier));
+    EXPECT_EQ(box->verticalScrollBar()->value(), 0);
 }
 
 TEST_F(TextEditorTest, paintsWhatItIsScrolledTo)
@@ -220,6 +266,20 @@ TEST_F(TextEditorTest, nextEditTakesNothingOfTheLastOneBack)
     QTest::keyClick(box.get(), Qt::Key_Z, Qt::ControlModifier);
 
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TextEditorTest, pressElsewhereLeavesTheSelectionWhileItIsWritten)
+{
+    const auto box = placedBox();
+    box->selectAll();
+    doubleClickOn(*box, { 50, 15 });
+    box->selectAll();
+    QWidget elsewhere;
+
+    QTest::mousePress(&elsewhere, Qt::LeftButton);
+
+    EXPECT_TRUE(box->isEditable());
+    EXPECT_TRUE(box->textCursor().hasSelection());
 }
 
 TEST_F(TextEditorTest, pressElsewhereIsHeardThereThoughItClearsTheSelection)

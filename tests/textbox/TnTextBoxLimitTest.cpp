@@ -180,6 +180,30 @@ TEST_F(TnTextBoxLimitTest, correctionInAFullBoxTakesThePlaceOfTheWord)
     EXPECT_EQ(said(), QString());
 }
 
+TEST_F(TnTextBoxLimitTest, correctionInAFullBoxMayBeOfOneLetterOrOfAllOfThem)
+{
+    const auto box = almostFull(0);
+
+    correct(*box, 1, QStringLiteral("n"));
+    EXPECT_EQ(box->toPlainText(), QString(mostCharacters - 1, QLatin1Char('m')) + QLatin1Char('n'));
+
+    const QString all(mostCharacters, QLatin1Char('o'));
+    correct(*box, mostCharacters, all);
+    EXPECT_EQ(box->toPlainText(), all);
+    EXPECT_EQ(said(), QString());
+}
+
+TEST_F(TnTextBoxLimitTest, commitInAFullBoxTakesThePlaceOfWhatIsSelected)
+{
+    const auto box = almostFull(0);
+    box->selectAll();
+
+    compose(*box, {}, QStringLiteral("new"));
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("new"));
+    EXPECT_EQ(said(), QString());
+}
+
 TEST_F(TnTextBoxLimitTest, correctionThatDoesNotFitLeavesTheWord)
 {
     const auto box = almostFull(5);
