@@ -3,7 +3,8 @@
 
 #include <penwick/platform/NotificationCenter.h>
 
-#include <QCoreApplication>
+#include <QAbstractButton>
+#include <QApplication>
 #include <QEvent>
 #include <QScreen>
 #include <QWindow>
@@ -14,6 +15,27 @@
 namespace penwick::host {
 
 using platform::NotificationCenter;
+
+namespace {
+
+/// The button of the tool bar, or of its popovers, that stands for a choice which stays chosen;
+/// null if the choice does not stay, or has no button.
+QAbstractButton *buttonFor(const StartCall &startCall)
+{
+    const QStringList tools { QStringLiteral("text"), QStringLiteral("brush"),
+        QStringLiteral("eraser") };
+    if (startCall.operation == StartCall::Operation::ToolSelection
+        && !tools.contains(startCall.argument))
+        return nullptr;
+    for (QWidget *const widget : QApplication::allWidgets()) {
+        auto *const button = qobject_cast<QAbstractButton *>(widget);
+        if (button && button->property("identifier").toString() == startCall.argument)
+            return button;
+    }
+    return nullptr;
+}
+
+} // namespace
 
 Session::Session()
     : m_penwick(std::make_unique<Penwick>())
@@ -47,8 +69,19 @@ bool Session::open(const Options &options, QScreen &screen, const std::optional<
             announceOnceSeen();
     }
     for (const StartCall &startCall : options.startCalls)
-        call(startCall);
+        choose(startCall);
     return true;
+}
+
+// By a press on the button where there is one, so that the tool bar shows what is chosen. A second
+// press on the button of a tool would open its popover.
+void Session::choose(const StartCall &startCall)
+{
+    QAbstractButton *const button = buttonFor(startCall);
+    if (button && !button->property("isSelected").toBool())
+        button->click();
+    else
+        call(startCall);
 }
 
 void Session::call(const StartCall &call)

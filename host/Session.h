@@ -47,6 +47,7 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    void choose(const StartCall &startCall);
     void announceOnceSeen();
     void writePicture();
     void end();
