@@ -8,6 +8,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <functional>
 
 namespace penwick::test {
@@ -18,11 +19,11 @@ constexpr QSize labelSize { 300, 40 };
 constexpr QColor below { 128, 128, 128 }; // of neither colour of the letters
 
 /// The label alone, over what lies below the banner.
-QImage pictureOf(BannerLabel &label)
+QImage pictureOf(BannerLabel &label, QSize size = labelSize)
 {
-    QImage picture(labelSize, QImage::Format_RGB32);
+    QImage picture(size, QImage::Format_RGB32);
     picture.fill(below);
-    label.resize(labelSize);
+    label.resize(size);
     label.render(&picture, QPoint(), QRegion(), QWidget::DrawChildren);
     return picture;
 }
@@ -85,6 +86,32 @@ TEST(BannerLabel, lettersHaveADarkOutlineOfTwoPoints)
     EXPECT_NEAR(dark.right() - light.right(), 2, 1);
     EXPECT_NEAR(light.top() - dark.top(), 2, 1);
     EXPECT_NEAR(dark.bottom() - light.bottom(), 2, 1);
+}
+
+TEST(BannerLabel, needsTheWidthOfItsLettersAndOfTheirOutline)
+{
+    BannerLabel label;
+    EXPECT_EQ(label.widthOfText(), 4.0);
+
+    label.setText(QStringLiteral("HHHHHH"));
+
+    EXPECT_EQ(label.widthOfText(),
+        QFontMetricsF(label.font()).horizontalAdvance(QStringLiteral("HHHHHH")) + 4.0);
+}
+
+TEST(BannerLabel, textThatDoesNotFitWithItsOutlineIsCutShort)
+{
+    BannerLabel label;
+    label.setText(QStringLiteral("HHHHHH"));
+    const QSize enough(static_cast<int>(std::ceil(label.widthOfText())), 40);
+    const QSize tooNarrow = enough - QSize(2, 0);
+    BannerLabel cut;
+    cut.setText(QFontMetricsF(label.font())
+                    .elidedText(label.text(), Qt::ElideRight, tooNarrow.width() - 4));
+    ASSERT_TRUE(cut.text().endsWith(QChar(0x2026)));
+
+    EXPECT_EQ(pictureOf(label, tooNarrow), pictureOf(cut, tooNarrow));
+    EXPECT_NE(pictureOf(label, enough), pictureOf(cut, enough));
 }
 
 TEST(BannerLabel, newTextIsShownAtOnceAndHeardByAssistivePrograms)

@@ -121,6 +121,20 @@ TEST_F(TextEditorTest, keyThatMovesNothingShowsTheCaretAgain)
     EXPECT_TRUE(isCaretSeen(*box));
 }
 
+TEST_F(TextEditorTest, caretThatIsMovedIsShownAgain)
+{
+    QApplication::setCursorFlashTime(200);
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("mm"));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return !isCaretSeen(*box); })) << "it blinks";
+
+    QApplication::setCursorFlashTime(0);
+    box->moveCursor(QTextCursor::Start);
+    settle();
+
+    EXPECT_TRUE(isCaretSeen(*box));
+}
+
 TEST_F(TextEditorTest, placedOneTakesNothingFromTheClipboard)
 {
     const auto box = placedBox();
@@ -266,6 +280,17 @@ TEST_F(TextEditorTest, nextEditTakesNothingOfTheLastOneBack)
     QTest::keyClick(box.get(), Qt::Key_Z, Qt::ControlModifier);
 
     EXPECT_EQ(box->toPlainText(), QStringLiteral("Hello"));
+}
+
+TEST_F(TextEditorTest, pointerThatOnlyMovesElsewhereLeavesTheSelection)
+{
+    const auto box = placedBox();
+    box->selectAll();
+
+    moveOver(*canvas, { 250, 20 });
+    releaseOn(*canvas, { 250, 20 });
+
+    EXPECT_TRUE(box->textCursor().hasSelection());
 }
 
 TEST_F(TextEditorTest, pressElsewhereLeavesTheSelectionWhileItIsWritten)
