@@ -117,6 +117,34 @@ TEST_F(TextCompositionTest, thatIsCutShortKeepsItsLook)
     EXPECT_EQ(placesOf(3), std::pair(9, 2)); // counts in the text
 }
 
+TEST_F(TextCompositionTest, isPartOfTheTextOnceThePointerPressesInTheBox)
+{
+    const auto box = newBox();
+    compose(*box, m_half);
+
+    pressOn(*box, { 30, 15 }, QEvent::MouseButtonPress, Qt::RightButton); // for the menu
+    releaseOn(*box, { 30, 15 }, Qt::RightButton);
+    EXPECT_EQ(compositionIn(*box), m_half);
+
+    clickOn(*box, { 30, 15 });
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), m_half);
+    EXPECT_TRUE(box->isEditable());
+}
+
+TEST_F(TextCompositionTest, isPartOfTheTextOnceThePointerDragsOverIt)
+{
+    const auto box = newBox();
+    pressOn(*box, { 30, 15 });
+    compose(*box, m_half);
+
+    dragOn(*box, { 60, 15 });
+    releaseOn(*box, { 60, 15 });
+
+    EXPECT_EQ(compositionIn(*box), QString());
+    EXPECT_EQ(box->toPlainText(), m_half);
+}
+
 TEST_F(TextCompositionTest, keepsABoxThatHasNothingElseFromBeingDeleted)
 {
     const auto box = newBox();

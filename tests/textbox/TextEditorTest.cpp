@@ -2,7 +2,10 @@
 // The editor under a text box: what of the toolkit's editor it is, and what it paints itself.
 #include "textbox/TextBoxFixture.h"
 
+#include "textbox/TextKeys.h"
+
 #include <QKeyEvent>
+#include <QMenu>
 #include <QPainter>
 #include <QScrollBar>
 #include <QTextBlock>
@@ -165,6 +168,42 @@ TEST_F(TextEditorTest, wheelOverTextThatIsAllSeenIsNotItsOwn)
     box->verticalScrollBar()->setValue(0);
     EXPECT_FALSE(isTurnTaken(Qt::ControlModifier));
     EXPECT_EQ(box->verticalScrollBar()->value(), 0);
+}
+
+TEST_F(TextEditorTest, caretIsSeenInTextThatIsScrolled)
+{
+    const auto box = newBox();
+
+    paste(*box, QStringLiteral("\n").repeated(30));
+
+    ASSERT_GT(box->verticalScrollBar()->value(), 0);
+    EXPECT_TRUE(isCaretSeen(*box));
+}
+
+TEST_F(TextEditorTest, menuOfItClosesAsTheEditEnds)
+{
+    const auto box = placedBox();
+    doubleClickOn(*box, { 50, 15 });
+    QMenu menu(box.get());
+    menu.addAction(QStringLiteral("Paste"));
+    menu.popup(QPoint(10, 10));
+    ASSERT_TRUE(menu.isVisible());
+
+    box->setEditable(false);
+
+    EXPECT_FALSE(menu.isVisible());
+}
+
+TEST_F(TextEditorTest, letterWithControlIsACommandWithShiftToo)
+{
+    const auto typed = [](Qt::KeyboardModifiers modifiers) {
+        return typedBy(QKeyEvent(QEvent::KeyPress, Qt::Key_X, modifiers, QStringLiteral("X")));
+    };
+
+    EXPECT_EQ(typed(Qt::ShiftModifier), QStringLiteral("X"));
+    EXPECT_EQ(typed(Qt::ControlModifier | Qt::AltModifier), QStringLiteral("X")) << "AltGr";
+    EXPECT_EQ(typed(Qt::ControlModifier), QString());
+    EXPECT_EQ(typed(Qt::ControlModifier | Qt::ShiftModifier), QString());
 }
 
 TEST_F(TextEditorTest, paintsWhatItIsScrolledTo)

@@ -156,6 +156,28 @@ TEST(TextRoom, onlyTheSecondHalfOfAPairOfCharactersEndsNoLineOfItsOwn)
     EXPECT_EQ(fittingPart(QStringLiteral("\r\rb"), { 9, 1, 64 }), QStringLiteral("\r"));
 }
 
+TEST(TextRoom, halfAPairIsACharacterOfItsOwn)
+{
+    const QChar high(0xD83D);
+    const QChar low(0xDE00);
+
+    EXPECT_EQ(fittingPart(QString(u'a') + low, { 1, 0, 64 }), QString(u'a'));
+    EXPECT_EQ(fittingPart(QString(high) + u'a', { 1, 0, 64 }), QString(high));
+    EXPECT_EQ(fittingPart(QString(high) + low, { 1, 0, 64 }), QString());
+    EXPECT_EQ(roomBehind(QString(high) + accent).marks, 63);
+    EXPECT_EQ(roomBehind(QString(u'a') + accent).marks, 63);
+}
+
+TEST(TextRoom, linesOnBothSidesAreCounted)
+{
+    QTextDocument document;
+    document.setPlainText(QStringLiteral("a\nb\nc\nd"));
+    QTextCursor cursor(&document);
+    cursor.setPosition(3);
+
+    EXPECT_EQ(roomAt(cursor).lineEnds, 246);
+}
+
 TEST(TextRoom, newRoomIsThatOfAnEmptyText)
 {
     EXPECT_EQ(TextRoom(), (TextRoom { 2500, 249, 64 }));

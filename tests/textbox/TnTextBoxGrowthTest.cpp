@@ -280,6 +280,17 @@ TEST_F(TnTextBoxGrowthTest, linesThatAreBegunByHandAreNotTakenForWrappedOnes)
     EXPECT_EQ(box->frame().width, 200.0);
 }
 
+TEST_F(TnTextBoxGrowthTest, emptyLineBegunByHandIsNotTakenForAWrappedOne)
+{
+    const auto box = newBox();
+
+    QTest::keyClick(box.get(), Qt::Key_Return, Qt::ShiftModifier);
+    QTest::keyClicks(box.get(), QStringLiteral("a"));
+
+    EXPECT_EQ(box->frame().width, 200.0);
+    EXPECT_EQ(lineCount(*box), 2);
+}
+
 TEST_F(TnTextBoxGrowthTest, keyInATextThatFillsTheCanvasLaysItOutOnce)
 {
     const auto box = newBox();

@@ -216,6 +216,40 @@ TEST_F(TnTextBoxLimitTest, correctionThatDoesNotFitLeavesTheWord)
     expectSaid(*box, QStringLiteral("6 characters did not fit into this text box."));
 }
 
+TEST_F(TnTextBoxLimitTest, correctionOfOneLetterThatDoesNotFitLeavesIt)
+{
+    const auto box = almostFull(0);
+
+    correct(*box, 1, QStringLiteral("no"));
+
+    EXPECT_EQ(box->toPlainText(), QString(mostCharacters, QLatin1Char('m')));
+    expectSaid(*box, QStringLiteral("2 characters did not fit into this text box."));
+}
+
+TEST_F(TnTextBoxLimitTest, commitThatFitsInPartGoesInInPart)
+{
+    const auto box = almostFull(2);
+
+    compose(*box, {}, QStringLiteral("kan"));
+
+    EXPECT_EQ(box->toPlainText().right(3), QStringLiteral("mka"));
+    expectSaid(*box, m_one);
+}
+
+TEST_F(TnTextBoxLimitTest, compositionTakesItsRoomBeforeItIsText)
+{
+    const auto box = almostFull(3);
+    compose(*box, QStringLiteral("kanj"));
+    expectSaid(*box, m_one);
+    QToolTip::hideText();
+    compose(*box, QStringLiteral("kan"));
+
+    QTest::keyClicks(box.get(), QStringLiteral("b"));
+
+    EXPECT_EQ(lengthOf(*box), mostCharacters - 3);
+    expectSaid(*box, m_one);
+}
+
 TEST_F(TnTextBoxLimitTest, compositionKeepsItsPlace)
 {
     const auto box = almostFull(4);
