@@ -280,6 +280,29 @@ TEST_F(TnTextBoxGrowthTest, linesThatAreBegunByHandAreNotTakenForWrappedOnes)
     EXPECT_EQ(box->frame().width, 200.0);
 }
 
+TEST_F(TnTextBoxGrowthTest, boxOnNoCanvasStaysAsItIs)
+{
+    const auto box = TnTextBox::create({ 1, 2, 200, 30 }, 20.0, Qt::black);
+
+    box->insertPlainText(QStringLiteral("longer than the box is wide, if it were on a canvas"));
+
+    EXPECT_EQ(box->frame(), (Rect { 1, 2, 200, 30 }));
+}
+
+TEST_F(TnTextBoxGrowthTest, boxStaysWhereItIsWhenItsCanvasGrowsInOneWayAndNotInTheOther)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("a"));
+    const Rect before = box->frame();
+    const Rect size = canvas->frame();
+
+    canvas->setFrame({ size.x, size.y, size.width + 50, size.height });
+    EXPECT_EQ(box->frame(), before);
+    canvas->setFrame({ size.x, size.y, size.width + 50, before.maxY() });
+
+    EXPECT_LT(box->frame().maxY(), before.maxY()) << "its delete button is seen";
+}
+
 TEST_F(TnTextBoxGrowthTest, emptyLineBegunByHandIsNotTakenForAWrappedOne)
 {
     const auto box = newBox();
