@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "session/DrawingWindowScene.h"
-#include "platform/window/WindowContent.h"
 
 #include "canvas/DrawViewController.h"
 #include "canvas/DrawingCanvasView.h"
+#include "platform/window/WindowContent.h"
 
 #include <penwick/DrawingWindowController.h>
 

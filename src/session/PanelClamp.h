@@ -13,7 +13,7 @@ namespace penwick {
 
 /// `panel` as it is, if `parent` is high enough for it. Otherwise it is moved into `workArea`; if
 /// that is not high enough either, its lower end, which has the button that ends the session, lies
-/// inside.
+/// inside and its upper end outside.
 [[nodiscard]] platform::Rect reachablePanel(
     const platform::Rect &panel, const platform::Rect &parent, const platform::Rect &workArea);
 

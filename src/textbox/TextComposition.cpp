@@ -51,7 +51,7 @@ QList<QInputMethodEvent::Attribute> attributesWithin(
         if (attribute.type == QInputMethodEvent::Selection)
             continue; // a selection counts characters of the text, not of the composition
         attribute.start = std::min(attribute.start, length);
-        if (attribute.type != QInputMethodEvent::Cursor) // its length says whether it is seen
+        if (attribute.type != QInputMethodEvent::Cursor) // length 0 would hide it
             attribute.length = std::min(attribute.length, length - attribute.start);
     }
     return attributes;

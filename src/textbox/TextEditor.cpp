@@ -184,7 +184,8 @@ void TextEditor::paintText(
     if (selections.isEmpty())
         return document()->documentLayout()->draw(&painter, context);
     // Line by line: the toolkit clips what is selected by the outline of it all, and a clip of many
-    // lines, met anew by every change of writing, took most of a tenth of a second.
+    // lines, applied again for every run of letters of one script, took most of a tenth of a
+    // second.
     for (const QRectF &line : linesIn(*document(), context.clip)) {
         painter.save();
         painter.setClipRect(line, Qt::IntersectClip);

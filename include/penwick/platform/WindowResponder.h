@@ -8,7 +8,8 @@ class QKeyEvent;
 
 namespace penwick::platform {
 
-/// Hears of it. The one of a window is its controller.
+/// Is told of the presses and keys that no view of a window has taken. A window's controller is its
+/// responder.
 class PENWICK_EXPORT WindowResponder
 {
 public:

@@ -57,7 +57,8 @@ void WindowBackdrop::cutCorners(QWidget &window, QSize size, double radius)
     window.setMask(rounded(size, radius));
 }
 
-// The toolkit keeps the shape in the pixels of the scale that it was set with.
+// The toolkit keeps the shape in the pixels of the scale that it was set with, so it is given the
+// shape again.
 void WindowBackdrop::rescale(QWidget &window)
 {
     if (!window.mask().isEmpty())

@@ -8,7 +8,7 @@
 
 namespace penwick::platform {
 
-/// Of what is wherever its user goes.
+/// For a window that is on every virtual desktop, and beside another program's full screen.
 constexpr CollectionBehaviors everywhere
     = CollectionBehavior::canJoinAllSpaces | CollectionBehavior::fullScreenAuxiliary;
 

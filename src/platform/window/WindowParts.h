@@ -13,7 +13,8 @@
 
 namespace penwick::platform {
 
-/// Each part knows the widget at most, and no part knows the window.
+/// Each part knows the widget at most. None calls anything of the window, whose address
+/// WindowFamily keeps for others.
 class WindowParts
 {
 public:
