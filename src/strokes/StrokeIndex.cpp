@@ -80,7 +80,7 @@ public:
                 places.remove(place);
             places.insert(all.end() - static_cast<std::ptrdiff_t>(come), all.end());
         }
-        gone.clear();
+        gone = {}; // and its memory
         taken = all.size();
     }
 
@@ -121,6 +121,11 @@ void StrokeIndex::follow(const EntryList<StrokeEntry> &strokes)
 
 void StrokeIndex::forget(int from, int to)
 {
+    if (from == 0 && to == static_cast<int>(m_places.size())) { // keeps no memory of what is gone
+        m_tree = std::make_unique<Tree>();
+        m_places = {};
+        return;
+    }
     const int taken = std::clamp(static_cast<int>(m_tree->taken), from, to);
     m_tree->gone.insert(m_tree->gone.end(), m_places.begin() + from, m_places.begin() + taken);
     m_tree->taken -= static_cast<std::size_t>(taken - from);
