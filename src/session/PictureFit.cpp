@@ -54,7 +54,7 @@ void PictureFit::onSettled()
     // A desktop that has told no borders beforehand may still add them later, inside the frame that
     // was asked for, and so make the content smaller. Where no borders ever come, the picture is
     // fitted until the user pulls at an edge.
-    const bool isPulled = former && *former != m_settled;
+    const bool isPulled = !hasFrame && former && *former != m_settled;
     if (!isPulled)
         fit();
     if (!hasFrame && !isPulled)

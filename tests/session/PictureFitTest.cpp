@@ -61,6 +61,20 @@ TEST_F(PictureFitTest, followsTheContentBeforeTheDesktopHasAnswered)
     EXPECT_EQ(picture(), (Rect { 0, 0, 200, 150 }));
 }
 
+TEST_F(PictureFitTest, contentThatALateFrameMakesSmallerIsFittedOnceMore)
+{
+    resizeTo({ 400, 300 });
+    settle();
+
+    m_window.show(); // this screen's windows have frames
+    resizeTo({ 400, 270 });
+    ASSERT_NE(m_window.frameGeometry(), m_window.geometry());
+    settle();
+
+    EXPECT_EQ(picture(), (Rect { 0, 0, 360, 270 }));
+    EXPECT_FALSE(isFitting());
+}
+
 TEST_F(PictureFitTest, firstPullOfAWindowThatNoDesktopFramesEndsTheFitting)
 {
     resizeTo({ 400, 300 });
