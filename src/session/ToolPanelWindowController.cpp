@@ -113,7 +113,14 @@ void ToolPanelWindowController::mouseDown()
 
 void ToolPanelWindowController::mouseUp()
 {
+    m_displacement = {}; // an earlier release may have adjusted it in the middle of this drag
     platform::callLater(*this, settleTime, &ToolPanelWindowController::adjustPosition);
+}
+
+// By the desktop's own means, which no press on the panel announces.
+void ToolPanelWindowController::windowWillMove()
+{
+    m_displacement = {};
 }
 
 } // namespace penwick

@@ -54,6 +54,7 @@ public:
     void takeItsPlace();
     void mouseDown() override;
     void mouseUp() override;
+    void windowWillMove() override;
 
 private:
     [[nodiscard]] platform::Rect ownPlace() const;
@@ -61,7 +62,9 @@ private:
         const platform::Rect &place, const platform::Rect &parent);
 
     QPointer<ToolBarPanelWindow> m_toolPanelWindow;
-    platform::Point m_displacement; // from its own place, so that its end is in reach
+    // By how much the panel stands away from where the user or the window has put it, so that the
+    // button that ends the session can be reached.
+    platform::Point m_displacement;
     std::shared_ptr<platform::Window> m_popoverWindow;
 };
 

@@ -2,9 +2,11 @@
 // A tool bar that is higher than its board: its end stays in reach, wherever the board is taken.
 #include "session/SessionFixture.h"
 
+#include "platform/foundation/Clock.h"
 #include "session/ToolPanelWindowController.h"
 
 #include <QTest>
+#include <QWindow>
 
 #include <memory>
 
@@ -105,6 +107,35 @@ TEST_F(PanelReach, thatIsDraggedInReachHasItsPlaceThere)
     takeBoardTo({ 600, 500 });
 
     EXPECT_EQ(m_panel.frame().x, 600 + distance);
+}
+
+TEST_F(PanelReach, thatTheDesktopsOwnMeansMoveHasItsPlaceThere)
+{
+    showSmallBoard();
+    takeBoardTo({ -200, 500 });
+    ASSERT_EQ(m_panel.frame().x, 0);
+    platform::Clock::ofTheDesktop().letPass(platform::Clock::Time(1000)); // its request is over
+
+    m_panel.windowHandle()->setPosition(40, m_panel.y());
+    ASSERT_TRUE(QTest::qWaitFor([this] { return m_panel.frame().x == 40; }));
+    takeBoardTo({ -190, 500 });
+
+    EXPECT_EQ(m_panel.frame().x, 50);
+}
+
+TEST_F(PanelReach, thatAnEarlierReleaseAdjustsInTheMiddleOfADragStandsWhereItIsLetGo)
+{
+    showSmallBoard();
+    takeBoardTo({ -200, 500 });
+    m_controller.mouseDown();
+    m_panel.setFrameOrigin({ -30, m_panel.frame().y });
+    m_controller.adjustPosition(); // what the earlier release has left for later
+
+    m_panel.setFrameOrigin({ 10, m_panel.frame().y });
+    m_controller.mouseUp();
+    m_controller.adjustPosition();
+
+    EXPECT_EQ(m_panel.frame().x, 10);
 }
 
 TEST_F(PanelReach, thatIsPlacedAnewHasItsPlaceThere)
