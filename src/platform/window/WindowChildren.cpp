@@ -33,6 +33,9 @@ void Window::removeChildWindow(Window &child)
     if (child.parentWindow() != this)
         return;
     child.d->family.leaveParent();
+    if (!child.isVisible())
+        child.d->family.setOrderedIn(
+            false); // it went with its parent, and does not come back with it
     if (child.windowHandle())
         child.windowHandle()->setTransientParent(nullptr);
 }
