@@ -20,6 +20,7 @@
 #include <QImage>
 #include <QScreen>
 #include <QTest>
+#include <QVariantAnimation>
 #include <QWindow>
 
 #include <cmath>
@@ -235,7 +236,12 @@ void RealBoard::chooseOption(const std::string &name, bool byPointer)
 
 void RealBoard::pressPanel()
 {
-    QWindow &panel = *m_controller->tPanelWindowController()->window()->windowHandle();
+    const platform::Window &window = *m_controller->tPanelWindowController()->window();
+    // A press would stop a panel that glides where it is seen, which depends on the machine's
+    // speed.
+    for (auto *const way : window.findChildren<QVariantAnimation *>())
+        way->setCurrentTime(way->duration());
+    QWindow &panel = *window.windowHandle();
     m_time += longAfter;
     send(panel, { 2, 12 }, Qt::LeftButton, QEvent::MouseButtonPress);
     send(panel, { 2, 12 }, Qt::LeftButton, QEvent::MouseButtonRelease);
