@@ -204,6 +204,22 @@ const std::vector<FrameRow> rows {
         },
         "shifted 50,30; moved; place 321,430 198x75; confirmed; shifted -30,-20; moved; settled",
         { 320, 410, 200, 100 }, Phase::Granted },
+    { "frameThatIsHeardOfOnTheWayIsAskedForNothingBeforeTheEnd",
+        [](Desk &desk) {
+            desk.settle(asked, borders);
+            desk.setOff(elsewhere);
+            desk.hears(asked.topLeft());
+            desk.wait(1000);
+        },
+        "shifted 50,30; moved", elsewhere, Phase::Gliding },
+    { "bordersThatAreNotYetThereOnTheWayAreNotBelieved",
+        [](Desk &desk) {
+            desk.settle(asked, borders);
+            desk.setOff(elsewhere);
+            desk.sees(asked, none);
+            desk.step(asked);
+        },
+        "shifted 50,30; moved; place 301,420 198x75", elsewhere, Phase::Gliding },
     { "bordersAndScaleThatChangeOnTheWayAreForTheNextStep",
         [](Desk &desk) {
             desk.settle(asked, borders);

@@ -97,7 +97,8 @@ void FrameNegotiation::hearCorner(std::optional<QPoint> corner, Time now)
         m_frame = *m_askedBeforeFrame;
     m_askedBeforeFrame.reset();
     m_framedAt = now;
-    await(now);
+    if (m_phase != Phase::Gliding) // which asks at its end
+        await(now);
 }
 
 FrameEffects FrameNegotiation::look(const FrameObservation &seen, Time now)
@@ -224,7 +225,7 @@ bool FrameNegotiation::isDecoratedAnew(const FrameObservation &seen) const
 {
     if (seen.isBorderless || m_framing == Framing::Lost || seen.isArranged)
         return false; // the toolkit's margins mean nothing then
-    return seen.margins != m_margins && !(m_phase == Phase::Asked && seen.margins.isNull());
+    return seen.margins != m_margins && (isAtRest() || !seen.margins.isNull());
 }
 
 QRect FrameNegotiation::outerFrame(const FrameObservation &seen) const

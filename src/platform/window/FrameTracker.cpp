@@ -176,7 +176,7 @@ void FrameTracker::carryOut(const FrameEffects &effects)
 
 void FrameTracker::place(const FramePlacing &placing)
 {
-    Q_EMIT asking();
+    Q_EMIT asking(placing.content);
     m_window.setGeometry(placing.content);
 }
 

@@ -48,8 +48,9 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 Q_SIGNALS:
-    /// The desktop is about to be asked for frame(), with margins() around the content.
-    void asking();
+    /// The desktop is about to be asked to put the content, without margins(), at `content`, in
+    /// Qt's desktop: for frame(), or for the next step of a glide to it.
+    void asking(const QRect &content);
     /// The window has another size than when this was last sent, or than when it was shown. Sent
     /// before moved() where both changed.
     void resized();

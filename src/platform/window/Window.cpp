@@ -231,6 +231,7 @@ void Window::setVisible(bool visible)
     if (visible && !canShow())
         return;
     if (visible && !isVisible()) {
+        d->glide->stop(); // one of an earlier showing would go on
         prepareBackdrop();
         d->tracker->prepareToShow();
         // Only the native windows are joined. A widget's child would be destroyed with its parent,

@@ -37,8 +37,10 @@ WindowShape::WindowShape(QWidget &window, FrameTracker &tracker)
     , m_tracker(tracker)
 {
     connect(&m_rest, &Alarm::rang, this, &WindowShape::rest);
-    connect(&tracker, &FrameTracker::asking, this, &WindowShape::update);
-    connect(&tracker, &FrameTracker::confirmed, this, &WindowShape::update);
+    connect(&tracker, &FrameTracker::asking, this,
+        [this](const QRect &content) { keep(content.size()); });
+    connect(&tracker, &FrameTracker::confirmed, this,
+        [this] { keep(toDesktop(m_tracker.frame()).marginsRemoved(m_tracker.margins()).size()); });
     connect(&tracker, &FrameTracker::resizedByUser, this, [this] { await(true); });
     connect(&tracker, &FrameTracker::resizedByDesktop, this, [this](const Rect &asked) {
         if (m_ratio && hasShape(asked.size(), *m_ratio))
@@ -48,17 +50,16 @@ WindowShape::WindowShape(QWidget &window, FrameTracker &tracker)
 }
 
 // The hint is written before the desktop is asked for a frame, because some desktops measure what
-// is asked for by a hint that is still that of another size.
-void WindowShape::update()
+// is asked for by a hint that is still that of another size. It is about the content, because that
+// is what a desktop constrains, and has the very size of this content, so that the frame itself can
+// still be asked for.
+void WindowShape::keep(const QSize &content)
 {
     if (!m_window.windowHandle())
         return;
-    const Rect frame = m_tracker.frame();
+    const QSize frame = content.grownBy(m_tracker.margins());
     const bool hasRatio
-        = m_ratio && std::abs(heightFor(frame.width, *m_ratio) - frame.height) < 1.0;
-    // The hint is about the content, because that is what a desktop constrains. It has the very
-    // size of this frame's content, so that the frame itself can still be asked for.
-    const QSize content = toDesktop(frame).marginsRemoved(m_tracker.margins()).size();
+        = m_ratio && std::abs(heightFor(frame.width(), *m_ratio) - frame.height()) < 1.0;
     NativeDesktop::instance().keepContentRatio(
         *m_window.windowHandle(), hasRatio ? content : QSize());
 }

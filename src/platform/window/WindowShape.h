@@ -30,7 +30,7 @@ Q_SIGNALS:
     void corrected(const penwick::platform::Rect &frame);
 
 private:
-    void update();
+    void keep(const QSize &content);
     void await(bool isPulled);
     void awaitRest();
     void rest();
