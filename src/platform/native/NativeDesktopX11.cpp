@@ -38,7 +38,7 @@ public:
         , m_requestFrameExtents(atom("_NET_REQUEST_FRAME_EXTENTS"))
         , m_desktop(atom("_NET_WM_DESKTOP"))
         , m_compositor(atom("_NET_WM_CM_S0"))
-        , m_frames(connection, m_root)
+        , m_frames(connection, m_root, m_frameExtents)
     { }
 
     std::optional<QMargins> frameMarginsBeforeShow(QWindow &window) override

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <cstring>
+#include <utility>
 
 namespace penwick::platform {
 
@@ -15,7 +16,8 @@ namespace {
 
 constexpr std::uint8_t sentByAnotherClient = 0x80;
 
-// The size hints of a window: 18 numbers, of which these say its shape.
+// The size hints of a window: 18 numbers. If the first has the flag, those from the two places on
+// are the least and the most width and height of its shape.
 constexpr std::uint32_t sizeHintsLength = 18;
 constexpr std::uint32_t hasAspect = 1U << 7;
 constexpr std::size_t leastAspect = 11;
@@ -23,9 +25,11 @@ constexpr std::size_t mostAspect = 13;
 
 } // namespace
 
-X11FrameFollower::X11FrameFollower(xcb_connection_t *connection, xcb_window_t root)
+X11FrameFollower::X11FrameFollower(
+    xcb_connection_t *connection, xcb_window_t root, xcb_atom_t extents)
     : m_connection(connection)
     , m_root(root)
+    , m_extents(extents)
 {
     QCoreApplication::instance()->installNativeEventFilter(this);
 }
@@ -37,7 +41,7 @@ void X11FrameFollower::follow(xcb_window_t window, NativeDesktop::FrameListener 
     if (Followed *const known = find(window))
         known->listener = std::move(listener);
     else
-        m_followed.push_back({ window, XCB_NONE, std::move(listener), QSize() });
+        m_followed.push_back({ window, XCB_NONE, std::move(listener) });
 }
 
 void X11FrameFollower::forget(xcb_window_t window)
@@ -93,21 +97,63 @@ void X11FrameFollower::onReparented(const xcb_reparent_notify_event_t &event)
         followed->listener(std::nullopt);
         return;
     }
+    listenTo(*followed);
+    measure(*followed);
+    tellCorner(*followed); // which may have changed before this connection listened
+}
+
+void X11FrameFollower::listenTo(const Followed &followed) const
+{
     const std::uint32_t mask = XCB_EVENT_MASK_STRUCTURE_NOTIFY; // each client has its own
-    xcb_change_window_attributes(m_connection, followed->frame, XCB_CW_EVENT_MASK, &mask);
-    // The frame may have moved before this connection listened.
-    const auto cookie = xcb_get_geometry(m_connection, followed->frame);
+    xcb_change_window_attributes(m_connection, followed.frame, XCB_CW_EVENT_MASK, &mask);
+}
+
+// The content lies as far inside what is seen as its borders are wide; whatever lies outside of
+// them is not seen. A frame that tells no borders is seen whole.
+void X11FrameFollower::measure(Followed &followed) const
+{
+    const auto extents
+        = xcb_get_property(m_connection, 0, followed.window, m_extents, XCB_ATOM_CARDINAL, 0, 4);
+    const auto place
+        = xcb_translate_coordinates(m_connection, followed.window, followed.frame, 0, 0);
+    const auto told = owned(xcb_get_property_reply(m_connection, extents, nullptr));
+    const auto content = owned(xcb_translate_coordinates_reply(m_connection, place, nullptr));
+    followed.inset = QPoint();
+    if (!told || told->format != 32 || told->value_len != 4 || !content)
+        return;
+    std::array<std::uint32_t, 4> borders {}; // left, right, top, bottom
+    std::memcpy(borders.data(), xcb_get_property_value(told.get()), sizeof borders);
+    followed.inset = QPoint(content->dst_x - static_cast<int>(borders[0]),
+        content->dst_y - static_cast<int>(borders[2]));
+}
+
+void X11FrameFollower::tellCorner(const Followed &followed) const
+{
+    const auto cookie = xcb_get_geometry(m_connection, followed.frame);
     const auto reply = owned(xcb_get_geometry_reply(m_connection, cookie, nullptr));
     if (reply)
-        followed->listener(QPoint(reply->x, reply->y));
+        followed.listener(QPoint(reply->x, reply->y) + followed.inset);
 }
 
 void X11FrameFollower::onConfigured(const xcb_configure_notify_event_t &event)
 {
-    const auto place = std::find_if(m_followed.begin(), m_followed.end(),
+    const auto frame = std::find_if(m_followed.begin(), m_followed.end(),
         [&event](const Followed &each) { return each.frame == event.window; });
-    if (place != m_followed.end())
-        place->listener(QPoint(event.x, event.y));
+    if (frame != m_followed.end())
+        frame->listener(QPoint(event.x, event.y) + frame->inset);
+    Followed *const content = find(event.window);
+    const bool isInParent = (event.response_type & sentByAnotherClient) == 0;
+    if (content && content->frame != XCB_NONE && isInParent
+        && std::exchange(content->content, QPoint(event.x, event.y)) != content->content)
+        onBordersChanged(*content);
+}
+
+void X11FrameFollower::onBordersChanged(Followed &followed)
+{
+    const QPoint before = followed.inset;
+    measure(followed);
+    if (followed.inset != before)
+        tellCorner(followed);
 }
 
 void X11FrameFollower::keepContentRatio(xcb_window_t window, const QSize &content)
@@ -119,13 +165,17 @@ void X11FrameFollower::keepContentRatio(xcb_window_t window, const QSize &conten
     writeContentRatio(*followed);
 }
 
-// The toolkit rewrites the hints without the ratio when it shows a window or changes its limits.
+// The toolkit rewrites the hints without the ratio when it shows a window or changes its limits. A
+// window manager may tell its borders only after it has put the window into them.
 void X11FrameFollower::onPropertyChanged(const xcb_property_notify_event_t &event)
 {
-    const Followed *const followed
-        = event.atom == XCB_ATOM_WM_NORMAL_HINTS ? find(event.window) : nullptr;
-    if (followed && !followed->contentRatio.isEmpty())
+    Followed *const followed = find(event.window);
+    if (!followed)
+        return;
+    if (event.atom == XCB_ATOM_WM_NORMAL_HINTS && !followed->contentRatio.isEmpty())
         writeContentRatio(*followed);
+    else if (event.atom == m_extents && followed->frame != XCB_NONE)
+        onBordersChanged(*followed);
 }
 
 void X11FrameFollower::writeContentRatio(const Followed &followed) const

@@ -2,6 +2,8 @@
 // Follows the frames that a window manager puts around windows.
 // Some window managers tell a window that is dragged by its title bar nothing until it is let go.
 // The frame, a window of the window manager's own, moves at once and tells so.
+// Some make the frame larger than what is seen of it, so that its borders can be taken hold of from
+// outside; the corner that is told is that of what is seen.
 #pragma once
 
 #include "platform/native/NativeDesktop.h"
@@ -20,7 +22,8 @@ namespace penwick::platform {
 class X11FrameFollower final : public QAbstractNativeEventFilter
 {
 public:
-    X11FrameFollower(xcb_connection_t *connection, xcb_window_t root);
+    /// `extents` is the atom of a window's property with the borders that are seen around it.
+    X11FrameFollower(xcb_connection_t *connection, xcb_window_t root, xcb_atom_t extents);
     ~X11FrameFollower() override;
 
     void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
@@ -38,11 +41,17 @@ private:
         xcb_window_t window;
         xcb_window_t frame; // XCB_NONE while there is none
         NativeDesktop::FrameListener listener;
-        QSize contentRatio; // empty: any
+        QSize contentRatio {}; // empty: any
+        QPoint content {}; // in its parent, as it was told last
+        QPoint inset {}; // from the frame's corner to that of what is seen of it
     };
 
     [[nodiscard]] Followed *find(xcb_window_t window);
     [[nodiscard]] xcb_window_t childOfRootAround(xcb_window_t window) const;
+    void onBordersChanged(Followed &followed);
+    void listenTo(const Followed &followed) const;
+    void measure(Followed &followed) const;
+    void tellCorner(const Followed &followed) const;
     void writeContentRatio(const Followed &followed) const;
     void onPropertyChanged(const xcb_property_notify_event_t &event);
     void onReparented(const xcb_reparent_notify_event_t &event);
@@ -51,6 +60,7 @@ private:
 
     xcb_connection_t *const m_connection;
     const xcb_window_t m_root;
+    const xcb_atom_t m_extents;
     std::vector<Followed> m_followed;
 };
 
