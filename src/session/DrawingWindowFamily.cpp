@@ -143,10 +143,13 @@ void DrawingWindowController::bringPictureInside()
     hideThePopover();
     m_drawingWindow->setFrame(inside);
     m_drawingWindowOrigin = inside.origin();
-    if (inside.size() == frame.size())
+    if (inside.size() == frame.size()) {
         takeToolBarAlong(inside.origin() - frame.origin());
-    else
+        if (m_tPanelWindowController)
+            m_tPanelWindowController->keepEndInReach(); // nobody tells that a hidden window moved
+    } else {
         placeToolBar();
+    }
     if (m_sharingNotificationWindow && m_sharingNotificationWindow->parentWindow())
         centreBanner();
 }

@@ -276,8 +276,7 @@ void ToolPanelViewController::togglePopover(PopoverChoice choice)
 
 void ToolPanelViewController::hidePopover()
 {
-    if (m_popoverW->isVisible())
-        m_popoverW->orderOut();
+    m_popoverW->orderOut(); // one that is not on the screen would come back with the tool bar
 }
 
 void ToolPanelViewController::showPopoverIfRequired(PopoverChoice choice)

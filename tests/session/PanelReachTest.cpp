@@ -138,6 +138,25 @@ TEST_F(PanelReach, thatAnEarlierReleaseAdjustsInTheMiddleOfADragStandsWhereItIsL
     EXPECT_EQ(m_panel.frame().x, 10);
 }
 
+TEST_F(PanelReach, ofAPictureThatIsShownAgainIsBesideItOnceMore)
+{
+    QImage picture(480, 200, QImage::Format_RGB32);
+    picture.fill(Qt::lightGray);
+    const auto controller
+        = m_penwick.createDrawingWindowController(WindowType::imageAnnotation, primary(), picture);
+    auto &panel = *controller->tPanelWindowController()->toolPanelWindow();
+    controller->showWindow(nullptr);
+    EXPECT_TRUE(QTest::qWaitForWindowExposed(&panel));
+    controller->window()->setFrameOrigin({ -200, 500 });
+    ASSERT_TRUE(QTest::qWaitFor([&panel] { return panel.frame().x == 0; }));
+    controller->window()->hide();
+
+    controller->showWindow(nullptr);
+
+    EXPECT_EQ(controller->window()->frame().x, 0);
+    EXPECT_EQ(panel.frame().x, 20);
+}
+
 TEST_F(PanelReach, thatIsPlacedAnewHasItsPlaceThere)
 {
     showSmallBoard();
