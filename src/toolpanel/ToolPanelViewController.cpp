@@ -276,7 +276,8 @@ void ToolPanelViewController::togglePopover(PopoverChoice choice)
 
 void ToolPanelViewController::hidePopover()
 {
-    m_popoverW->orderOut(); // one that is not on the screen would come back with the tool bar
+    if (m_popoverW->isVisible())
+        m_popoverW->orderOut();
 }
 
 void ToolPanelViewController::showPopoverIfRequired(PopoverChoice choice)
