@@ -54,6 +54,8 @@ void RealBoard::activate(bool isActive)
 
 void RealBoard::minimise(bool isMinimised)
 {
+    // A desktop may bring it back elsewhere, which goes on with no earlier move.
+    platform::Clock::ofTheDesktop().letPass(longestRest);
     window().setWindowState(isMinimised ? Qt::WindowMinimized : Qt::WindowNoState);
     m_held = {};
     if (isMinimised)
@@ -70,6 +72,7 @@ void RealBoard::hide()
 
 void RealBoard::show()
 {
+    platform::Clock::ofTheDesktop().letPass(longestRest);
     {
         const Deaf deaf(window()); // it becomes active as it is shown
         m_controller->showWindow(nullptr);
