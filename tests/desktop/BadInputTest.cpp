@@ -155,7 +155,6 @@ TEST_P(BadInput, secondWindowIsMinimisedAndComesBackWithItsToolBar)
     closeAndExpectGoodEnd(false);
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, BadInput,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(WindowManagers, BadInput, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

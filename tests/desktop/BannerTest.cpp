@@ -133,7 +133,6 @@ TEST_P(Banner, comesByItselfWhereTheHostAnnouncesAtOnce)
     EXPECT_EQ(bannerOnScreen(), bannerFrame);
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, Banner,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(WindowManagers, Banner, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

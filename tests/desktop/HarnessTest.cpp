@@ -9,6 +9,7 @@
 
 #include <array>
 #include <csignal>
+#include <cstdlib>
 #include <stdexcept>
 #include <sys/prctl.h>
 #include <sys/wait.h>
@@ -18,7 +19,7 @@ namespace penwick::desktop {
 
 TEST(PrivateDesktop, isAsLargeAsAsked)
 {
-    Desktop desktop(WindowManager::Openbox, { 640, 480 });
+    Desktop desktop(chosenManager(), { 640, 480 });
 
     EXPECT_EQ(desktop.screen().size(), QSize(640, 480));
     EXPECT_EQ(desktop.screen().picture().size(), QSize(640, 480));
@@ -45,8 +46,8 @@ TEST(PrivateDesktop, unknownKeyIsRefusedByName)
 
 TEST(PrivateDesktop, runsBesideAnother)
 {
-    Desktop first(WindowManager::Openbox);
-    Desktop second(WindowManager::Xfwm4);
+    Desktop first(eachManager().front());
+    Desktop second(eachManager().back());
 
     EXPECT_NE(first.displayName(), second.displayName());
 }
@@ -55,7 +56,7 @@ TEST(PrivateDesktop, isGoneAfterItsEnd)
 {
     std::string displayName;
     {
-        Desktop desktop(WindowManager::Openbox);
+        Desktop desktop;
         displayName = desktop.displayName();
     }
 
@@ -69,7 +70,7 @@ TEST(PrivateDesktop, isGoneAfterItsTestWasKilled)
     ASSERT_EQ(pipe(ends.data()), 0);
     const pid_t test = fork();
     if (test == 0) {
-        const Desktop desktop(WindowManager::Openbox);
+        const Desktop desktop;
         [[maybe_unused]] const auto written = write(ends[1], "!", 1);
         pause();
         _exit(0);
@@ -84,6 +85,22 @@ TEST(PrivateDesktop, isGoneAfterItsTestWasKilled)
         while (waitpid(-1, nullptr, WNOHANG) > 0) { }
         return waitpid(-1, nullptr, WNOHANG) == -1;
     }));
+}
+
+TEST(WindowManager, thatTheEnvironmentNamesStandsForAll)
+{
+    const char *const variable = "PENWICK_WINDOW_MANAGER";
+
+    setenv(variable, "kwin", 1);
+    EXPECT_EQ(chosenManager(), WindowManager::Kwin);
+    EXPECT_EQ(eachManager(), std::vector { WindowManager::Kwin });
+
+    unsetenv(variable);
+    EXPECT_EQ(chosenManager(), WindowManager::Openbox);
+    EXPECT_EQ(eachManager(), (std::vector { WindowManager::Openbox, WindowManager::Xfwm4 }));
+
+    setenv(variable, "nobody's", 1);
+    EXPECT_THROW(static_cast<void>(chosenManager()), std::runtime_error);
 }
 
 TEST(ChildProcess, absentProgramIsNamedWithTheReason)

@@ -166,7 +166,7 @@ TEST_P(ImageWindow, keepsTheImageInItsCornerWhenTheUserMakesItLargerAndShowsTheP
     EXPECT_EQ(desktop().screen().picture(inside), image.copy(inside.translated(-cornerOf(image))));
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, ImageWindow,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(
+    WindowManagers, ImageWindow, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

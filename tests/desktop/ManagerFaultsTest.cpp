@@ -94,8 +94,7 @@ TEST_P(WindowManagerRestart, leavesEverythingInItsPlace)
 }
 
 INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, WindowManagerRestart,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
-        testing::ValuesIn(allKinds())),
+    testing::Combine(testing::ValuesIn(eachManager()), testing::ValuesIn(allKinds())),
     managerAndKindName);
 
 TEST_F(CompositorLost, underAnOpenOverlayItIsBlackMeanwhileAndShowsWhatIsBelowAgainAfterwards)

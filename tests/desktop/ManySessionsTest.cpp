@@ -40,7 +40,7 @@ TEST_P(ManySessions, leaveNothingBehind)
     EXPECT_EQ(contents(errors), QString());
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, ManySessions,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(
+    WindowManagers, ManySessions, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

@@ -191,7 +191,6 @@ TEST_P(Overlay, takesThePointerWhereItIsTransparentWithoutACompositingManager)
     EXPECT_EQ(other.presses(), 0);
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, Overlay,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(WindowManagers, Overlay, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

@@ -201,7 +201,7 @@ TEST_P(Resizing, toolBarKeepsItsPlaceFromTheBottomLeftCornerOrIsPulledInside)
 }
 
 INSTANTIATE_TEST_SUITE_P(Grips, Resizing,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+    testing::Combine(testing::ValuesIn(eachManager()),
         testing::Values(rightEdge, leftEdge, bottomEdge, topEdge, corner, inwards)),
     gripName);
 
@@ -280,7 +280,7 @@ TEST_P(PulledImage, isNotCorrectedUnderARestingHandAndCountsFromTheFirstFrame)
 }
 
 INSTANTIATE_TEST_SUITE_P(Edges, PulledImage,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+    testing::Combine(testing::ValuesIn(eachManager()),
         testing::Values(Pull { "right", 1, 0 }, Pull { "left", -1, 0 }, Pull { "top", 0, -1 },
             Pull { "bottom", 0, 1 }, Pull { "bottomRight", 1, 1 }, Pull { "bottomLeft", -1, 1 })),
     pullName);
@@ -334,7 +334,6 @@ TEST_P(MovedBoard, overlayAndImagesOfAnotherShapeHaveNoHintForTheirShape)
     EXPECT_EQ(hints() & aspect, 0U);
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, MovedBoard,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(WindowManagers, MovedBoard, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

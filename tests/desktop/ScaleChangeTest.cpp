@@ -90,8 +90,8 @@ TEST_P(ScaleChange, leavesAWindowOfTheSamePixelsThatIsDrawnOnAndItsToolBarWhole)
 }
 
 INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, ScaleChange,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
-        testing::Values("whiteboard", "imageAnnotation")),
+    testing::Combine(
+        testing::ValuesIn(eachManager()), testing::Values("whiteboard", "imageAnnotation")),
     managerAndKindName);
 
 class OpenedAtAnotherScale : public FaultTest, public testing::WithParamInterface<WindowManager>
@@ -161,7 +161,7 @@ TEST_P(OpenedAtAnotherScale, aBoardStaysWhereItIsOnADesktopOfOneScale)
     expectFrame({ 267, 150, 1066, 600 });
 }
 
-INSTANTIATE_TEST_SUITE_P(Managers, OpenedAtAnotherScale,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(
+    Managers, OpenedAtAnotherScale, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

@@ -83,8 +83,7 @@ TEST_P(ScreenLost, withoutAWindowOnItChangesNothing)
 }
 
 INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, ScreenLost,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
-        testing::ValuesIn(allKinds())),
+    testing::Combine(testing::ValuesIn(eachManager()), testing::ValuesIn(allKinds())),
     managerAndKindName);
 
 } // namespace penwick::desktop

@@ -147,8 +147,8 @@ TEST_P(Screens, toolBarFollowsTheBoardToTheOtherScreen)
 }
 
 INSTANTIATE_TEST_SUITE_P(Layouts, Screens,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
-        testing::Values(rightAndHigher, leftAndLower)),
+    testing::Combine(
+        testing::ValuesIn(eachManager()), testing::Values(rightAndHigher, leftAndLower)),
     screensName);
 
 } // namespace penwick::desktop

@@ -118,7 +118,7 @@ TEST_P(EveryEnd, isToldOnceWithWhetherItWasOverAnImage)
 }
 
 INSTANTIATE_TEST_SUITE_P(Endings, EveryEnd,
-    testing::Combine(testing::Values(WindowManager::Openbox, WindowManager::Xfwm4),
+    testing::Combine(testing::ValuesIn(eachManager()),
         testing::Values( //
             Ending { "boardByTheEndTool", "whiteboard", Way::EndTool, false },
             Ending { "boardByItsTitleBar", "whiteboard", Way::TitleBar, false },
@@ -175,7 +175,6 @@ TEST_P(SessionEnd, mayBeHeardByAHostThatLetsGoAtOnce)
     expectGoodEnd();
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, SessionEnd,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(WindowManagers, SessionEnd, testing::ValuesIn(eachManager()), managerName);
 
 } // namespace penwick::desktop

@@ -3,6 +3,8 @@
 // from its left and bottom edges, title bar included.
 #include "desktop/support/BoardFixture.h"
 
+#include <tuple>
+
 namespace penwick::desktop {
 
 namespace {
@@ -10,12 +12,13 @@ namespace {
 struct Case
 {
     const char *name;
-    WindowManager windowManager;
     QSize screen;
     QRect frame; ///< from the top left
 };
 
-class WhiteboardFrame : public testing::TestWithParam<Case>
+using ManagerAndCase = std::tuple<WindowManager, Case>;
+
+class WhiteboardFrame : public testing::TestWithParam<ManagerAndCase>
 { };
 
 void PrintTo(const Case &testCase, std::ostream *stream)
@@ -23,36 +26,36 @@ void PrintTo(const Case &testCase, std::ostream *stream)
     *stream << testCase.name;
 }
 
-std::string caseName(const testing::TestParamInfo<Case> &testCase)
+std::string caseName(const testing::TestParamInfo<ManagerAndCase> &info)
 {
-    return testCase.param.name;
+    const auto &[manager, testCase] = info.param;
+    return traitsOf(manager).name + testCase.name;
 }
 
 } // namespace
 
 TEST_P(WhiteboardFrame, isTheOuterFrame)
 {
-    Desktop desktop(GetParam().windowManager, GetParam().screen);
+    const auto &[manager, testCase] = GetParam();
+    Desktop desktop(manager, testCase.screen);
     HostProcess host(desktop);
 
     const QRect logged = host.waitForWindow(QStringLiteral("drawing")).frame;
 
-    EXPECT_EQ(logged, GetParam().frame);
+    EXPECT_EQ(logged, testCase.frame);
     std::vector<WindowId> windows;
     ASSERT_TRUE(waitUntil([&] {
         windows = desktop.windows().ofProcess(host.processId());
         return !windows.empty();
     }));
-    EXPECT_EQ(desktop.windows().outerFrame(windows.front()), GetParam().frame);
+    EXPECT_EQ(desktop.windows().outerFrame(windows.front()), testCase.frame);
 }
 
 // A third of 1280 is no whole number of pixels: there the corner and the size are each the nearest.
 INSTANTIATE_TEST_SUITE_P(Desktops, WhiteboardFrame,
-    testing::Values(
-        Case { "openboxWide", WindowManager::Openbox, { 1280, 800 }, { 213, 187, 853, 480 } },
-        Case { "xfwm4Wide", WindowManager::Xfwm4, { 1280, 800 }, { 213, 187, 853, 480 } },
-        Case { "openboxLarge", WindowManager::Openbox, { 1920, 1080 }, { 320, 180, 1280, 720 } },
-        Case { "xfwm4Large", WindowManager::Xfwm4, { 1920, 1080 }, { 320, 180, 1280, 720 } }),
+    testing::Combine(testing::ValuesIn(eachManager()),
+        testing::Values(Case { "Wide", { 1280, 800 }, { 213, 187, 853, 480 } },
+            Case { "Large", { 1920, 1080 }, { 320, 180, 1280, 720 } })),
     caseName);
 
 } // namespace penwick::desktop

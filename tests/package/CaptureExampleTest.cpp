@@ -190,7 +190,7 @@ int strangePixels(const QImage &picture, const QRect &area)
 
 std::string managerName(const testing::TestParamInfo<WindowManager> &manager)
 {
-    return manager.param == WindowManager::Xfwm4 ? "xfwm4" : "openbox";
+    return desktop::traitsOf(manager.param).name;
 }
 
 } // namespace
@@ -243,7 +243,7 @@ TEST_P(CaptureExample, leavesOutPopoverAndBannerByWhatItWasToldBeforeTheyWereSho
     EXPECT_EQ(timesTheListWasTold(), told) << "each has kept its identifier";
 }
 
-INSTANTIATE_TEST_SUITE_P(WindowManagers, CaptureExample,
-    testing::Values(WindowManager::Openbox, WindowManager::Xfwm4), managerName);
+INSTANTIATE_TEST_SUITE_P(
+    WindowManagers, CaptureExample, testing::ValuesIn(desktop::eachManager()), managerName);
 
 } // namespace penwick::test

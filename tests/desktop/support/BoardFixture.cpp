@@ -162,7 +162,7 @@ int BoardTest::darkest(const QImage &image)
 
 std::string managerName(const testing::TestParamInfo<WindowManager> &manager)
 {
-    return manager.param == WindowManager::Xfwm4 ? "xfwm4" : "openbox";
+    return traitsOf(manager.param).name;
 }
 
 } // namespace penwick::desktop

@@ -18,7 +18,7 @@ class BoardTest : public testing::Test
 {
 protected:
     explicit BoardTest(
-        WindowManager windowManager = WindowManager::Openbox, QSize screenSize = { 1280, 800 })
+        WindowManager windowManager = chosenManager(), QSize screenSize = { 1280, 800 })
         : m_desktop(windowManager, screenSize)
     { }
 

@@ -22,7 +22,7 @@ constexpr std::array passedOn { "PATH", "LD_LIBRARY_PATH", "TMPDIR", "ASAN_OPTIO
 } // namespace
 
 Desktop::Desktop(WindowManager windowManager, QSize screenSize)
-    : m_kindOfManager(windowManager)
+    : m_manager(traitsOf(windowManager))
 {
     if (!m_folder.isValid())
         throw std::runtime_error("no temporary folder: " + m_folder.errorString().toStdString());
@@ -36,7 +36,8 @@ Desktop::Desktop(WindowManager windowManager, QSize screenSize)
     m_pointer = std::make_unique<Pointer>(*m_connection);
     m_keyboard = std::make_unique<Keyboard>(*m_connection);
     m_screen = std::make_unique<Screen>(*m_connection);
-    m_windows = std::make_unique<Windows>(*m_connection);
+    m_windows = std::make_unique<Windows>(*m_connection,
+        m_manager.hasInvisibleBorders ? FrameBorders::PartlyInvisible : FrameBorders::Visible);
     startWindowManager();
 }
 
@@ -84,10 +85,12 @@ void Desktop::startServer(QSize screenSize)
 {
     const std::string size
         = std::to_string(screenSize.width()) + 'x' + std::to_string(screenSize.height()) + "x24";
+    std::vector<std::string> command { "Xvfb", "-displayfd", "1", "-screen", "0", size, "-dpi",
+        "96", "-nolisten", "tcp", "-noreset" };
+    command.insert(
+        command.end(), m_manager.serverArguments.begin(), m_manager.serverArguments.end());
     m_server = std::make_unique<ChildProcess>(
-        ChildProcess::Command { { "Xvfb", "-displayfd", "1", "-screen", "0", size, "-dpi", "96",
-                                    "-nolisten", "tcp", "-noreset" },
-            environment(), file("Xvfb.log") });
+        ChildProcess::Command { command, environment(), file("Xvfb.log") });
     std::optional<std::string> number;
     require([&] { return (number = m_server->takeLine()) || m_server->exitStatus(); },
         "the X server to say its display number");
@@ -98,6 +101,8 @@ void Desktop::startServer(QSize screenSize)
 
 void Desktop::startCompositor()
 {
+    if (m_manager.composes)
+        return; // there can be one only
     // No settings of anybody's: a shadow or a fading window would change the pixels.
     m_compositor = std::make_unique<ChildProcess>(
         ChildProcess::Command { { "picom", "--config", "/dev/null", "--backend", "xrender" },
@@ -158,21 +163,24 @@ void Desktop::endWindowManager()
 
 void Desktop::startWindowManager()
 {
-    if (m_kindOfManager == WindowManager::None)
+    if (m_manager.command.empty())
         return;
-    const std::vector<std::string> command = m_kindOfManager == WindowManager::Openbox
-        ? std::vector<std::string> { "openbox", "--sm-disable" }
-        : std::vector<std::string> { "xfwm4", "--compositor=off" };
-    // Xfwm4 reads its settings over a bus, and does not start without one.
-    m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command { command,
-        m_kindOfManager == WindowManager::Xfwm4 ? environmentWithBus(sessionBus()) : environment(),
-        file("window-manager.log") });
+    std::vector<std::string> variables
+        = m_manager.needsBus ? environmentWithBus(sessionBus()) : environment();
+    variables.insert(variables.end(), m_manager.environment.begin(), m_manager.environment.end());
+    m_windowManager = std::make_unique<ChildProcess>(
+        ChildProcess::Command { m_manager.command, variables, file("window-manager.log") });
 
-    require([this] { return m_windowManager->exitStatus() || m_windows->areManaged(); },
-        command.front() + " to manage the display");
+    const auto hasComeUp = [this] {
+        return m_windows->areManaged()
+            && (!m_manager.composes || m_connection->hasSelectionOwner("_NET_WM_CM_S0"));
+    };
+    require([&] { return m_windowManager->exitStatus() || hasComeUp(); },
+        m_manager.name + " to manage the display");
     if (m_windowManager->exitStatus())
-        throw std::runtime_error(command.front() + " ended at once");
-    m_connection->awaitWindowManager();
+        throw std::runtime_error(m_manager.name + " ended at once");
+    m_connection->awaitWindowManager(
+        m_windows->canTellFrames() ? ProbeWith::FrameQuestion : ProbeWith::SelectionQuestion);
 }
 
 } // namespace penwick::desktop

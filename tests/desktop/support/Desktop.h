@@ -6,6 +6,7 @@
 #include "desktop/support/Keyboard.h"
 #include "desktop/support/Pointer.h"
 #include "desktop/support/Screen.h"
+#include "desktop/support/WindowManager.h"
 #include "desktop/support/Windows.h"
 
 #include <QRect>
@@ -21,13 +22,6 @@ namespace penwick::desktop {
 
 class XConnection;
 
-enum class WindowManager
-{
-    None,
-    Openbox,
-    Xfwm4
-};
-
 /// The whole desktop, up and managed when the constructor returns, gone after the destructor.
 ///
 /// It takes a display number that is free, so any number of them run side by side. Home, run-time
@@ -37,9 +31,10 @@ class Desktop final
 public:
     /// Throws a runtime_error with the reason when a part of it is absent or does not come up.
     explicit Desktop(
-        WindowManager windowManager = WindowManager::Openbox, QSize screenSize = { 1280, 800 });
+        WindowManager windowManager = chosenManager(), QSize screenSize = { 1280, 800 });
     ~Desktop();
 
+    [[nodiscard]] const ManagerTraits &manager() const { return m_manager; }
     [[nodiscard]] const std::string &displayName() const { return m_displayName; }
     /// What a program that is to run on this desktop needs, each "NAME=value".
     [[nodiscard]] std::vector<std::string> environment() const;
@@ -48,9 +43,10 @@ public:
     /// A name for a file in the desktop's own folder.
     [[nodiscard]] std::string file(const std::string &name) const;
 
-    /// Starts a compositing manager, and returns once it is one. Throws like the constructor.
+    /// Sees to a compositing manager: starts one, unless the window manager is one itself, and
+    /// returns once there is one. Throws like the constructor.
     void startCompositor();
-    void endCompositor(); ///< returns once there is none
+    void endCompositor(); ///< one that was started; returns once there is none
     /// Ends the window manager; its windows stay.
     void endWindowManager();
     /// Starts the constructor's one again and returns once it manages the windows that are there.
@@ -70,7 +66,7 @@ private:
     void startBus();
     [[nodiscard]] std::vector<std::string> environmentWithBus(const std::string &address) const;
 
-    const WindowManager m_kindOfManager;
+    const ManagerTraits &m_manager;
     QTemporaryDir m_folder;
     std::string m_displayName;
     std::string m_busAddress;

@@ -4,6 +4,8 @@
 #include "desktop/support/WaitUntil.h"
 #include "desktop/support/XConnection.h"
 
+#include <QMargins>
+
 #include <X11/Xlib.h>
 
 #include <X11/Xatom.h>
@@ -88,10 +90,18 @@ QRect rectangleOf(const XConnection &connection, Window window)
     return { x, y, attributes.width + 2 * border, attributes.height + 2 * border };
 }
 
+// Both sorts of extents are told in the order left, right, top, bottom.
+QMargins marginsFrom(const std::vector<unsigned long> &extents)
+{
+    return { static_cast<int>(extents[0]), static_cast<int>(extents[2]),
+        static_cast<int>(extents[1]), static_cast<int>(extents[3]) };
+}
+
 } // namespace
 
-Windows::Windows(const XConnection &connection)
+Windows::Windows(const XConnection &connection, FrameBorders borders)
     : m_connection(connection)
+    , m_borders(borders)
 { }
 
 std::vector<WindowId> Windows::stackingOrder() const
@@ -136,6 +146,13 @@ bool Windows::areManaged() const
         && !numbers(root(), "_NET_SUPPORTED").empty();
 }
 
+bool Windows::canTellFrames() const
+{
+    const std::vector<std::string> supported = atoms(root(), "_NET_SUPPORTED");
+    return std::find(supported.begin(), supported.end(), "_NET_REQUEST_FRAME_EXTENTS")
+        != supported.end();
+}
+
 WindowId Windows::active() const
 {
     const std::vector<unsigned long> windows = numbers(root(), "_NET_ACTIVE_WINDOW");
@@ -154,7 +171,17 @@ QRect Windows::clientArea(WindowId window) const
 
 QRect Windows::outerFrame(WindowId window) const
 {
-    return rectangleOf(m_connection, frameOf(m_connection, window));
+    // Who draws the frame itself says how much of its window is shadow.
+    if (const std::vector<unsigned long> shadow = numbers(window, "_GTK_FRAME_EXTENTS");
+        shadow.size() == 4)
+        return clientArea(window).marginsRemoved(marginsFrom(shadow));
+    const WindowId frame = frameOf(m_connection, window);
+    if (m_borders == FrameBorders::PartlyInvisible && frame != window) {
+        if (const std::vector<unsigned long> extents = numbers(window, "_NET_FRAME_EXTENTS");
+            extents.size() == 4)
+            return clientArea(window).marginsAdded(marginsFrom(extents));
+    }
+    return rectangleOf(m_connection, frame);
 }
 
 std::vector<unsigned long> Windows::numbers(WindowId window, const char *property) const

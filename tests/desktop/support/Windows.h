@@ -15,13 +15,20 @@ class XConnection;
 
 using WindowId = unsigned long;
 
+/// What of a frame's window is seen.
+enum class FrameBorders
+{
+    Visible,
+    PartlyInvisible ///< around the visible part is more, to take the window by
+};
+
 /// Window properties, frames and order, read from the server at each call, and the requests that a
 /// task bar would send. A window that is gone has empty answers.
 class Windows final
 {
 public:
     /// Borrows `connection`, which must live longer.
-    explicit Windows(const XConnection &connection);
+    explicit Windows(const XConnection &connection, FrameBorders borders = FrameBorders::Visible);
 
     /// Windows that the window manager manages, the undermost first; without one, those that are
     /// shown.
@@ -30,11 +37,14 @@ public:
     [[nodiscard]] std::vector<WindowId> ofProcess(int processId) const;
     /// Whether there is a window manager.
     [[nodiscard]] bool areManaged() const;
+    /// Whether the window manager tells the frame of a window that is not shown yet.
+    [[nodiscard]] bool canTellFrames() const;
     [[nodiscard]] WindowId active() const; ///< 0 if there is none
 
     [[nodiscard]] QString title(WindowId window) const;
     [[nodiscard]] QRect clientArea(WindowId window) const; ///< screen pixels from the top left
-    [[nodiscard]] QRect outerFrame(WindowId window) const; ///< with the title bar, likewise
+    /// What is seen of it with its title bar, likewise.
+    [[nodiscard]] QRect outerFrame(WindowId window) const;
 
     /// The 32-bit numbers (or atoms, or windows) of a property, empty if it is not set.
     [[nodiscard]] std::vector<unsigned long> numbers(WindowId window, const char *property) const;
@@ -61,6 +71,7 @@ private:
     void ask(WindowId window, const char *what, long first, long second);
 
     const XConnection &m_connection;
+    const FrameBorders m_borders;
 };
 
 } // namespace penwick::desktop

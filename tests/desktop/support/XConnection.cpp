@@ -86,8 +86,9 @@ void XConnection::finish() const
     XSync(m_display, False);
 }
 
-void XConnection::awaitWindowManager()
+void XConnection::awaitWindowManager(ProbeWith question)
 {
+    m_question = question;
     // A window manager announces itself before it handles events, and a question that comes in
     // between may wait until another event comes. So it is asked again and again.
     const Window firstProbe = makeProbe();
@@ -121,6 +122,12 @@ unsigned long XConnection::makeProbe() const
 
 void XConnection::askWindowManager(unsigned long probe) const
 {
+    if (m_question == ProbeWith::SelectionQuestion) {
+        XConvertSelection(
+            m_display, atom("WM_S0"), atom("VERSION"), atom("VERSION"), probe, CurrentTime);
+        finish();
+        return;
+    }
     XEvent event {};
     event.xclient.type = ClientMessage;
     event.xclient.window = probe;
@@ -132,9 +139,11 @@ void XConnection::askWindowManager(unsigned long probe) const
 
 bool XConnection::hasAnswered(unsigned long probe) const
 {
+    XEvent change {};
+    if (m_question == ProbeWith::SelectionQuestion)
+        return XCheckTypedWindowEvent(m_display, probe, SelectionNotify, &change);
     // Openbox sets other properties on the way; only this one is the answer.
     const Atom wanted = atom("_NET_FRAME_EXTENTS");
-    XEvent change {};
     while (XCheckTypedWindowEvent(m_display, probe, PropertyNotify, &change)) {
         if (change.xproperty.atom == wanted)
             return true;

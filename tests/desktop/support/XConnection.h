@@ -12,6 +12,13 @@ struct _XDisplay;
 
 namespace penwick::desktop {
 
+/// What a window manager is asked to see how far it has come.
+enum class ProbeWith
+{
+    FrameQuestion, ///< what frame a window would have; not all know it
+    SelectionQuestion ///< the manager's own selection; not all answer it
+};
+
 /// One open connection. Errors of single requests (a window that is gone) are ignored, as the
 /// answers say so too; the loss of the server ends the test process.
 class XConnection final
@@ -37,7 +44,7 @@ public:
     void finish() const;
 
     /// Waits until the window manager answers; from then on finishWithWindowManager() asks it, too.
-    void awaitWindowManager();
+    void awaitWindowManager(ProbeWith question);
     /// Asks it no more: it is about to go.
     void forgetWindowManager() { m_probe = 0; }
 
@@ -54,6 +61,7 @@ private:
     [[nodiscard]] bool hasAnswered(unsigned long probe) const;
 
     _XDisplay *const m_display;
+    ProbeWith m_question = ProbeWith::FrameQuestion;
     unsigned long m_probe = 0; // a window never shown, about which the window manager is asked
 };
 
