@@ -303,8 +303,14 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
         Q_EMIT refused(static_cast<int>(text.size() - taken.size()));
 }
 
+// The toolkit would write into a read-only editor too, and an input method may be late: what it
+// commits comes some time after the key, when the edit may have ended.
 void TextEditor::inputMethodEvent(QInputMethodEvent *event)
 {
+    if (!isEditable()) {
+        event->ignore();
+        return;
+    }
     dropCompositionBesideCaret(*this);
     TextRoom room = roomAt(replacedBy(*event, textCursor()));
     QString commit = fittingPart(event->commitString(), room);
@@ -326,7 +332,7 @@ void TextEditor::inputMethodEvent(QInputMethodEvent *event)
     Q_EMIT writingChanged();
     const auto count = (event->commitString().size() - commit.size())
         + (event->preeditString().size() - half.size());
-    if (isEditable() && count > 0)
+    if (count > 0)
         Q_EMIT refused(static_cast<int>(count));
 }
 

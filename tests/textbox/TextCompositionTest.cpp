@@ -248,6 +248,27 @@ TEST_F(TextCompositionTest, droppedInALineThatTheCaretHasLeftLeavesNoLookThere)
     EXPECT_EQ(box->frame().width, 200.0);
 }
 
+TEST_F(TextCompositionTest, isTakenOnlyWhileTheBoxIsEdited)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("a"));
+    const auto isTaken = [&box](const QString &half, const QString &commit = {}) {
+        QInputMethodEvent event(half, {});
+        event.setCommitString(commit);
+        QCoreApplication::sendEvent(box.get(), &event);
+        return event.isAccepted();
+    };
+    EXPECT_TRUE(isTaken(m_half));
+
+    leave();
+    ASSERT_EQ(box->toPlainText(), QStringLiteral("akanj"));
+
+    EXPECT_FALSE(isTaken(m_half));
+    EXPECT_FALSE(isTaken({}, QStringLiteral("漢字")));
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("akanj"));
+    EXPECT_EQ(compositionIn(*box), QString());
+}
+
 TEST_F(TextCompositionTest, goesOnInTheLineToWhichTheCaretHasGone)
 {
     const auto box = newBox();
