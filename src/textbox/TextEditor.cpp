@@ -21,18 +21,32 @@ namespace penwick {
 
 namespace {
 
-// A cursor on the text that `event` replaces by what it commits, which it selects; `at` itself if
-// the event replaces nothing. The event counts from the beginning of the selection of `at`.
-QTextCursor replacedBy(const QInputMethodEvent &event, const QTextCursor &at)
+// What an input method replaces by what it commits, counted from the beginning of what is selected.
+struct Replacement
 {
-    if (event.replacementLength() == 0)
+    int start;
+    int length;
+};
+
+// What `event` asks to replace beside `at`, as far as there is text. The toolkit would replace
+// nothing at all where a part of it is missing, and put the commit beside it.
+Replacement replacementOf(const QInputMethodEvent &event, const QTextCursor &at)
+{
+    const int first = at.selectionStart();
+    const int last = at.document()->characterCount() - 1;
+    const int start = std::clamp(first + event.replacementStart(), 0, last);
+    const int end = std::clamp(start + event.replacementLength(), start, last);
+    return { start - first, end - start };
+}
+
+// A cursor that selects what is replaced; `at` itself if that is nothing.
+QTextCursor replacedBy(const Replacement &replacement, const QTextCursor &at)
+{
+    if (replacement.length == 0)
         return at;
     QTextCursor replaced = at;
-    const int last = replaced.document()->characterCount() - 1;
-    const int start = std::clamp(at.selectionStart() + event.replacementStart(), 0, last);
-    replaced.setPosition(start);
-    replaced.setPosition(
-        std::clamp(start + event.replacementLength(), start, last), QTextCursor::KeepAnchor);
+    replaced.setPosition(at.selectionStart() + replacement.start);
+    replaced.setPosition(replaced.position() + replacement.length, QTextCursor::KeepAnchor);
     return replaced;
 }
 
@@ -312,11 +326,11 @@ void TextEditor::inputMethodEvent(QInputMethodEvent *event)
         return;
     }
     dropCompositionBesideCaret(*this);
-    TextRoom room = roomAt(replacedBy(*event, textCursor()));
+    const Replacement replacement = replacementOf(*event, textCursor());
+    TextRoom room = roomAt(replacedBy(replacement, textCursor()));
     QString commit = fittingPart(event->commitString(), room);
     // Text is replaced only if there is room for all that replaces it.
-    const bool isKept
-        = event->replacementLength() > 0 && commit.size() < event->commitString().size();
+    const bool isKept = replacement.length > 0 && commit.size() < event->commitString().size();
     if (isKept) {
         commit.clear();
         room = roomAt(textCursor());
@@ -326,7 +340,7 @@ void TextEditor::inputMethodEvent(QInputMethodEvent *event)
     QInputMethodEvent fitting(
         half, attributesWithin(event->attributes(), static_cast<int>(half.size())));
     if (!isKept)
-        fitting.setCommitString(commit, event->replacementStart(), event->replacementLength());
+        fitting.setCommitString(commit, replacement.start, replacement.length);
     ViewOf::inputMethodEvent(&fitting);
     event->setAccepted(fitting.isAccepted());
     Q_EMIT writingChanged();

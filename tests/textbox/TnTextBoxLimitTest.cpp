@@ -226,6 +226,41 @@ TEST_F(TnTextBoxLimitTest, correctionOfOneLetterThatDoesNotFitLeavesIt)
     expectSaid(*box, QStringLiteral("2 characters did not fit into this text box."));
 }
 
+TEST_F(TnTextBoxLimitTest, correctionThatDoesNotFitMakesNoRoomForAComposition)
+{
+    const auto box = almostFull(5);
+    compose(*box, {}, QStringLiteral("their"));
+
+    QInputMethodEvent event(QStringLiteral("x"), {});
+    event.setCommitString(QStringLiteral("theirs"), -5, 5);
+    QCoreApplication::sendEvent(box.get(), &event);
+
+    EXPECT_EQ(box->toPlainText().right(6), QStringLiteral("mtheir"));
+    EXPECT_EQ(compositionIn(*box), QString());
+    expectSaid(*box, QStringLiteral("7 characters did not fit into this text box."));
+}
+
+TEST_F(TnTextBoxLimitTest, correctionOfMoreThanThereIsTakesThePlaceOfWhatIsThere)
+{
+    const auto box = almostFull(0);
+    const auto correctFrom = [&box](int start, int length, const QString &text) {
+        QInputMethodEvent event;
+        event.setCommitString(text, start, length);
+        QCoreApplication::sendEvent(box.get(), &event);
+    };
+
+    correctFrom(-1, 5, QStringLiteral("n"));
+    EXPECT_EQ(box->toPlainText(), QString(mostCharacters - 1, QLatin1Char('m')) + QLatin1Char('n'));
+    correctFrom(-1, 5, QStringLiteral("no"));
+    EXPECT_EQ(lengthOf(*box), mostCharacters);
+    expectSaid(*box, QStringLiteral("2 characters did not fit into this text box."));
+
+    box->selectAll();
+    paste(*box, QStringLiteral("mend"));
+    correctFrom(-9, 2, QStringLiteral("s"));
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("snd"));
+}
+
 TEST_F(TnTextBoxLimitTest, commitThatFitsInPartGoesInInPart)
 {
     const auto box = almostFull(2);
