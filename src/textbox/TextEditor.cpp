@@ -99,16 +99,15 @@ TextEditor::~TextEditor() = default;
 
 void TextEditor::setInk(const QFont &font, const QColor &color, platform::Point origin)
 {
-    m_look.reset(); // it would keep the editor from taking the new font and colours
     setFont(font);
-    document()->setDefaultFont(font); // the widget's may be a style sheet's
+    document()->setDefaultFont(font); // the widget's may be a style sheet's, or kept from it
     QTextCharFormat ink;
     ink.setForeground(color);
-    textCursor().setBlockCharFormat(ink); // stays when all text is deleted
+    QTextCursor all(document());
+    all.select(QTextCursor::Document);
+    all.mergeBlockCharFormat(ink); // stays when all text is deleted
+    all.mergeCharFormat(ink);
     setTextColor(color);
-    QPalette colors = palette();
-    colors.setColor(QPalette::Text, color);
-    setPalette(colors);
     m_look.emplace(*this);
     m_caret.setColor(color);
 
@@ -190,7 +189,6 @@ void TextEditor::paintText(
 {
     const QPointF scrolled(horizontalScrollBar()->value(), verticalScrollBar()->value());
     QAbstractTextDocumentLayout::PaintContext context;
-    context.palette = palette();
     context.clip = part.translated(scrolled);
     context.selections = selections;
     painter.translate(-scrolled);
