@@ -24,23 +24,18 @@ void EditorHiding::closeMenu()
 
 bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
 {
-    switch (event->type()) {
-    case QEvent::DragMove: // sent to the drag's target alone
+    const QEvent::Type type = event->type();
+    if (type == QEvent::DragMove) // sent to the drag's target alone
         m_isDraggedOver = true;
-        break;
-    case QEvent::DragLeave:
-    case QEvent::Drop:
+    if (type == QEvent::DragLeave || type == QEvent::Drop)
         m_isDraggedOver = false;
-        break;
-    case QEvent::Hide:
+    if (type == QEvent::Hide) {
         closeMenu();
+        // Whatever else the drag is over would be told, if it were not over this.
         if (std::exchange(m_isDraggedOver, false)) {
             QDragLeaveEvent leave;
             QCoreApplication::sendEvent(watched, &leave);
         }
-        break;
-    default:
-        break;
     }
     return QObject::eventFilter(watched, event);
 }

@@ -3,7 +3,6 @@
 
 #include "textbox/TextSelection.h"
 
-#include <QCoreApplication>
 #include <QGuiApplication>
 #include <QInputMethod>
 #include <QInputMethodEvent>
@@ -19,6 +18,12 @@ namespace penwick {
 
 namespace {
 
+void forgetComposition(QTextLayout &line)
+{
+    line.setPreeditArea(-1, {});
+    line.clearFormats();
+}
+
 void insertComposition(const QTextBlock &block)
 {
     QTextLayout &layout = *block.layout();
@@ -27,8 +32,7 @@ void insertComposition(const QTextBlock &block)
     there.setPosition(
         block.position() + std::min(layout.preeditAreaPosition(), block.length() - 1));
     const QString left = layout.preeditAreaText();
-    layout.setPreeditArea(-1, {});
-    layout.clearFormats();
+    forgetComposition(layout);
     there.insertText(left);
 }
 
@@ -63,8 +67,7 @@ void dropCompositionBesideCaret(QTextEdit &editor)
     for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next()) {
         if (block == line || block.layout()->preeditAreaText().isEmpty())
             continue;
-        block.layout()->setPreeditArea(-1, {});
-        block.layout()->clearFormats();
+        forgetComposition(*block.layout());
         editor.document()->markContentsDirty(block.position(), block.length());
     }
 }
@@ -78,12 +81,6 @@ void commitCompositionIn(QTextEdit &editor)
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();
     // An input method that does not commit when it is told to has left its composition here.
-    const QString left = editor.textCursor().block().layout()->preeditAreaText();
-    if (!left.isEmpty()) {
-        QInputMethodEvent commit;
-        commit.setCommitString(left);
-        QCoreApplication::sendEvent(&editor, &commit);
-    }
     for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next()) {
         if (!block.layout()->preeditAreaText().isEmpty())
             insertComposition(block);

@@ -13,7 +13,6 @@
 #include <QTextDocument>
 #include <QTextFrame>
 #include <QTextLayout>
-#include <QTextOption>
 
 #include <algorithm>
 
@@ -80,9 +79,7 @@ TextEditor::TextEditor(QTextDocument *text, QWidget *parent)
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    viewport()->setAutoFillBackground(false);
     setAcceptRichText(false); // whatever is pasted arrives in the editor's own font and colour
-    setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
     setCursorWidth(0); // the caret is painted here
 
     connect(document(), &QTextDocument::contentsChanged, this, &TextEditor::writingChanged);
@@ -151,14 +148,6 @@ bool TextEditor::isEmpty() const
 bool TextEditor::isBlank() const
 {
     return isEmpty() && compositionIn(*this).isEmpty();
-}
-
-void TextEditor::scrollToCaret(double height)
-{
-    if (height <= this->height())
-        verticalScrollBar()->setValue(0);
-    else
-        ensureCursorVisible();
 }
 
 // QTextEdit does not paint here, because at a scale such as 1.5 it shows its own caret even with a
@@ -254,7 +243,7 @@ void TextEditor::mouseReleaseEvent(QMouseEvent *event)
 
 void TextEditor::wheelEvent(QWheelEvent *event)
 {
-    if (verticalScrollBar()->maximum() == 0 || event->modifiers().testFlag(Qt::ControlModifier))
+    if (event->modifiers().testFlag(Qt::ControlModifier))
         event->ignore();
     else // a read-only QTextEdit would change the size of its font
         QAbstractScrollArea::wheelEvent(event); // NOLINT(bugprone-parent-virtual-call): as said
@@ -304,13 +293,12 @@ bool TextEditor::refuses(const QKeyEvent &press)
 // QTextEdit's own implementation crashes when an offer has no format at all.
 void TextEditor::insertFromMimeData(const QMimeData *source)
 {
-    if (!isEditable() || !source || !source->hasText())
+    if (!isEditable())
         return;
     const QString text = source->text();
     const QString taken = fittingPart(text, room());
     if (!taken.isEmpty())
         insertPlainText(taken);
-    ensureCursorVisible();
     if (taken.size() < text.size())
         Q_EMIT refused(static_cast<int>(text.size() - taken.size()));
 }
@@ -340,8 +328,6 @@ void TextEditor::inputMethodEvent(QInputMethodEvent *event)
     if (!isKept)
         fitting.setCommitString(commit, replacement.start, replacement.length);
     ViewOf::inputMethodEvent(&fitting);
-    event->setAccepted(fitting.isAccepted());
-    Q_EMIT writingChanged();
     const auto count = (event->commitString().size() - commit.size())
         + (event->preeditString().size() - half.size());
     if (count > 0)

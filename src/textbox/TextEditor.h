@@ -38,9 +38,6 @@ public:
     void setEditable(bool editable);
     [[nodiscard]] bool isEmpty() const; ///< a composition is no text yet
     [[nodiscard]] bool isBlank() const; ///< empty, and without a composition
-    /// Scrolls only as far as the caret needs to be seen, and not at all if all of the text, which
-    /// is `height` points high, has room.
-    void scrollToCaret(double height);
 
     /// Writes everything in `font` and `color`, beginning at `origin` from the top left corner.
     void setInk(const QFont &font, const QColor &color, platform::Point origin);

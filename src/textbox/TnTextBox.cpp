@@ -288,23 +288,19 @@ void TnTextBox::removeAndReport()
 
 void TnTextBox::fitToText()
 {
-    if (m_isFitting || !superview())
+    if (!superview())
         return;
     m_isWritten = m_isWritten || !isBlank();
     if (!m_isWritten)
         return; // until the first letter the box stays where the canvas was clicked
-    m_isFitting = true;
     const platform::Size canvas = superview()->bounds().size();
     const platform::Size needed = layOutText(*document(), canvas.width);
     moveInto(frameInSight(frame(), needed, canvas));
-    scrollToCaret(needed.height);
-    m_isFitting = false;
+    ensureCursorVisible(); // a box that became less high does not scroll by itself
 }
 
 void TnTextBox::moveInto(const Rect &frame)
 {
-    if (frame == this->frame())
-        return;
     setFrame(frame);
     setNeedsDisplay(); // draw() also puts the delete button in its place
 }

@@ -130,7 +130,6 @@ private:
     std::optional<platform::Cursor> m_pointer; // the cursor that was made last
     bool m_pointerIsForText = false;
     bool m_isWritten = false; // whether there has ever been text in the box
-    bool m_isFitting = false;
 };
 
 } // namespace penwick
