@@ -187,6 +187,21 @@ TEST_F(DeleteTextBoxButtonTest, artworkIsDrawnAnewForEveryScale)
     }
 }
 
+TEST_F(DeleteTextBoxButtonTest, boxThatIsLeftByAKeyWhileItsButtonIsHoveredShowsTheNormalImageAgain)
+{
+    const auto box = newBox({ 20, 60 });
+    QTest::keyClicks(box.get(), QStringLiteral("a"));
+    DeleteTextBoxButton *const button = box->deleteTextButton();
+    button->mouseEntered();
+    ASSERT_EQ(shown(button->image()), artwork(m_hover));
+
+    QTest::keyClick(box.get(), Qt::Key_Return);
+    doubleClickOn(*box, { 20, 15 });
+
+    ASSERT_FALSE(button->isHidden());
+    EXPECT_EQ(shown(button->image()), artwork(m_normal));
+}
+
 TEST_F(DeleteTextBoxButtonTest, boxThatIsDeletedWhileItsButtonIsHoveredShowsTheNormalImageAgain)
 {
     const auto box = newBox({ 20, 60 });

@@ -31,12 +31,12 @@ class EditorHidingTest : public TextBoxFixture
 protected:
     EditorHidingTest() { m_dragged.setText(QStringLiteral("from elsewhere")); }
 
-    void dragOverIt()
+    void dragOver(TnTextBox &box)
     {
         QDragEnterEvent enter({ 20, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
-        QCoreApplication::sendEvent(m_box->viewport(), &enter);
+        QCoreApplication::sendEvent(box.viewport(), &enter);
         QDragMoveEvent move({ 21, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
-        QCoreApplication::sendEvent(m_box->viewport(), &move);
+        QCoreApplication::sendEvent(box.viewport(), &move);
     }
 
     QMimeData m_dragged;
@@ -53,7 +53,7 @@ TEST_F(EditorHidingTest, withoutADragNoneEnds)
 
 TEST_F(EditorHidingTest, dragOverItEndsOnce)
 {
-    dragOverIt();
+    dragOver(*m_box);
 
     m_box->hide();
     EXPECT_EQ(m_counter.leaves(), 1);
@@ -65,7 +65,7 @@ TEST_F(EditorHidingTest, dragOverItEndsOnce)
 
 TEST_F(EditorHidingTest, dragThatLeftBeforeHasEnded)
 {
-    dragOverIt();
+    dragOver(*m_box);
     QDragLeaveEvent leave;
     QCoreApplication::sendEvent(m_box->viewport(), &leave);
     ASSERT_EQ(m_counter.leaves(), 1);
@@ -77,7 +77,7 @@ TEST_F(EditorHidingTest, dragThatLeftBeforeHasEnded)
 
 TEST_F(EditorHidingTest, dragThatWasDroppedBeforeHasEnded)
 {
-    dragOverIt();
+    dragOver(*m_box);
     QDropEvent drop({ 21, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
     QCoreApplication::sendEvent(m_box->viewport(), &drop);
     ASSERT_EQ(m_box->toPlainText(), QStringLiteral("from elsewhere"));
@@ -85,6 +85,66 @@ TEST_F(EditorHidingTest, dragThatWasDroppedBeforeHasEnded)
     m_box->hide();
 
     EXPECT_EQ(m_counter.leaves(), 0);
+}
+
+// A leave goes to whatever the drag is over, so a box that it has left must send none.
+TEST_F(EditorHidingTest, dragThatIsOverSomethingElseByNowGoesOnThere)
+{
+    const auto other = newBox({ 20, 60 });
+    const LeaveCounter ofTheOther(*other->viewport());
+    for (const QEvent::Type end : { QEvent::DragLeave, QEvent::Drop }) {
+        dragOver(*m_box);
+        if (end == QEvent::DragLeave) {
+            QDragLeaveEvent leave;
+            QCoreApplication::sendEvent(m_box->viewport(), &leave);
+        } else {
+            QDropEvent drop({ 21, 15 }, Qt::CopyAction, &m_dragged, Qt::LeftButton, {});
+            QCoreApplication::sendEvent(m_box->viewport(), &drop);
+        }
+        dragOver(*other);
+
+        m_box->hide();
+        m_box->show();
+
+        EXPECT_EQ(ofTheOther.leaves(), 0) << end;
+    }
+}
+
+TEST_F(EditorHidingTest, boxThatNoDragWasOverEndsNoneElsewhere)
+{
+    const auto other = newBox({ 20, 60 });
+    const LeaveCounter ofTheOther(*other->viewport());
+    dragOver(*other);
+
+    m_box->hide();
+
+    EXPECT_EQ(ofTheOther.leaves(), 0);
+}
+
+TEST_F(EditorHidingTest, boxThatIsHiddenTwiceEndsOneDragAlone)
+{
+    const auto other = newBox({ 20, 60 });
+    const LeaveCounter ofTheOther(*other->viewport());
+    dragOver(*m_box);
+    m_box->hide();
+    m_box->show();
+    dragOver(*other);
+
+    m_box->hide();
+
+    EXPECT_EQ(ofTheOther.leaves(), 0);
+}
+
+TEST_F(EditorHidingTest, menuThatIsOpenStaysOpenUnderADrag)
+{
+    QMenu menu(m_box.get());
+    menu.addAction(QStringLiteral("Copy"));
+    menu.popup(QPoint(10, 10));
+    dragOver(*m_box);
+    QDragLeaveEvent leave;
+    QCoreApplication::sendEvent(m_box->viewport(), &leave);
+
+    EXPECT_TRUE(menu.isVisible());
 }
 
 TEST_F(EditorHidingTest, menuOfItCloses)

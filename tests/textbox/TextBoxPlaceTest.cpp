@@ -91,6 +91,16 @@ TEST(TextBoxPlace, canvasOfHalfPointsIsTakenInWholeOnes)
         (Rect { 0, 0, 300, 200 }));
 }
 
+TEST(TextBoxPlace, boxThatFillsItsCanvasTogetherWithItsButtonHasRoomForIt)
+{
+    EXPECT_EQ(
+        frameInSight({ 20, 100, 200, 30 }, { 10, 10 }, { 221, 51 }), (Rect { 0, 0, 200, 30 }));
+    EXPECT_EQ(
+        frameInSight({ 20, 100, 200, 30 }, { 10, 10 }, { 220, 51 }), (Rect { 20, 21, 200, 30 }));
+    EXPECT_EQ(
+        frameInSight({ 20, 100, 200, 30 }, { 10, 10 }, { 221, 50 }), (Rect { 20, 20, 200, 30 }));
+}
+
 TEST(TextBoxPlace, canvasSmallerThanTheLeastBoxIsFilled)
 {
     EXPECT_EQ(

@@ -248,6 +248,55 @@ TEST_F(TextCompositionTest, droppedInALineThatTheCaretHasLeftLeavesNoLookThere)
     EXPECT_EQ(box->frame().width, 200.0);
 }
 
+TEST_F(TextCompositionTest, droppedInALineThatItHadWrappedLetsTheBoxShrink)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one\ntwo"));
+    moveTo(*box, 2);
+    compose(*box, QString(30, QLatin1Char('m')));
+    ASSERT_EQ(box->frame().width, 300.0);
+    moveTo(*box, 5);
+
+    compose(*box, QStringLiteral("ka"));
+
+    EXPECT_EQ(box->frame().width, 200.0);
+}
+
+TEST_F(TextCompositionTest, whoseOwnCaretMovesLeavesWhatIsSelected)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one two"));
+    compose(*box, m_half);
+    QTextCursor word = box->textCursor();
+    word.setPosition(0);
+    word.setPosition(3, QTextCursor::KeepAnchor);
+    box->setTextCursor(word);
+
+    QInputMethodEvent moved(m_half, { { QInputMethodEvent::Cursor, 1, 1, {} } });
+    QCoreApplication::sendEvent(box.get(), &moved);
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("one two"));
+}
+
+TEST_F(TextCompositionTest, thatBecameTextIsFollowedByWhatIsTypedNext)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("one"));
+    moveTo(*box, 1);
+    composeUnderlined(*box, m_half);
+
+    QTest::keyClick(box.get(), Qt::Key_Escape);
+    QTest::keyClicks(box.get(), QStringLiteral("!"));
+
+    EXPECT_EQ(box->toPlainText(), QStringLiteral("okanj!ne"));
+    QTextCursor cursor(box->document());
+    while (!cursor.atEnd()) {
+        cursor.movePosition(QTextCursor::NextCharacter);
+        EXPECT_EQ(cursor.charFormat().foreground().color(), box->textFontColor());
+        EXPECT_FALSE(cursor.charFormat().fontUnderline());
+    }
+}
+
 TEST_F(TextCompositionTest, isTakenOnlyWhileTheBoxIsEdited)
 {
     const auto box = newBox();

@@ -129,6 +129,8 @@ TEST_F(TextEditorTest, caretThatIsMovedIsShownAgain)
     QApplication::setCursorFlashTime(200);
     const auto box = newBox();
     QTest::keyClicks(box.get(), QStringLiteral("mm"));
+    settle();
+    ASSERT_TRUE(isCaretSeen(*box));
     ASSERT_TRUE(QTest::qWaitFor([&] { return !isCaretSeen(*box); })) << "it blinks";
 
     QApplication::setCursorFlashTime(0);
@@ -136,6 +138,24 @@ TEST_F(TextEditorTest, caretThatIsMovedIsShownAgain)
     settle();
 
     EXPECT_TRUE(isCaretSeen(*box));
+}
+
+TEST_F(TextEditorTest, caretThatIsNotSeenWithoutTheFocusDoesNotBlinkEither)
+{
+    QApplication::setCursorFlashTime(20);
+    const auto former = placedBox();
+    const auto box = newBox({ 20, 60 });
+    former->setEditable(true);
+    former->setFocus();
+    box->setFocus();
+    settle();
+    PaintRecorder withoutFocus(*former->viewport());
+    PaintRecorder withFocus(*box->viewport());
+    std::size_t blinks = 0;
+
+    ASSERT_TRUE(QTest::qWaitFor([&] { return (blinks += withFocus.take().size()) > 4; }));
+
+    EXPECT_EQ(withoutFocus.take().size(), 0U);
 }
 
 TEST_F(TextEditorTest, placedOneTakesNothingFromTheClipboard)

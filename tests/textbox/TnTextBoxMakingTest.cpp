@@ -73,6 +73,31 @@ TEST_F(TnTextBoxMakingTest, customizeMakesABoxOfAnotherConstructorReady)
     EXPECT_TRUE(box->hasDashedBorder());
 }
 
+TEST_F(TnTextBoxMakingTest, customizeMakesAPlacedBoxReadyToo)
+{
+    const auto box = placedBox();
+    box->setTextFontColor(TnhColors::redColor);
+    ASSERT_EQ(borderWidth(*box), 3.0);
+
+    box->customizeTextBox();
+
+    EXPECT_TRUE(box->isEditable());
+    EXPECT_TRUE(box->hasDashedBorder());
+    EXPECT_EQ(borderWidth(*box), 0.0);
+    EXPECT_FALSE(box->deleteTextButton()->isHidden());
+    EXPECT_EQ(box->textColor(), TnhColors::redColor);
+}
+
+TEST_F(TnTextBoxMakingTest, boxInNoWindowIsNotDragged)
+{
+    const auto box = TnTextBox::create({ 10, 20, 200, 30 }, 36.0, TnhColors::redColor);
+
+    box->handleGesture(box->panGesture());
+
+    EXPECT_EQ(box->frame(), (Rect { 10, 20, 200, 30 }));
+    EXPECT_EQ(box->mouseDownPoint(), (Point { 0, 0 }));
+}
+
 TEST_F(TnTextBoxMakingTest, boxThatWasNotCustomizedIsEditedAndLeft)
 {
     RecordingOwner owner;

@@ -170,6 +170,30 @@ TEST_F(TnTextBoxPlaceTest, windowThatShrinksBringsTheBoxThatIsEditedAlong)
     EXPECT_EQ(box->frame(), small);
 }
 
+TEST_F(TnTextBoxPlaceTest, windowThatShrinksShowsTheCaretOfATextThatIsHigherThanIt)
+{
+    const auto box = newBox();
+    paste(*box, QStringLiteral("1\n2\n3\n4\n5\n6"));
+    ASSERT_EQ(box->verticalScrollBar()->maximum(), 0);
+
+    window.resize(width, 80);
+    settle();
+
+    EXPECT_EQ(box->frame().height, 80.0);
+    EXPECT_TRUE(box->viewport()->rect().contains(box->cursorRect()));
+}
+
+TEST_F(TnTextBoxPlaceTest, windowThatGrowsOneWayLeavesANewBoxInItsFrame)
+{
+    const auto box = newBox({ 250, 10 });
+    const Rect size = canvas->frame();
+
+    canvas->setFrame({ size.x, size.y, size.width + 20, size.height });
+    EXPECT_EQ(box->frame(), (Rect { 250, -14, 200, 30 }));
+    canvas->setFrame({ size.x, size.y, size.width + 20, size.height + 20 });
+    EXPECT_EQ(box->frame(), (Rect { 250, -14, 200, 30 }));
+}
+
 TEST_F(TnTextBoxPlaceTest, windowThatShrinksBringsAnEmptyBoxAlong)
 {
     const auto box = newBox();
