@@ -39,6 +39,15 @@ protected:
         QCoreApplication::sendEvent(box.viewport(), &move);
     }
 
+    /// Another box that is written in beside this one, as a host's own views may be.
+    std::shared_ptr<TnTextBox> newBoxBeside()
+    {
+        QTest::keyClicks(m_box.get(), QStringLiteral("a"));
+        auto other = newBox({ 20, 60 });
+        m_box->setEditable(true);
+        return other;
+    }
+
     QMimeData m_dragged;
     const std::shared_ptr<TnTextBox> m_box = newBox();
     LeaveCounter m_counter { *m_box->viewport() };
@@ -90,7 +99,7 @@ TEST_F(EditorHidingTest, dragThatWasDroppedBeforeHasEnded)
 // A leave goes to whatever the drag is over, so a box that it has left must send none.
 TEST_F(EditorHidingTest, dragThatIsOverSomethingElseByNowGoesOnThere)
 {
-    const auto other = newBox({ 20, 60 });
+    const auto other = newBoxBeside();
     const LeaveCounter ofTheOther(*other->viewport());
     for (const QEvent::Type end : { QEvent::DragLeave, QEvent::Drop }) {
         dragOver(*m_box);
@@ -112,7 +121,7 @@ TEST_F(EditorHidingTest, dragThatIsOverSomethingElseByNowGoesOnThere)
 
 TEST_F(EditorHidingTest, boxThatNoDragWasOverEndsNoneElsewhere)
 {
-    const auto other = newBox({ 20, 60 });
+    const auto other = newBoxBeside();
     const LeaveCounter ofTheOther(*other->viewport());
     dragOver(*other);
 
@@ -123,7 +132,7 @@ TEST_F(EditorHidingTest, boxThatNoDragWasOverEndsNoneElsewhere)
 
 TEST_F(EditorHidingTest, boxThatIsHiddenTwiceEndsOneDragAlone)
 {
-    const auto other = newBox({ 20, 60 });
+    const auto other = newBoxBeside();
     const LeaveCounter ofTheOther(*other->viewport());
     dragOver(*m_box);
     m_box->hide();
