@@ -12,7 +12,6 @@ namespace penwick {
 
 namespace {
 
-constexpr double caretWidth = 2.0; // points
 constexpr double distanceFromEdge = 3.0; // points; where a box has its border
 
 } // namespace
@@ -52,7 +51,7 @@ void TextCaret::paint(QPainter &painter) const
     if (!m_isShown || !m_isSolid)
         return;
     QRectF place = m_editor.cursorRect();
-    place.setWidth(caretWidth);
+    place.setWidth(width);
     // A box in which nothing has been written yet may be less high than a line of its font.
     const double height = m_editor.viewport()->height();
     place.setBottom(std::min(place.bottom(), height - distanceFromEdge));

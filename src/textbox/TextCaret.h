@@ -18,6 +18,8 @@ class TextCaret final : public QObject
     Q_OBJECT
 
 public:
+    static constexpr double width = 2.0; ///< points
+
     /// Borrows `editor`, whose member this is.
     explicit TextCaret(QTextEdit &editor);
 

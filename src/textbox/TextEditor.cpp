@@ -303,6 +303,18 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
         Q_EMIT refused(static_cast<int>(text.size() - taken.size()));
 }
 
+// The toolkit's own caret is 0 wide, and a rectangle without a width is never brought from the
+// editor's coordinates to the window's: the candidates stood in the corner of the window.
+QVariant TextEditor::inputMethodQuery(Qt::InputMethodQuery query) const
+{
+    const QVariant answer = ViewOf::inputMethodQuery(query);
+    if (query != Qt::ImCursorRectangle && query != Qt::ImAnchorRectangle)
+        return answer;
+    QRectF place = answer.toRectF();
+    place.setWidth(TextCaret::width);
+    return place;
+}
+
 // The toolkit would write into a read-only editor too, and an input method may be late: what it
 // commits comes some time after the key, when the edit may have ended.
 void TextEditor::inputMethodEvent(QInputMethodEvent *event)

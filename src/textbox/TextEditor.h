@@ -44,6 +44,10 @@ public:
 
     void draw(const platform::Rect &dirtyRect) override;
 
+    using QTextEdit::inputMethodQuery;
+    /// What an input method is told; it puts its candidates beside the caret.
+    [[nodiscard]] QVariant inputMethodQuery(Qt::InputMethodQuery query) const override;
+
 Q_SIGNALS:
     /// The text, or the composition in it, has changed.
     void writingChanged();
