@@ -68,7 +68,6 @@ void dropCompositionBesideCaret(QTextEdit &editor)
         if (block == line || block.layout()->preeditAreaText().isEmpty())
             continue;
         forgetComposition(*block.layout());
-        editor.document()->markContentsDirty(block.position(), block.length());
     }
 }
 
