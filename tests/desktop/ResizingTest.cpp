@@ -14,16 +14,16 @@ constexpr QRect boardFrame { 320, 180, 1280, 720 };
 struct Grip
 {
     const char *name;
-    QPoint place; ///< on the frame of a new board, on the screen
+    QPoint side; ///< as gripOf() takes it
     QPoint way;
 };
 
-const Grip rightEdge { "rightEdge", { boardFrame.right(), 500 }, { -240, 0 } };
-const Grip leftEdge { "leftEdge", { boardFrame.left(), 500 }, { 160, 0 } };
-const Grip bottomEdge { "bottomEdge", { 1000, boardFrame.bottom() - 1 }, { 0, -120 } };
-const Grip topEdge { "topEdge", { 1000, boardFrame.top() }, { 0, 90 } };
-const Grip corner { "corner", boardFrame.bottomRight() - QPoint(1, 1), { 160, 90 } };
-const Grip inwards { "cornerInwards", boardFrame.bottomRight() - QPoint(1, 1), { -300, -200 } };
+const Grip rightEdge { "rightEdge", { 1, 0 }, { -240, 0 } };
+const Grip leftEdge { "leftEdge", { -1, 0 }, { 160, 0 } };
+const Grip bottomEdge { "bottomEdge", { 0, 1 }, { 0, -120 } };
+const Grip topEdge { "topEdge", { 0, -1 }, { 0, 90 } };
+const Grip corner { "corner", { 1, 1 }, { 160, 90 } };
+const Grip inwards { "cornerInwards", { 1, 1 }, { -300, -200 } };
 
 class Resizing : public BoardTest,
                  public testing::WithParamInterface<std::tuple<WindowManager, Grip>>
@@ -36,7 +36,8 @@ protected:
     { }
 
     [[nodiscard]] static const Grip &grip() { return std::get<Grip>(GetParam()); }
-    [[nodiscard]] QRect frameOnScreen() { return desktop().windows().outerFrame(window()); }
+    /// Where the mouse takes hold of the frame of a new board.
+    [[nodiscard]] QPoint place() { return gripOf(boardFrame, grip().side); }
 
     /// How far `size` is from having the shape of `wanted`, in pixels of height.
     [[nodiscard]] static double offShape(QSize size, QSize wanted)
@@ -72,6 +73,13 @@ protected:
         ASSERT_TRUE(image.save(QString::fromStdString(file)));
         start({ "--window", "imageAnnotation", "--image", file });
         m_window = window(); // kept: the log says late where to look for it
+        // A hand takes hold of what it sees, which may come long after the window.
+        require(
+            [this] {
+                const QPoint middle = frameOnScreen().center();
+                return desktop().screen().pixel(middle) == QColor(Qt::yellow);
+            },
+            "the picture to be seen");
         ASSERT_EQ(frameOnScreen().size(), size);
     }
 
@@ -79,16 +87,7 @@ protected:
     [[nodiscard]] QRect frameOnScreen() { return desktop().windows().outerFrame(m_window); }
 
     /// Where the mouse takes hold of the frame.
-    [[nodiscard]] QPoint grip()
-    {
-        const QRect frame = frameOnScreen();
-        QPoint place = frame.center() + QPoint(60, 0); // clear of what stands in the middle
-        if (pull().x)
-            place.setX(pull().x < 0 ? frame.left() : frame.right() - (pull().y ? 1 : 0));
-        if (pull().y)
-            place.setY(pull().y < 0 ? frame.top() : frame.bottom() - 1);
-        return place;
-    }
+    [[nodiscard]] QPoint grip() { return gripOf(frameOnScreen(), { pull().x, pull().y }); }
 
     [[nodiscard]] static QPoint way(int length) { return { pull().x * length, pull().y * length }; }
 
@@ -149,12 +148,12 @@ TEST_P(Resizing, contentKeepsItsShapeUnderTheHandAndTheFrameIsSixteenToNineAfter
     const QSize content = windows.clientArea(board).size();
 
     Pointer &pointer = desktop().pointer();
-    pointer.moveTo(grip().place);
+    pointer.moveTo(place());
     pointer.press();
-    pointer.glideTo(grip().place + grip().way / 2);
+    pointer.glideTo(place() + grip().way / 2);
     require([&] { return windows.clientArea(board).size() != content; }, "the first half");
     const QSize halfway = windows.clientArea(board).size();
-    pointer.glideTo(grip().place + grip().way);
+    pointer.glideTo(place() + grip().way);
     require([&] { return windows.clientArea(board).size() != halfway; }, "the second half");
     const QSize atEnd = windows.clientArea(board).size();
     pointer.release();
@@ -177,7 +176,7 @@ TEST_P(Resizing, toolBarKeepsItsPlaceFromTheBottomLeftCornerOrIsPulledInside)
     const Windows &windows = desktop().windows();
     const QPoint before = toolBar().frame.bottomLeft() - boardFrame.bottomLeft();
 
-    desktop().pointer().drag({ grip().place, grip().place + grip().way });
+    desktop().pointer().drag({ place(), place() + grip().way });
     require(
         [&] {
             const QSize frame = windows.outerFrame(board).size();

@@ -86,6 +86,17 @@ WindowId BoardTest::toolBarWindow()
     return found;
 }
 
+QPoint BoardTest::gripOf(const QRect &frame, QPoint side) const
+{
+    const QRect grips = frame.marginsAdded(m_desktop.manager().grips);
+    QPoint place = frame.center() + QPoint(60, 0); // clear of what stands in the middle
+    if (side.x())
+        place.setX(side.x() < 0 ? grips.left() : grips.right() - (side.y() ? 1 : 0));
+    if (side.y())
+        place.setY(side.y() < 0 ? grips.top() : grips.bottom() - 1);
+    return place;
+}
+
 void BoardTest::drag(const std::vector<QPoint> &places, MouseButton button)
 {
     std::vector<QPoint> screenPlaces;

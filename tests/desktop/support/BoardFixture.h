@@ -51,6 +51,10 @@ protected:
     /// The tool bar's window, which must be on the screen.
     [[nodiscard]] WindowId toolBarWindow();
 
+    /// Where the mouse takes hold of a window's frame to pull it by that side: x -1 for the left
+    /// edge and 1 for the right one, y -1 for the top edge and 1 for the bottom one, 0 for neither.
+    [[nodiscard]] QPoint gripOf(const QRect &frame, QPoint side) const;
+
     /// Draws, or erases, along `places` on the board.
     void drag(const std::vector<QPoint> &places, MouseButton button = MouseButton::Left);
     void click(QPoint place, MouseButton button = MouseButton::Left);

@@ -30,6 +30,7 @@ const std::array<ManagerTraits, 5> &allTraits()
             .needsBus = true,
             .composes = true,
             .hasInvisibleBorders = true,
+            .grips = { 4, 4, 4, 4 },
             .environment = { "LIBGL_ALWAYS_SOFTWARE=1", "GSETTINGS_BACKEND=memory" },
             .serverArguments = { "+extension", "GLX", "+extension", "RANDR" } },
         // Not composing: with picom beside it, it is as openbox is, and starts in a third of a
@@ -37,6 +38,7 @@ const std::array<ManagerTraits, 5> &allTraits()
         ManagerTraits { .name = "kwin",
             .command = { "kwin_x11" },
             .needsBus = true,
+            .grips = { 3, 0, 3, 3 },
             .environment = { "KWIN_COMPOSE=N", "LIBGL_ALWAYS_SOFTWARE=1" },
             .serverArguments = { "+extension", "GLX", "+extension", "RANDR" } },
     };

@@ -2,6 +2,8 @@
 // The window managers that the tests know, and what is each one's own.
 #pragma once
 
+#include <QMargins>
+
 #include <string>
 #include <vector>
 
@@ -24,6 +26,7 @@ struct ManagerTraits
     bool needsBus = false; ///< does not start, or has no settings, without a session bus
     bool composes = false; ///< is a compositing manager itself, from its start to its end
     bool hasInvisibleBorders = false; ///< its frames' windows are larger than what is seen of them
+    QMargins grips = {}; ///< how far outside the frame that is seen a hand takes it, pixels
     std::vector<std::string> environment = {}; ///< "NAME=value", beside the desktop's own
     std::vector<std::string> serverArguments = {}; ///< what it needs of the X server
 };
