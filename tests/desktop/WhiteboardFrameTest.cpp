@@ -29,7 +29,7 @@ void PrintTo(const Case &testCase, std::ostream *stream)
 std::string caseName(const testing::TestParamInfo<ManagerAndCase> &info)
 {
     const auto &[manager, testCase] = info.param;
-    return traitsOf(manager).name + testCase.name;
+    return traitsOf(manager).name + '_' + testCase.name;
 }
 
 } // namespace
@@ -54,8 +54,8 @@ TEST_P(WhiteboardFrame, isTheOuterFrame)
 // A third of 1280 is no whole number of pixels: there the corner and the size are each the nearest.
 INSTANTIATE_TEST_SUITE_P(Desktops, WhiteboardFrame,
     testing::Combine(testing::ValuesIn(eachManager()),
-        testing::Values(Case { "Wide", { 1280, 800 }, { 213, 187, 853, 480 } },
-            Case { "Large", { 1920, 1080 }, { 320, 180, 1280, 720 } })),
+        testing::Values(Case { "wide", { 1280, 800 }, { 213, 187, 853, 480 } },
+            Case { "large", { 1920, 1080 }, { 320, 180, 1280, 720 } })),
     caseName);
 
 } // namespace penwick::desktop
