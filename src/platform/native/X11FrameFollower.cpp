@@ -109,7 +109,9 @@ void X11FrameFollower::listenTo(const Followed &followed) const
 }
 
 // The content lies as far inside what is seen as its borders are wide; whatever lies outside of
-// them is not seen. A frame that tells no borders is seen whole.
+// them is not seen. A frame that tells no borders is seen whole. So is one in which there is no
+// room for them yet: KWin frames a window in one that lies in the frame, tells the borders, and
+// then moves that, of which the window is told nothing.
 void X11FrameFollower::measure(Followed &followed) const
 {
     const auto extents
@@ -123,8 +125,8 @@ void X11FrameFollower::measure(Followed &followed) const
         return;
     std::array<std::uint32_t, 4> borders {}; // left, right, top, bottom
     std::memcpy(borders.data(), xcb_get_property_value(told.get()), sizeof borders);
-    followed.inset = QPoint(content->dst_x - static_cast<int>(borders[0]),
-        content->dst_y - static_cast<int>(borders[2]));
+    followed.inset = QPoint(std::max(0, content->dst_x - static_cast<int>(borders[0])),
+        std::max(0, content->dst_y - static_cast<int>(borders[2])));
 }
 
 void X11FrameFollower::tellCorner(const Followed &followed) const

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "desktop/support/FaultFixture.h"
 
+#include <algorithm>
 #include <cstdlib>
 
 namespace penwick::desktop {
@@ -29,13 +30,19 @@ void FaultTest::expectInk()
     const QPoint corner = desktop().windows().clientArea(m_window).topLeft();
     const QPoint from = corner + QPoint(200, 60 + distance * m_strokes++);
     const QPoint middle = from + QPoint(50, 0);
-    const auto levelThere = [&] { return desktop().screen().pixel(middle).green(); };
-    const int before = levelThere();
+    const QColor before = desktop().screen().pixel(middle);
+    QColor now;
+    const auto isInked = [&] { // the ground may be dark, but then it has a colour
+        now = desktop().screen().pixel(middle);
+        return std::max({ std::abs(now.red() - before.red()),
+                   std::abs(now.green() - before.green()), std::abs(now.blue() - before.blue()) })
+            > visible;
+    };
 
     desktop().pointer().drag({ from, from + QPoint(100, 0) });
 
-    EXPECT_TRUE(waitUntil([&] { return std::abs(levelThere() - before) > visible; }))
-        << "level " << before << " stays at " << middle.x() << ", " << middle.y();
+    EXPECT_TRUE(waitUntil(isInked))
+        << before.name().toStdString() << " stays at " << middle.x() << ", " << middle.y();
 }
 
 std::vector<QRect> FaultTest::places()
