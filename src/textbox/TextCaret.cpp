@@ -51,7 +51,7 @@ void TextCaret::paint(QPainter &painter) const
     if (!m_isShown || !m_isSolid)
         return;
     QRectF place = m_editor.cursorRect();
-    place.setWidth(width);
+    place.setWidth(caretWidth);
     // A box in which nothing has been written yet may be less high than a line of its font.
     const double height = m_editor.viewport()->height();
     place.setBottom(std::min(place.bottom(), height - distanceFromEdge));

@@ -12,14 +12,14 @@ class QTextEdit;
 
 namespace penwick {
 
+constexpr double caretWidth = 2.0; // points
+
 /// Blinks at the desktop's pace while it is shown; nothing runs while it is not.
 class TextCaret final : public QObject
 {
     Q_OBJECT
 
 public:
-    static constexpr double width = 2.0; ///< points
-
     /// Borrows `editor`, whose member this is.
     explicit TextCaret(QTextEdit &editor);
 

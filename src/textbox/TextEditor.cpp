@@ -311,7 +311,7 @@ QVariant TextEditor::inputMethodQuery(Qt::InputMethodQuery query) const
     if (query != Qt::ImCursorRectangle && query != Qt::ImAnchorRectangle)
         return answer;
     QRectF place = answer.toRectF();
-    place.setWidth(TextCaret::width);
+    place.setWidth(caretWidth);
     return place;
 }
 
