@@ -36,6 +36,18 @@ void insertComposition(const QTextBlock &block)
     there.insertText(left);
 }
 
+/// Keeps what input methods say from an editor as long as it lives.
+class Silence final : public QObject
+{
+public:
+    explicit Silence(QTextEdit &editor) { editor.installEventFilter(this); }
+
+    bool eventFilter(QObject * /*watched*/, QEvent *event) override
+    {
+        return event->type() == QEvent::InputMethod;
+    }
+};
+
 } // namespace
 
 // Every line is searched, because the insertion point may have left the composition's line, as it
@@ -79,10 +91,18 @@ void commitCompositionIn(QTextEdit &editor)
     }
     if (editor.hasFocus())
         QGuiApplication::inputMethod()->commit();
-    // An input method that does not commit when it is told to has left its composition here.
+    if (compositionIn(editor).isEmpty())
+        return;
+    // An input method that does not commit when it is told to, as fcitx5 does not, has left its
+    // composition here. It is to forget it then, or it would go on with it after the next key; and
+    // what it commits as it forgets is text already.
     for (QTextBlock block = editor.document()->begin(); block.isValid(); block = block.next()) {
         if (!block.layout()->preeditAreaText().isEmpty())
             insertComposition(block);
+    }
+    if (editor.hasFocus()) {
+        const Silence silence(editor);
+        QGuiApplication::inputMethod()->reset();
     }
 }
 
