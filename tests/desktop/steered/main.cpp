@@ -10,14 +10,25 @@
 //   open-nowhere                   opens a window on no screen at all
 //   frame                          logs the frame that the component says its window has, as
 //                                  [x, y, width, height] in points, y up
+//   writing                        logs the text of the editor that has the keyboard, what is
+//                                  composed in it, and the caret as the input method is told it:
+//                                  screen pixels from the top left
 //   arrow                          gives the canvas the arrow for its pointer, behind its back
 #include "host/Host.h"
 #include "host/Session.h"
 
 #include <penwick/platform/NotificationCenter.h>
 
-#include <QGuiApplication>
+#include <QApplication>
+#include <QInputMethod>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QSocketNotifier>
+#include <QTextBlock>
+#include <QTextEdit>
+#include <QTextLayout>
+#include <QWindow>
 
 #include <array>
 #include <cstdio>
@@ -85,6 +96,8 @@ private:
                 penwick::WindowType::whiteboard, nullptr);
         else if (order == QLatin1String("frame"))
             logFrame();
+        else if (order == QLatin1String("writing"))
+            logWriting();
         else if (order == QLatin1String("arrow"))
             m_session.window()
                 ->findChild<QWidget *>(QStringLiteral("drawingView"))
@@ -98,6 +111,24 @@ private:
         const penwick::platform::Rect frame = m_session.window()->frame();
         std::printf("{\"event\":\"frame\",\"rect\":[%.0f,%.0f,%.0f,%.0f]}\n", frame.x, frame.y,
             frame.width, frame.height);
+    }
+
+    static void logWriting()
+    {
+        QJsonObject writing { { QStringLiteral("event"), QStringLiteral("writing") } };
+        if (const auto *const editor = qobject_cast<QTextEdit *>(QApplication::focusWidget())) {
+            QString composed;
+            for (QTextBlock block = editor->document()->begin(); block.isValid();
+                 block = block.next())
+                composed += block.layout()->preeditAreaText();
+            const QRectF caret = QGuiApplication::inputMethod()->cursorRectangle();
+            const QPointF corner = editor->window()->windowHandle()->mapToGlobal(caret.topLeft());
+            writing.insert(QStringLiteral("text"), editor->toPlainText());
+            writing.insert(QStringLiteral("composed"), composed);
+            writing.insert(QStringLiteral("rect"),
+                QJsonArray { corner.x(), corner.y(), caret.width(), caret.height() });
+        }
+        std::puts(QJsonDocument(writing).toJson(QJsonDocument::Compact).constData());
     }
 
     void letGoAtEnd()

@@ -51,29 +51,30 @@ Desktop::~Desktop()
     m_server.reset();
 }
 
-std::vector<std::string> Desktop::environment() const
+std::vector<std::string> Desktop::environment(const std::vector<std::string> &variables) const
 {
-    // The address of a bus that does not exist: without any address a program would start a bus,
-    // which would stay.
-    return environmentWithBus("unix:path=" + file("no-bus"));
-}
-
-std::vector<std::string> Desktop::environmentWithBus(const std::string &address) const
-{
-    std::vector<std::string> variables {
+    std::vector<std::string> all {
         "HOME=" + file("home"),
         "XDG_RUNTIME_DIR=" + file("run"),
         "LANG=C.UTF-8",
-        "DBUS_SESSION_BUS_ADDRESS=" + address,
+        // The address of a bus that does not exist: without any address a program would start a
+        // bus, which would stay.
+        "DBUS_SESSION_BUS_ADDRESS=unix:path=" + file("no-bus"),
         "NO_AT_BRIDGE=1",
     };
     if (!m_displayName.empty())
-        variables.push_back("DISPLAY=" + m_displayName);
+        all.push_back("DISPLAY=" + m_displayName);
     for (const char *name : passedOn) {
         if (const char *const value = std::getenv(name))
-            variables.push_back(std::string(name) + '=' + value);
+            all.push_back(std::string(name) + '=' + value);
     }
-    return variables;
+    for (const std::string &variable : variables) {
+        // If a variable were there twice, the first would count.
+        const std::string name = variable.substr(0, variable.find('=') + 1);
+        std::erase_if(all, [&name](const std::string &other) { return other.starts_with(name); });
+        all.push_back(variable);
+    }
+    return all;
 }
 
 std::string Desktop::file(const std::string &name) const
@@ -165,11 +166,11 @@ void Desktop::startWindowManager()
 {
     if (m_manager.command.empty())
         return;
-    std::vector<std::string> variables
-        = m_manager.needsBus ? environmentWithBus(sessionBus()) : environment();
-    variables.insert(variables.end(), m_manager.environment.begin(), m_manager.environment.end());
-    m_windowManager = std::make_unique<ChildProcess>(
-        ChildProcess::Command { m_manager.command, variables, file("window-manager.log") });
+    std::vector<std::string> variables = m_manager.environment;
+    if (m_manager.needsBus)
+        variables.push_back("DBUS_SESSION_BUS_ADDRESS=" + sessionBus());
+    m_windowManager = std::make_unique<ChildProcess>(ChildProcess::Command {
+        m_manager.command, environment(variables), file("window-manager.log") });
 
     const auto hasComeUp = [this] {
         return m_windows->areManaged()

@@ -36,8 +36,10 @@ public:
 
     [[nodiscard]] const ManagerTraits &manager() const { return m_manager; }
     [[nodiscard]] const std::string &displayName() const { return m_displayName; }
-    /// What a program that is to run on this desktop needs, each "NAME=value".
-    [[nodiscard]] std::vector<std::string> environment() const;
+    /// What a program that is to run on this desktop needs, each "NAME=value"; `variables` beside
+    /// that, or instead of it.
+    [[nodiscard]] std::vector<std::string> environment(
+        const std::vector<std::string> &variables = {}) const;
     /// The address of the desktop's session bus, which is started when it is first asked for.
     [[nodiscard]] const std::string &sessionBus();
     /// A name for a file in the desktop's own folder.
@@ -64,7 +66,6 @@ public:
 private:
     void startServer(QSize screenSize);
     void startBus();
-    [[nodiscard]] std::vector<std::string> environmentWithBus(const std::string &address) const;
 
     const ManagerTraits &m_manager;
     QTemporaryDir m_folder;

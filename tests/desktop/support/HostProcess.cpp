@@ -20,16 +20,10 @@ ChildProcess::Command hostCommand(const Desktop &desktop, const std::string &err
 {
     const char *const path
         = program == HostProgram::AsShipped ? PENWICK_HOST_PROGRAM : PENWICK_STEERED_HOST_PROGRAM;
-    ChildProcess::Command command { { path, "--log" }, desktop.environment(), errorFile };
+    std::vector<std::string> beside { "QT_QPA_PLATFORM=xcb" };
+    beside.insert(beside.end(), variables.begin(), variables.end());
+    ChildProcess::Command command { { path, "--log" }, desktop.environment(beside), errorFile };
     command.arguments.insert(command.arguments.end(), arguments.begin(), arguments.end());
-    command.environment.emplace_back("QT_QPA_PLATFORM=xcb");
-    for (const std::string &variable : variables) {
-        // If a variable were there twice, the first would count.
-        const std::string name = variable.substr(0, variable.find('=') + 1);
-        std::erase_if(command.environment,
-            [&name](const std::string &other) { return other.starts_with(name); });
-        command.environment.push_back(variable);
-    }
     return command;
 }
 
@@ -124,6 +118,10 @@ void HostProcess::takeEvent(const QJsonObject &event)
         ++m_callsDone;
     } else if (kind == QLatin1String("frame")) {
         m_frame = rectangleFrom(event.value(QLatin1String("rect")));
+    } else if (kind == QLatin1String("writing")) {
+        m_writing = { event.value(QLatin1String("text")).toString(),
+            event.value(QLatin1String("composed")).toString(),
+            rectangleFrom(event.value(QLatin1String("rect"))) };
     } else if (kind == QLatin1String("window")) {
         WindowState state { event.value(QLatin1String("visible")).toBool(),
             rectangleFrom(event.value(QLatin1String("rect"))), {} };
@@ -150,6 +148,12 @@ QRect HostProcess::frame()
 {
     steer(QStringLiteral("frame"));
     return m_frame;
+}
+
+Writing HostProcess::writing()
+{
+    steer(QStringLiteral("writing"));
+    return m_writing;
 }
 
 template <class Condition>

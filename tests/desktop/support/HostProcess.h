@@ -33,6 +33,14 @@ struct PostedNotification
     QJsonValue object;
 };
 
+/// What stands in the text box that has the keyboard.
+struct Writing
+{
+    QString text;
+    QString composed; ///< by an input method, and not part of the text yet
+    QRect caret; ///< as the input method is told it; screen pixels from the top left
+};
+
 enum class HostProgram
 {
     AsShipped, ///< penwick-host itself
@@ -72,6 +80,9 @@ public:
     /// bottom left corner. Needs the steered program.
     [[nodiscard]] QRect frame();
 
+    /// Empty if no text box has the keyboard. Needs the steered program.
+    [[nodiscard]] Writing writing();
+
     [[nodiscard]] const std::vector<PostedNotification> &notifications();
     /// The state of the window called `name` that was written last; an invisible one before that.
     [[nodiscard]] WindowState window(const QString &name);
@@ -93,6 +104,7 @@ private:
     QStringList m_printedLines;
     int m_callsDone = 0;
     QRect m_frame;
+    Writing m_writing;
 };
 
 } // namespace penwick::desktop

@@ -127,6 +127,22 @@ std::vector<WindowId> Windows::stackingOrder() const
     return windows;
 }
 
+std::vector<QRect> Windows::unmanaged() const
+{
+    constexpr int seenFrom = 20; // pixels; window managers have smaller ones for themselves
+    std::vector<Window> frames;
+    for (const WindowId window : stackingOrder())
+        frames.push_back(frameOf(m_connection, window));
+    std::vector<QRect> areas;
+    for (const Window window : familyOf(m_connection, root()).children) {
+        const QRect area = rectangleOf(m_connection, window);
+        if (std::find(frames.begin(), frames.end(), window) == frames.end() && isShown(window)
+            && area.width() >= seenFrom && area.height() >= seenFrom)
+            areas.push_back(area);
+    }
+    return areas;
+}
+
 std::vector<WindowId> Windows::ofProcess(int processId) const
 {
     const std::vector<unsigned long> owner { static_cast<unsigned long>(processId) };

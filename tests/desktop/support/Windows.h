@@ -33,6 +33,8 @@ public:
     /// Windows that the window manager manages, the undermost first; without one, those that are
     /// shown.
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
+    /// What is shown without the window manager, such as menus; screen pixels from the top left.
+    [[nodiscard]] std::vector<QRect> unmanaged() const;
     /// Those of process `processId`, the undermost first.
     [[nodiscard]] std::vector<WindowId> ofProcess(int processId) const;
     /// Whether there is a window manager.
