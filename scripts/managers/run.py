@@ -1,8 +1,9 @@
 #!/usr/bin/python3
 # SPDX-License-Identifier: MIT
-"""Runs the desktop tests of a build under window managers, in turn, and prints a table of them.
+"""Runs the desktop tests of a build under window managers, or those that write with an input method,
+in turn, and prints a table of them.
 
-    scripts/managers/run.py [--only REGEX] [--jobs 2] BUILD MANAGER...
+    scripts/managers/run.py [--only REGEX] [--jobs 2] BUILD MANAGER|METHOD...
 
 scripts/desktops installs and builds what is needed, and calls this. What a test that fails has said
 is kept under BUILD/desktops/MANAGER.
@@ -21,10 +22,18 @@ import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 TIME_LIMIT = 120  # seconds for one test; one that waits in vain gives up much earlier
+INPUT_METHODS = 'ibus', 'fcitx5'
 PASSED, KNOWN, FAILED, ABSENT = 'passed', 'known', '**failed**', ''
 
 
+def program_for(manager, build):
+    name = 'penwick-test-input-methods' if manager in INPUT_METHODS else 'penwick-test-desktop'
+    return build / 'tests/desktop' / name
+
+
 def environment(manager):
+    if manager in INPUT_METHODS:
+        return dict(os.environ)
     return dict(os.environ, PENWICK_WINDOW_MANAGER=manager)
 
 
@@ -35,10 +44,10 @@ def tests_of(program, manager):
     suite = ''
     for line in listed.splitlines():
         name = line.split('#')[0].strip()
-        if line.startswith(' '):
-            yield suite + name
-        else:
+        if not line.startswith(' '):
             suite = name
+        elif manager not in INPUT_METHODS or name.endswith(f'/{manager}'):
+            yield suite + name
 
 
 def row_of(test, manager):
@@ -114,9 +123,9 @@ def main():
     parser.add_argument('build', type=pathlib.Path)
     parser.add_argument('managers', nargs='+')
     arguments = parser.parse_args()
-    program = arguments.build / 'tests/desktop/penwick-test-desktop'
 
-    outcomes = {manager: run_all(program, manager, arguments) for manager in arguments.managers}
+    outcomes = {manager: run_all(program_for(manager, arguments.build), manager, arguments)
+                for manager in arguments.managers}
     if not any(outcomes.values()):
         sys.exit('error: no test has such a name')
     lines = list(table(arguments.managers, outcomes))

@@ -143,6 +143,16 @@ std::vector<QRect> Windows::unmanaged() const
     return areas;
 }
 
+QRect Windows::inFrontAt(QPoint place) const
+{
+    int x = 0;
+    int y = 0;
+    Window child = 0;
+    XTranslateCoordinates(
+        m_connection.display(), root(), root(), place.x(), place.y(), &x, &y, &child);
+    return rectangleOf(m_connection, child);
+}
+
 std::vector<WindowId> Windows::ofProcess(int processId) const
 {
     const std::vector<unsigned long> owner { static_cast<unsigned long>(processId) };

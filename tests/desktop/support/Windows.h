@@ -35,6 +35,8 @@ public:
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
     /// What is shown without the window manager, such as menus; screen pixels from the top left.
     [[nodiscard]] std::vector<QRect> unmanaged() const;
+    /// The area of what is in front at a place of the screen, with its title bar.
+    [[nodiscard]] QRect inFrontAt(QPoint place) const;
     /// Those of process `processId`, the undermost first.
     [[nodiscard]] std::vector<WindowId> ofProcess(int processId) const;
     /// Whether there is a window manager.

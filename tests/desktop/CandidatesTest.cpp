@@ -1,0 +1,139 @@
+// SPDX-License-Identifier: MIT
+// Where the list stands that an input method shows of what may be meant: beside the caret.
+#include "desktop/support/InputMethodFixture.h"
+#include "desktop/support/OtherProgram.h"
+
+#include <cstdlib>
+
+namespace penwick::desktop {
+
+namespace {
+
+class CandidatesTest : public InputMethodTest
+{
+protected:
+    /// Whether the list stands right above or below the caret that it is for.
+    testing::AssertionResult stands(const QRect &list)
+    {
+        constexpr int near = 12;
+        const QRect caret = host().writing().caret;
+        const bool isBelow = std::abs(list.top() - caret.bottom()) <= near;
+        const bool isAbove = std::abs(list.bottom() - caret.top()) <= near;
+        if ((isBelow || isAbove) && std::abs(list.left() - caret.left()) <= near)
+            return testing::AssertionSuccess();
+        return testing::AssertionFailure()
+            << "the list stands at " << list.x() << ", " << list.y() << " to " << list.bottom()
+            << ", the caret at " << caret.x() << ", " << caret.y() << " to " << caret.bottom();
+    }
+};
+
+} // namespace
+
+TEST_P(CandidatesTest, standBesideTheCaretOfANewBox)
+{
+    const QPoint corner = makeBoxToCompose();
+    type("kanji");
+    ASSERT_TRUE(comesToHold("", "かんじ"));
+
+    const QRect list = askForCandidates();
+    keepPicture("new");
+
+    EXPECT_EQ(host().writing().caret.topLeft(), onScreen(corner) + QPoint(5, 6));
+    EXPECT_TRUE(stands(list));
+}
+
+TEST_P(CandidatesTest, standBesideTheCaretOfABoxThatWasDragged)
+{
+    const QPoint corner = makeBoxToCompose();
+    type("a");
+    press("Return");
+    ASSERT_TRUE(comesToHold("あ", ""));
+    click(farAway);
+    ASSERT_TRUE(comesToBePlaced(corner));
+    const QPoint grip(60, 15);
+    const QPoint way(120, -60);
+    drag({ corner + grip, corner + grip + way / 2, corner + grip + way });
+    ASSERT_TRUE(comesToBePlaced(corner + way));
+
+    doubleClick(corner + way + grip);
+    ASSERT_TRUE(comesToBeEdited(corner + way));
+    press("End");
+    type("kanji");
+    ASSERT_TRUE(comesToHold("あ", "かんじ"));
+    const QRect list = askForCandidates();
+
+    keepPicture("dragged");
+    EXPECT_TRUE(
+        QRect(onScreen(corner + way), newBoxSize + QSize(0, 10)).contains(host().writing().caret));
+    EXPECT_TRUE(stands(list));
+}
+
+TEST_P(CandidatesTest, standBesideTheCaretOfABoxThatMovedAwayFromAnEdge)
+{
+    makeBoxToCompose({ 750, 150 });
+    for (int word = 0; word < 2; ++word) {
+        type("sakuramomo");
+        press("Return");
+    }
+    type("kanji");
+    ASSERT_TRUE(comesToHold("さくらももさくらもも", "かんじ"));
+
+    const QRect list = askForCandidates();
+    keepPicture("edge");
+
+    EXPECT_TRUE(canvas().contains(host().writing().caret));
+    EXPECT_TRUE(stands(list));
+}
+
+TEST_P(CandidatesTest, standBesideTheCaretOfATextThatIsScrolled)
+{
+    makeBoxToCompose();
+    for (int line = 0; line < 24; ++line)
+        desktop().keyboard().pressWith("Shift_L", "Return");
+    type("kanji");
+    ASSERT_TRUE(comesToHold("\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n\n", "かんじ"));
+
+    const QRect list = askForCandidates();
+    keepPicture("scrolled");
+
+    EXPECT_TRUE(canvas().contains(host().writing().caret));
+    EXPECT_TRUE(stands(list));
+}
+
+TEST_P(CandidatesTest, standBesideTheCaretAfterTheBoardWasMoved)
+{
+    makeBoxToCompose();
+    type("a");
+    press("Return");
+    ASSERT_TRUE(comesToHold("あ", ""));
+    const QPoint before = canvas().topLeft();
+    const QPoint title = before + QPoint(400, -10);
+    desktop().pointer().drag({ title, title + QPoint(40, 25), title + QPoint(80, 50) });
+    require([&] { return canvas().topLeft() == before + QPoint(80, 50); }, "the board to move");
+
+    type("kanji");
+    ASSERT_TRUE(comesToHold("あ", "かんじ"));
+
+    EXPECT_TRUE(stands(askForCandidates()));
+}
+
+TEST_P(CandidatesTest, standAboveTheLayer)
+{
+    const OtherProgram sheet(desktop(), { 200, 100, 900, 600 }, Qt::white);
+    host().steer(QStringLiteral("open annotation"));
+    host().selectTool(QStringLiteral("text"));
+    makeBoxToCompose(sheet.area().topLeft() + QPoint(200, 100));
+    type("kanji");
+    ASSERT_TRUE(comesToHold("", "かんじ"));
+
+    const QRect list = askForCandidates();
+    keepPicture("layer");
+
+    EXPECT_TRUE(stands(list));
+    EXPECT_EQ(desktop().windows().inFrontAt(list.center()), list);
+}
+
+INSTANTIATE_TEST_SUITE_P(X11, CandidatesTest,
+    testing::Values(InputMethodKind::Ibus, InputMethodKind::Fcitx), methodName);
+
+} // namespace penwick::desktop
