@@ -5,12 +5,6 @@
 
 namespace penwick::desktop {
 
-namespace {
-
-constexpr QPoint elsewhere { 600, 300 };
-
-} // namespace
-
 TEST_P(InputMethodTest, composesWhatIsTypedAndCommitsItOnce)
 {
     makeBoxToCompose();
@@ -69,6 +63,38 @@ TEST_P(InputMethodTest, keysThatChooseToolsChooseNoneWhileComposing)
 
     click(elsewhere); // the text tool's, if it is still chosen
     EXPECT_TRUE(comesToBeEdited(boxOf(elsewhere)));
+}
+
+TEST_P(InputMethodTest, keysThatChooseToolsChooseThemBesideTheBox)
+{
+    constexpr QPoint ofItsBackground(-14, -14);
+    const QPoint corner = makeBoxToCompose();
+    type("be");
+    press("Return");
+    press("Return");
+    ASSERT_TRUE(comesToBePlaced(corner));
+    const QMap<QString, QPoint> buttons = toolBar().buttons;
+    desktop().pointer().click(buttons.value(QStringLiteral("brush")));
+    desktop().pointer().moveTo(onScreen(farAway));
+
+    type("e");
+
+    const QPoint eraser = buttons.value(QStringLiteral("eraser")) + ofItsBackground;
+    EXPECT_TRUE(
+        waitUntil([&] { return desktop().screen().pixel(eraser) == QColor(18, 168, 241); }));
+}
+
+TEST_P(InputMethodTest, undoAndRedoTakeBackAndBringWhatWasComposed)
+{
+    makeBoxToCompose();
+    type("sakura");
+    press("Return");
+    ASSERT_TRUE(comesToHold("さくら", ""));
+
+    desktop().keyboard().pressWith("Control_L", "z");
+    EXPECT_TRUE(comesToHold("", ""));
+    desktop().keyboard().pressWith("Control_L", "y");
+    EXPECT_TRUE(comesToHold("さくら", ""));
 }
 
 // What ends an edit

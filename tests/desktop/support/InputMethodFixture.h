@@ -12,6 +12,7 @@ class InputMethodTest : public TextBoxTest, public testing::WithParamInterface<I
 {
 protected:
     static constexpr QPoint place { 300, 150 };
+    static constexpr QPoint elsewhere { 600, 300 };
 
     InputMethodTest();
 

@@ -129,15 +129,14 @@ std::vector<WindowId> Windows::stackingOrder() const
 
 std::vector<QRect> Windows::unmanaged() const
 {
-    constexpr int seenFrom = 20; // pixels; window managers have smaller ones for themselves
-    std::vector<Window> frames;
-    for (const WindowId window : stackingOrder())
-        frames.push_back(frameOf(m_connection, window));
+    constexpr int seenFrom = 20; // pixels; programs have smaller ones for their own ends
+    const std::vector<WindowId> managed = stackingOrder();
     std::vector<QRect> areas;
     for (const Window window : familyOf(m_connection, root()).children) {
         const QRect area = rectangleOf(m_connection, window);
-        if (std::find(frames.begin(), frames.end(), window) == frames.end() && isShown(window)
-            && area.width() >= seenFrom && area.height() >= seenFrom)
+        const bool isManaged = std::find(managed.begin(), managed.end(), window) != managed.end();
+        if (!isManaged && text(window, "WM_CLASS") && isShown(window) && area.width() >= seenFrom
+            && area.height() >= seenFrom)
             areas.push_back(area);
     }
     return areas;

@@ -33,7 +33,8 @@ public:
     /// Windows that the window manager manages, the undermost first; without one, those that are
     /// shown.
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
-    /// What is shown without the window manager, such as menus; screen pixels from the top left.
+    /// What programs show without the window manager, such as menus; screen pixels from the top
+    /// left. The manager's own windows have no class.
     [[nodiscard]] std::vector<QRect> unmanaged() const;
     /// The area of what is in front at a place of the screen, with its title bar.
     [[nodiscard]] QRect inFrontAt(QPoint place) const;
