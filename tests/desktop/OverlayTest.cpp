@@ -95,6 +95,21 @@ TEST_P(Overlay, coversExactlyTheScreen)
     EXPECT_EQ(desktop().windows().outerFrame(window()), wholeScreen);
 }
 
+TEST_P(Overlay, andItsToolBarHaveOneSizeEach)
+{
+    startOverlay();
+    // Of the size hints the first number is which of the others count.
+    constexpr unsigned long leastAndMost = 16 + 32;
+    for (const WindowId each : { window(), toolBarWindow() }) {
+        const auto hints = desktop().windows().numbers(each, "WM_NORMAL_HINTS");
+        ASSERT_EQ(hints.size(), 18U);
+        EXPECT_EQ(hints[0] & leastAndMost, leastAndMost);
+        const QSize size = desktop().windows().clientArea(each).size();
+        EXPECT_EQ(QSize(static_cast<int>(hints[5]), static_cast<int>(hints[6])), size);
+        EXPECT_EQ(QSize(static_cast<int>(hints[7]), static_cast<int>(hints[8])), size);
+    }
+}
+
 TEST_P(Overlay, liesAboveOtherWindowsAndDocksAlsoAfterTheyAreActivated)
 {
     OtherProgram dock(desktop(), { 0, 770, 1280, 30 }, teal, OtherProgram::Kind::Dock);

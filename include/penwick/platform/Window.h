@@ -164,6 +164,7 @@ private:
     void applyAttributes();
     void orderIn();
     void prepareBackdrop();
+    void standAmongOthers();
     void tellDelegate(void (WindowDelegate::*what)());
     void showFamily();
     void hideFamily();

@@ -28,7 +28,9 @@ std::optional<QMargins> NativeDesktop::frameMarginsBeforeShow(QWindow &)
 // NOLINTNEXTLINE(performance-unnecessary-value-param): a desktop that can follow keeps it
 void NativeDesktop::followFrame(QWindow &, FrameListener) { }
 
-void NativeDesktop::forgetFrame(WId) { }
+void NativeDesktop::prepareToShow(QWindow &, const WindowStanding &) { }
+
+void NativeDesktop::forget(WId) { }
 
 bool NativeDesktop::keepsWindowsOutOfCaptures() const
 {
@@ -52,6 +54,8 @@ double NativeDesktop::hotSpotScale(double devicePixelRatio)
 }
 
 void NativeDesktop::keepContentRatio(QWindow &, const QSize &) { }
+
+void NativeDesktop::keepContentSize(QWindow &, const QSize &) { }
 
 void NativeDesktop::applyAttributes(QWindow &, const WindowAttributes &) { }
 

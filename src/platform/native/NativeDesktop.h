@@ -3,6 +3,8 @@
 // of its own.
 #pragma once
 
+#include "platform/native/WindowStanding.h"
+
 #include <penwick/platform/WindowAttributes.h>
 
 #include <QMargins>
@@ -40,8 +42,11 @@ public:
     /// active. Replaces an earlier listener of the same window. Does nothing where the desktop, or
     /// the host, leaves no way to know.
     virtual void followFrame(QWindow &window, FrameListener listener);
-    /// Ends followFrame() for `window`, which may be gone.
-    virtual void forgetFrame(WId window);
+    /// Tells the desktop how `window`, which exists but has not been shown, is to stand among other
+    /// windows. To be told anew before each showing.
+    virtual void prepareToShow(QWindow &window, const WindowStanding &standing);
+    /// Ends what the two above have begun for `window`, which may be gone.
+    virtual void forget(WId window);
 
     /// Whether the desktop itself can keep a window out of captures of the screen.
     [[nodiscard]] virtual bool keepsWindowsOutOfCaptures() const;
@@ -57,8 +62,11 @@ public:
     /// Lets the user resize `window` only to content of the shape `content`; any shape where that
     /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);
+    /// Says that `content` is the only size of `window`, so that nobody else resizes it; any size
+    /// again where that is empty.
+    virtual void keepContentSize(QWindow &window, const QSize &content);
     /// Applies what the desktop can do of `attributes` once `window` is on the screen, such as
-    /// showing it on every virtual desktop or keeping it out of captures.
+    /// keeping it out of captures.
     virtual void applyAttributes(QWindow &window, const WindowAttributes &attributes);
 };
 

@@ -25,11 +25,9 @@ constexpr std::size_t mostAspect = 13;
 
 } // namespace
 
-X11FrameFollower::X11FrameFollower(
-    xcb_connection_t *connection, xcb_window_t root, xcb_atom_t extents)
-    : m_connection(connection)
-    , m_root(root)
-    , m_extents(extents)
+X11FrameFollower::X11FrameFollower(const X11Client &client)
+    : m_client(client)
+    , m_extents(client.atom("_NET_FRAME_EXTENTS"))
 {
     QCoreApplication::instance()->installNativeEventFilter(this);
 }
@@ -92,7 +90,8 @@ void X11FrameFollower::onReparented(const xcb_reparent_notify_event_t &event)
     Followed *const followed = find(event.window);
     if (!followed)
         return;
-    followed->frame = event.parent == m_root ? XCB_NONE : childOfRootAround(event.parent);
+    followed->frame
+        = event.parent == m_client.root() ? XCB_NONE : m_client.childOfRootAround(event.parent);
     if (followed->frame == XCB_NONE) {
         followed->listener(std::nullopt);
         return;
@@ -105,7 +104,7 @@ void X11FrameFollower::onReparented(const xcb_reparent_notify_event_t &event)
 void X11FrameFollower::listenTo(const Followed &followed) const
 {
     const std::uint32_t mask = XCB_EVENT_MASK_STRUCTURE_NOTIFY; // each client has its own
-    xcb_change_window_attributes(m_connection, followed.frame, XCB_CW_EVENT_MASK, &mask);
+    xcb_change_window_attributes(m_client.connection(), followed.frame, XCB_CW_EVENT_MASK, &mask);
 }
 
 // The content lies as far inside what is seen as its borders are wide; whatever lies outside of
@@ -114,25 +113,23 @@ void X11FrameFollower::listenTo(const Followed &followed) const
 // then moves that, of which the window is told nothing.
 void X11FrameFollower::measure(Followed &followed) const
 {
-    const auto extents
-        = xcb_get_property(m_connection, 0, followed.window, m_extents, XCB_ATOM_CARDINAL, 0, 4);
     const auto place
-        = xcb_translate_coordinates(m_connection, followed.window, followed.frame, 0, 0);
-    const auto told = owned(xcb_get_property_reply(m_connection, extents, nullptr));
-    const auto content = owned(xcb_translate_coordinates_reply(m_connection, place, nullptr));
+        = xcb_translate_coordinates(m_client.connection(), followed.window, followed.frame, 0, 0);
+    // left, right, top, bottom
+    const auto borders = m_client.numbers(followed.window, m_extents, XCB_ATOM_CARDINAL, 4);
+    const auto content
+        = owned(xcb_translate_coordinates_reply(m_client.connection(), place, nullptr));
     followed.inset = QPoint();
-    if (!told || told->format != 32 || told->value_len != 4 || !content)
+    if (borders.size() != 4 || !content)
         return;
-    std::array<std::uint32_t, 4> borders {}; // left, right, top, bottom
-    std::memcpy(borders.data(), xcb_get_property_value(told.get()), sizeof borders);
     followed.inset = QPoint(std::max(0, content->dst_x - static_cast<int>(borders[0])),
         std::max(0, content->dst_y - static_cast<int>(borders[2])));
 }
 
 void X11FrameFollower::tellCorner(const Followed &followed) const
 {
-    const auto cookie = xcb_get_geometry(m_connection, followed.frame);
-    const auto reply = owned(xcb_get_geometry_reply(m_connection, cookie, nullptr));
+    const auto cookie = xcb_get_geometry(m_client.connection(), followed.frame);
+    const auto reply = owned(xcb_get_geometry_reply(m_client.connection(), cookie, nullptr));
     if (reply)
         followed.listener(QPoint(reply->x, reply->y) + followed.inset);
 }
@@ -182,9 +179,9 @@ void X11FrameFollower::onPropertyChanged(const xcb_property_notify_event_t &even
 
 void X11FrameFollower::writeContentRatio(const Followed &followed) const
 {
-    const auto cookie = xcb_get_property(m_connection, 0, followed.window, XCB_ATOM_WM_NORMAL_HINTS,
-        XCB_ATOM_WM_SIZE_HINTS, 0, sizeHintsLength);
-    const auto reply = owned(xcb_get_property_reply(m_connection, cookie, nullptr));
+    const auto cookie = xcb_get_property(m_client.connection(), 0, followed.window,
+        XCB_ATOM_WM_NORMAL_HINTS, XCB_ATOM_WM_SIZE_HINTS, 0, sizeHintsLength);
+    const auto reply = owned(xcb_get_property_reply(m_client.connection(), cookie, nullptr));
     if (!reply)
         return;
     std::array<std::uint32_t, sizeHintsLength> hints {};
@@ -203,22 +200,9 @@ void X11FrameFollower::writeContentRatio(const Followed &followed) const
     }
     if (wanted == hints) // the event told of our own change
         return;
-    xcb_change_property(m_connection, XCB_PROP_MODE_REPLACE, followed.window,
+    xcb_change_property(m_client.connection(), XCB_PROP_MODE_REPLACE, followed.window,
         XCB_ATOM_WM_NORMAL_HINTS, XCB_ATOM_WM_SIZE_HINTS, 32, sizeHintsLength, wanted.data());
-    xcb_flush(m_connection);
-}
-
-xcb_window_t X11FrameFollower::childOfRootAround(xcb_window_t window) const
-{
-    for (;;) {
-        const auto cookie = xcb_query_tree(m_connection, window);
-        const auto reply = owned(xcb_query_tree_reply(m_connection, cookie, nullptr));
-        if (!reply || reply->parent == XCB_NONE)
-            return XCB_NONE;
-        if (reply->parent == m_root)
-            return window;
-        window = reply->parent;
-    }
+    xcb_flush(m_client.connection());
 }
 
 } // namespace penwick::platform

@@ -7,11 +7,10 @@
 #pragma once
 
 #include "platform/native/NativeDesktop.h"
+#include "platform/native/X11Client.h"
 
 #include <QAbstractNativeEventFilter>
 #include <QSize>
-
-#include <xcb/xcb.h>
 
 #include <vector>
 
@@ -22,8 +21,8 @@ namespace penwick::platform {
 class X11FrameFollower final : public QAbstractNativeEventFilter
 {
 public:
-    /// `extents` is the atom of a window's property with the borders that are seen around it.
-    X11FrameFollower(xcb_connection_t *connection, xcb_window_t root, xcb_atom_t extents);
+    /// Borrows `client`, which must live longer.
+    explicit X11FrameFollower(const X11Client &client);
     ~X11FrameFollower() override;
 
     void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
@@ -47,7 +46,6 @@ private:
     };
 
     [[nodiscard]] Followed *find(xcb_window_t window);
-    [[nodiscard]] xcb_window_t childOfRootAround(xcb_window_t window) const;
     void onBordersChanged(Followed &followed);
     void listenTo(const Followed &followed) const;
     void measure(Followed &followed) const;
@@ -58,9 +56,8 @@ private:
     void onConfigured(const xcb_configure_notify_event_t &event);
     [[nodiscard]] bool isFocusOfAGrab(const xcb_focus_in_event_t &event);
 
-    xcb_connection_t *const m_connection;
-    const xcb_window_t m_root;
-    const xcb_atom_t m_extents;
+    const X11Client &m_client;
+    const xcb_atom_t m_extents; // the property with the borders that are seen around a window
     std::vector<Followed> m_followed;
 };
 

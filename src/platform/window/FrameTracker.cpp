@@ -30,7 +30,7 @@ FrameTracker::FrameTracker(QWidget &window)
 
 FrameTracker::~FrameTracker()
 {
-    NativeDesktop::instance().forgetFrame(m_followed);
+    NativeDesktop::instance().forget(m_followed);
 }
 
 Rect FrameTracker::frame() const
@@ -77,6 +77,9 @@ void FrameTracker::prepareToShow()
         = m_negotiation.appear(margins, native.devicePixelRatio(), Clock::ofTheDesktop().now());
     followFrame();
     carryOut(effects);
+    // The toolkit tells the window manager a corner only if it has changed. One that was not told
+    // is the window manager's to choose.
+    native.setPosition(m_window.geometry().topLeft());
     awaitNextLook();
 }
 
@@ -96,7 +99,7 @@ void FrameTracker::followFrame()
     QWindow &native = *m_window.windowHandle();
     const WId former = std::exchange(m_followed, native.winId());
     if (former != m_followed)
-        NativeDesktop::instance().forgetFrame(former);
+        NativeDesktop::instance().forget(former);
     connect(&native, &QWindow::screenChanged, this, &FrameTracker::lookSoon, Qt::UniqueConnection);
     NativeDesktop::instance().followFrame(native, [this](std::optional<QPoint> corner) {
         m_negotiation.hearCorner(corner, Clock::ofTheDesktop().now());

@@ -37,6 +37,15 @@ std::optional<Size> keptRatio(const WindowAttributes &attributes)
     return isResizable ? attributes.aspectRatio : std::nullopt;
 }
 
+// What `window` stands above in the end; null if it stands above nothing.
+Window *outermostBelow(const Window &window)
+{
+    Window *outermost = window.parentWindow();
+    while (outermost && outermost->parentWindow())
+        outermost = outermost->parentWindow();
+    return outermost;
+}
+
 } // namespace
 
 WindowDelegate::~WindowDelegate() = default;
@@ -127,6 +136,7 @@ void Window::applyAttributes()
 {
     d->captures.setLeftOut(isLeftOut(m_attributes));
     d->shape->setRatio(keptRatio(m_attributes));
+    d->shape->setResizable(m_attributes.styleMask.testFlag(StyleMask::resizable));
     d->content.setBackgroundColor(m_attributes.backgroundColor);
     setAttribute(Qt::WA_TranslucentBackground, !m_attributes.isOpaque);
     setAttribute(Qt::WA_ShowWithoutActivating, !canBecomeKey(m_attributes));
@@ -138,6 +148,15 @@ void Window::applyAttributes()
             show();
     }
     update();
+}
+
+void Window::standAmongOthers()
+{
+    Window *const outermost = outermostBelow(*this);
+    const WindowStanding standing
+        = standingOf(m_attributes, outermost ? &outermost->m_attributes : nullptr);
+    NativeDesktop::instance().prepareToShow(*windowHandle(), standing);
+    d->layerCall.listen(*windowHandle(), standing.isUnmanaged ? outermost : nullptr);
 }
 
 bool Window::showsWhatIsBelow() const
@@ -238,6 +257,7 @@ void Window::setVisible(bool visible)
         // but a window may outlive the one that it stands above.
         windowHandle()->setTransientParent(
             parentWindow() ? parentWindow()->windowHandle() : nullptr);
+        standAmongOthers();
     }
     QWidget::setVisible(visible);
     if (!visible)

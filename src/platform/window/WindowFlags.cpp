@@ -15,6 +15,11 @@ bool hasVisibleTitleBar(const WindowAttributes &attributes)
         && attributes.titleVisibility == TitleVisibility::hidden);
 }
 
+bool isLayer(const WindowAttributes &attributes)
+{
+    return canBecomeKey(attributes) && attributes.level > WindowLevel::normal;
+}
+
 } // namespace
 
 bool canBecomeKey(const WindowAttributes &attributes)
@@ -43,6 +48,17 @@ Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes)
     if (attributes.ignoresMouseEvents)
         flags |= Qt::WindowTransparentForInput;
     return flags;
+}
+
+WindowStanding standingOf(const WindowAttributes &attributes, const WindowAttributes *outermost)
+{
+    WindowStanding standing;
+    standing.isOnAllDesktops
+        = attributes.collectionBehavior.testFlag(CollectionBehavior::canJoinAllSpaces);
+    standing.isPanel = !canBecomeKey(attributes);
+    standing.isLayer = isLayer(attributes);
+    standing.isUnmanaged = standing.isPanel && outermost && isLayer(*outermost);
+    return standing;
 }
 
 } // namespace penwick::platform

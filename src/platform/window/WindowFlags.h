@@ -2,6 +2,8 @@
 // What a window's attributes mean in Qt's words.
 #pragma once
 
+#include "platform/native/WindowStanding.h"
+
 #include <penwick/platform/WindowAttributes.h>
 
 #include <Qt>
@@ -17,5 +19,11 @@ constexpr CollectionBehaviors everywhere
 
 /// The window flags, its type included, that `attributes` ask for.
 [[nodiscard]] Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes);
+
+/// How a window with `attributes` stands among others. `outermost` is what the last one is like
+/// below it, going from each window to the one that it stands above; null where it stands above
+/// none.
+[[nodiscard]] WindowStanding standingOf(
+    const WindowAttributes &attributes, const WindowAttributes *outermost);
 
 } // namespace penwick::platform

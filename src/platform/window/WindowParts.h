@@ -6,6 +6,7 @@
 #include "platform/window/CaptureExclusion.h"
 #include "platform/window/FrameTracker.h"
 #include "platform/window/Glide.h"
+#include "platform/window/LayerCall.h"
 #include "platform/window/WindowBackdrop.h"
 #include "platform/window/WindowContent.h"
 #include "platform/window/WindowFamily.h"
@@ -35,6 +36,7 @@ public:
     WindowFamily family;
     WindowBackdrop backdrop;
     BackgroundDrag drag;
+    LayerCall layerCall;
     bool isClosed = false;
     bool isMain = false;
     bool isMinimised = false;

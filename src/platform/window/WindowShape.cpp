@@ -8,6 +8,7 @@
 #include "platform/window/WorkArea.h"
 
 #include <QWidget>
+#include <QWindow>
 
 #include <cmath>
 #include <utility>
@@ -55,13 +56,23 @@ WindowShape::WindowShape(QWidget &window, FrameTracker &tracker)
 // still be asked for.
 void WindowShape::keep(const QSize &content)
 {
-    if (!m_window.windowHandle())
+    QWindow *const window = m_window.windowHandle();
+    if (!window)
         return;
+    if (!m_isResizable)
+        NativeDesktop::instance().keepContentSize(*window, content);
     const QSize frame = content.grownBy(m_tracker.margins());
     const bool hasRatio
         = m_ratio && std::abs(heightFor(frame.width(), *m_ratio) - frame.height()) < 1.0;
-    NativeDesktop::instance().keepContentRatio(
-        *m_window.windowHandle(), hasRatio ? content : QSize());
+    NativeDesktop::instance().keepContentRatio(*window, hasRatio ? content : QSize());
+}
+
+void WindowShape::setResizable(bool isResizable)
+{
+    if (std::exchange(m_isResizable, isResizable) == isResizable || !m_window.windowHandle())
+        return;
+    NativeDesktop::instance().keepContentSize(
+        *m_window.windowHandle(), isResizable ? QSize() : m_window.size());
 }
 
 // Whether the desktop decides the window's size. The size before comes back afterwards.

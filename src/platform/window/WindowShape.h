@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Keeps a window's shape while the user resizes it.
+// Keeps a window's shape while the user resizes it, or its size where the user may not.
 #pragma once
 
 #include <penwick/platform/Geometry.h>
@@ -24,6 +24,9 @@ public:
 
     /// The width and height of the shape to be kept; nothing leaves the window alone.
     void setRatio(const std::optional<Size> &ratio) { m_ratio = ratio; }
+    /// Whether the user may resize the window at all. Where not, the desktop is told that the size
+    /// that was asked for is the only one.
+    void setResizable(bool isResizable);
 
 Q_SIGNALS:
     /// The window is to have `frame` instead of the one that its user has given it.
@@ -42,6 +45,7 @@ private:
     QWidget &m_window;
     FrameTracker &m_tracker;
     std::optional<Size> m_ratio;
+    bool m_isResizable = true;
     Rect m_before; // the frame that the user began to pull; empty before the first one
     bool m_isPulled = false; // by the user; otherwise the desktop has chosen another size
     bool m_isByHand = false; // the pointer was held during the pull

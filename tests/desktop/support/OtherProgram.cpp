@@ -26,11 +26,10 @@ OtherProgram::OtherProgram(Desktop &desktop, const QRect &area, const QColor &co
     hints.flags = USPosition | USSize | PWinGravity;
     hints.win_gravity = StaticGravity; // the content where it was asked for, not the title bar
     XSetWMNormalHints(display, m_window, &hints);
-    if (kind == Kind::Dock) {
-        const Atom dock = m_connection->atom("_NET_WM_WINDOW_TYPE_DOCK");
-        XChangeProperty(display, m_window, m_connection->atom("_NET_WM_WINDOW_TYPE"), XA_ATOM, 32,
-            PropModeReplace, reinterpret_cast<const unsigned char *>(&dock), 1);
-    }
+    if (kind == Kind::Dock)
+        say("_NET_WM_WINDOW_TYPE", "_NET_WM_WINDOW_TYPE_DOCK");
+    if (kind == Kind::FullScreen)
+        say("_NET_WM_STATE", "_NET_WM_STATE_FULLSCREEN");
     XSelectInput(display, m_window, ButtonPressMask);
     XMapWindow(display, m_window);
     const QPoint middle = area.center();
@@ -44,6 +43,13 @@ OtherProgram::OtherProgram(Desktop &desktop, const QRect &area, const QColor &co
 }
 
 OtherProgram::~OtherProgram() = default;
+
+void OtherProgram::say(const char *property, const char *what)
+{
+    const Atom value = m_connection->atom(what);
+    XChangeProperty(m_connection->display(), m_window, m_connection->atom(property), XA_ATOM, 32,
+        PropModeReplace, reinterpret_cast<const unsigned char *>(&value), 1);
+}
 
 QRect OtherProgram::area() const
 {

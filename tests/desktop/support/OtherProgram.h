@@ -22,7 +22,8 @@ public:
     enum class Kind
     {
         Ordinary, ///< with a title bar around it
-        Dock ///< a panel of the desktop, above ordinary windows
+        Dock, ///< a panel of the desktop, above ordinary windows
+        FullScreen ///< the window manager makes it as large as the screen
     };
 
     /// Opens the window with its content at `area` and returns once it is shown.
@@ -41,6 +42,8 @@ public:
     void raise();
 
 private:
+    void say(const char *property, const char *what);
+
     Desktop &m_desktop;
     const std::unique_ptr<XConnection> m_connection;
     WindowId m_window = 0;

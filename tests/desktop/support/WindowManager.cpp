@@ -21,7 +21,9 @@ const std::array<ManagerTraits, 5> &allTraits()
 {
     static const std::array<ManagerTraits, 5> traits {
         ManagerTraits { .name = "none" },
-        ManagerTraits { .name = "openbox", .command = { "openbox", "--sm-disable" } },
+        ManagerTraits { .name = "openbox",
+            .command = { "openbox", "--sm-disable" },
+            .hasFullScreenAboveAll = true },
         ManagerTraits {
             .name = "xfwm4", .command = { "xfwm4", "--compositor=off" }, .needsBus = true },
         // It paints with OpenGL, also what it composes, and a private server has no graphics card.

@@ -25,6 +25,8 @@ struct ManagerTraits
     std::vector<std::string> command = {}; ///< nothing for no window manager
     bool needsBus = false; ///< does not start, or has no settings, without a session bus
     bool composes = false; ///< is a compositing manager itself, from its start to its end
+    bool hasFullScreenAboveAll
+        = false; ///< what has the keys and fills the screen is above all else
     bool hasInvisibleBorders = false; ///< its frames' windows are larger than what is seen of them
     QMargins grips = {}; ///< how far outside the frame that is seen a hand takes it, pixels
     std::vector<std::string> environment = {}; ///< "NAME=value", beside the desktop's own

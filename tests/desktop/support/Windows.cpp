@@ -13,6 +13,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <iterator>
 #include <memory>
 #include <utility>
 
@@ -90,6 +91,11 @@ QRect rectangleOf(const XConnection &connection, Window window)
     return { x, y, attributes.width + 2 * border, attributes.height + 2 * border };
 }
 
+bool numbersBegin(const std::vector<unsigned long> &numbers, unsigned long first)
+{
+    return !numbers.empty() && numbers.front() == first;
+}
+
 // Both sorts of extents are told in the order left, right, top, bottom.
 QMargins marginsFrom(const std::vector<unsigned long> &extents)
 {
@@ -110,18 +116,19 @@ std::vector<WindowId> Windows::stackingOrder() const
     const std::vector<Window> frames = familyOf(m_connection, root()).children;
     // Each is asked for once: a window may go while they are sorted.
     std::vector<std::pair<std::ptrdiff_t, WindowId>> byHeight;
-    std::vector<WindowId> managed = numbers(root(), "_NET_CLIENT_LIST");
-    if (!areManaged()) {
-        managed.assign(frames.begin(), frames.end());
-        std::erase_if(managed, [this](WindowId window) { return !isShown(window); });
-    }
-    for (const WindowId window : managed) {
+    std::vector<WindowId> windows;
+    const bool hasManager = areManaged();
+    if (hasManager)
+        windows = numbers(root(), "_NET_CLIENT_LIST");
+    std::copy_if(frames.begin(), frames.end(), std::back_inserter(windows),
+        [&](Window window) { return isShown(window) && (!hasManager || isUnmanaged(window)); });
+    for (const WindowId window : windows) {
         const auto place = std::find(frames.begin(), frames.end(), frameOf(m_connection, window));
         byHeight.emplace_back(place - frames.begin(), window);
     }
     std::stable_sort(byHeight.begin(), byHeight.end(),
         [](const auto &one, const auto &other) { return one.first < other.first; });
-    std::vector<WindowId> windows;
+    windows.clear();
     for (const auto &[height, window] : byHeight)
         windows.push_back(window);
     return windows;
@@ -169,6 +176,19 @@ bool Windows::areManaged() const
     const std::vector<unsigned long> check = numbers(root(), announcement);
     return check.size() == 1 && numbers(check.front(), announcement) == check
         && !numbers(root(), "_NET_SUPPORTED").empty();
+}
+
+// Whether a program, which is not the window manager, has asked the latter to leave alone this
+// child of the root.
+bool Windows::isUnmanaged(WindowId window) const
+{
+    XWindowAttributes attributes {};
+    if (!XGetWindowAttributes(m_connection.display(), window, &attributes)
+        || !attributes.override_redirect)
+        return false;
+    const std::vector<unsigned long> check = numbers(root(), "_NET_SUPPORTING_WM_CHECK");
+    const std::vector<unsigned long> process = numbers(window, "_NET_WM_PID");
+    return !process.empty() && (check.empty() || numbers(check.front(), "_NET_WM_PID") != process);
 }
 
 bool Windows::canTellFrames() const
@@ -268,6 +288,15 @@ void Windows::cutOff(WindowId window)
 
 void Windows::switchToDesktop(unsigned long number)
 {
+    const char *const count = "_NET_NUMBER_OF_DESKTOPS";
+    const auto hasDesktop = [&] {
+        const std::vector<unsigned long> desktops = numbers(root(), count);
+        return desktops.size() == 1 && desktops.front() > number;
+    };
+    if (!hasDesktop()) {
+        ask(root(), count, static_cast<long>(number) + 1, 0);
+        require(hasDesktop, "one more virtual desktop");
+    }
     ask(root(), "_NET_CURRENT_DESKTOP", static_cast<long>(number), CurrentTime);
     require(
         [&] {
@@ -294,7 +323,9 @@ bool Windows::isShown(WindowId window) const
 {
     XWindowAttributes attributes {};
     return XGetWindowAttributes(m_connection.display(), window, &attributes)
-        && attributes.map_state == IsViewable;
+        && attributes.map_state == IsViewable
+        // One that composes keeps what it does not show in the server, for its small pictures.
+        && !numbersBegin(numbers(window, "WM_STATE"), IconicState);
 }
 
 } // namespace penwick::desktop

@@ -30,8 +30,8 @@ public:
     /// Borrows `connection`, which must live longer.
     explicit Windows(const XConnection &connection, FrameBorders borders = FrameBorders::Visible);
 
-    /// Windows that the window manager manages, the undermost first; without one, those that are
-    /// shown.
+    /// Windows that the window manager manages, and those that a program shows without it, the
+    /// undermost first; without a window manager all that are shown.
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
     /// What programs show without the window manager, such as menus; screen pixels from the top
     /// left. The manager's own windows have no class.
@@ -68,11 +68,13 @@ public:
     /// Takes the connection to the server away from the program whose window it is.
     void cutOff(WindowId window);
     /// Goes to another virtual desktop, counted from 0, and returns once it is the present one.
+    /// Where there are fewer it asks for more.
     void switchToDesktop(unsigned long number);
-    /// Whether the server shows the window, be it covered or not.
+    /// Whether the window is on the screen, be it covered or not.
     [[nodiscard]] bool isShown(WindowId window) const;
 
 private:
+    [[nodiscard]] bool isUnmanaged(WindowId window) const;
     void ask(WindowId window, const char *what, long first, long second);
 
     const XConnection &m_connection;

@@ -1,0 +1,188 @@
+// SPDX-License-Identifier: MIT
+#include "platform/native/X11Standing.h"
+
+#include <QCoreApplication>
+
+#include <algorithm>
+#include <utility>
+
+namespace penwick::platform {
+
+namespace {
+
+constexpr std::uint32_t allDesktops = 0xFFFFFFFF;
+
+constexpr std::uint8_t sentByAnotherClient = 0x80;
+constexpr std::uint32_t moreStatesThanThereAre = 64;
+
+} // namespace
+
+X11Standing::X11Standing(const X11Client &client)
+    : m_client(client)
+    , m_desktop(client.atom("_NET_WM_DESKTOP"))
+    , m_type(client.atom("_NET_WM_WINDOW_TYPE"))
+    , m_iconState(client.atom("WM_STATE"))
+    , m_state(client.atom("_NET_WM_STATE"))
+    , m_hidden(client.atom("_NET_WM_STATE_HIDDEN"))
+{
+    QCoreApplication::instance()->installNativeEventFilter(this);
+}
+
+X11Standing::~X11Standing() = default;
+
+void X11Standing::prepare(xcb_window_t window, const WindowStanding &standing)
+{
+    const std::uint32_t overrideRedirect = standing.isUnmanaged ? 1 : 0;
+    xcb_change_window_attributes(
+        m_client.connection(), window, XCB_CW_OVERRIDE_REDIRECT, &overrideRedirect);
+    if (standing.isPanel || standing.isLayer)
+        writeTypes(window, standing);
+    // Openbox takes a panel's parent along when the panel is asked to be on all desktops, so the
+    // panel has to be so from the beginning.
+    if (standing.isOnAllDesktops)
+        m_client.setNumbers(window, m_desktop, XCB_ATOM_CARDINAL, { allDesktops });
+    forget(window);
+    m_prepared.push_back({ window, standing, standing.isOnAllDesktops });
+}
+
+// The first that a window manager knows counts. Of the types that KWin keeps above the active full
+// screen, the one for urgent notes may get the keys and stays where it was put. A panel is a
+// dialog, although the toolkit calls it a utility window: KWin hides those of a program that is not
+// the active one.
+void X11Standing::writeTypes(xcb_window_t window, const WindowStanding &standing) const
+{
+    const xcb_atom_t own
+        = m_client.atom(standing.isLayer ? "_KDE_NET_WM_WINDOW_TYPE_CRITICAL_NOTIFICATION"
+                                         : "_NET_WM_WINDOW_TYPE_DIALOG");
+    const xcb_atom_t withoutBorders = m_client.atom("_KDE_NET_WM_WINDOW_TYPE_OVERRIDE");
+    m_client.setNumbers(window, m_type, XCB_ATOM_ATOM,
+        { own, withoutBorders, m_client.atom("_NET_WM_WINDOW_TYPE_NORMAL") });
+}
+
+void X11Standing::forget(xcb_window_t window)
+{
+    std::erase_if(m_prepared, [window](const Prepared &each) { return each.window == window; });
+}
+
+X11Standing::Prepared *X11Standing::find(xcb_window_t window)
+{
+    const auto found = std::ranges::find(m_prepared, window, &Prepared::window);
+    return found == m_prepared.end() ? nullptr : &*found;
+}
+
+bool X11Standing::nativeEventFilter(const QByteArray &eventType, void *message, qintptr *)
+{
+    if (eventType != QByteArrayLiteral("xcb_generic_event_t"))
+        return false;
+    const auto *const event = static_cast<const xcb_generic_event_t *>(message);
+    switch (event->response_type & ~sentByAnotherClient) {
+    case XCB_CONFIGURE_NOTIFY:
+        onStacked(*static_cast<const xcb_configure_notify_event_t *>(message));
+        return false;
+    case XCB_REPARENT_NOTIFY:
+        onReparented(*static_cast<const xcb_reparent_notify_event_t *>(message));
+        return false;
+    case XCB_PROPERTY_NOTIFY:
+        return onPropertyChanged(*static_cast<const xcb_property_notify_event_t *>(message));
+    default:
+        return false;
+    }
+}
+
+bool X11Standing::onPropertyChanged(const xcb_property_notify_event_t &event)
+{
+    Prepared *const prepared = find(event.window);
+    if (!prepared)
+        return false;
+    if (event.atom == m_desktop && prepared->awaitsDesktop)
+        onDesktopTold(*prepared);
+    if (event.atom == m_iconState || event.atom == m_state)
+        return onStateTold(*prepared, event.atom);
+    return false;
+}
+
+// Nobody but this keeps unmanaged panels above their layer when a window manager raises that, goes,
+// or comes back.
+void X11Standing::onStacked(const xcb_configure_notify_event_t &event) const
+{
+    const bool isLayers = std::ranges::any_of(m_prepared, [&event](const Prepared &each) {
+        return each.standing.isLayer && (each.window == event.window || each.frame == event.window);
+    });
+    if (isLayers)
+        raisePanels();
+}
+
+void X11Standing::onReparented(const xcb_reparent_notify_event_t &event)
+{
+    Prepared *const prepared = find(event.window);
+    if (!prepared || !prepared->standing.isLayer)
+        return;
+    prepared->frame = m_client.childOfRootAround(event.window);
+    raisePanels();
+}
+
+// From those that were shown first to those that were shown over them.
+void X11Standing::raisePanels() const
+{
+    constexpr std::uint32_t above = XCB_STACK_MODE_ABOVE;
+    for (const Prepared &each : m_prepared) {
+        if (each.standing.isUnmanaged)
+            xcb_configure_window(
+                m_client.connection(), each.window, XCB_CONFIG_WINDOW_STACK_MODE, &above);
+    }
+    xcb_flush(m_client.connection());
+}
+
+// Some window managers put the window on one desktop although it said all, and have to be asked
+// once it is there. Mutter has noted what it said, and does nothing when it is asked for that; it
+// forgets it when it is asked for the one desktop.
+void X11Standing::onDesktopTold(Prepared &prepared) const
+{
+    const auto told = m_client.numbers(prepared.window, m_desktop, XCB_ATOM_CARDINAL, 1);
+    if (told.size() != 1 || told.front() == allDesktops)
+        return;
+    prepared.awaitsDesktop = false;
+    for (const std::uint32_t wanted : { told.front(), allDesktops })
+        m_client.askManager(prepared.window, m_desktop, wanted);
+}
+
+// Mutter and KWin call a window iconic that is on a virtual desktop which is not shown. The toolkit
+// would take it for minimised, and the panels that are on all desktops would go with it. A
+// minimised one is said to be hidden as well, be it before or after. Returns whether the toolkit is
+// not to hear of it.
+bool X11Standing::onStateTold(Prepared &prepared, xcb_atom_t property) const
+{
+    const bool isElsewhere = isIconic(prepared.window) && !isSaidToBeHidden(prepared.window)
+        && m_client.managerSupports(m_hidden);
+    if (std::exchange(prepared.isElsewhere, isElsewhere) && !isElsewhere && property == m_state)
+        letToolkitLook(prepared.window);
+    return isElsewhere && property == m_iconState;
+}
+
+// The toolkit looks at a property when it is told that it has changed.
+void X11Standing::letToolkitLook(xcb_window_t window) const
+{
+    xcb_property_notify_event_t event {};
+    event.response_type = XCB_PROPERTY_NOTIFY;
+    event.window = window;
+    event.atom = m_iconState;
+    event.state = XCB_PROPERTY_NEW_VALUE;
+    xcb_send_event(m_client.connection(), 0, window, XCB_EVENT_MASK_PROPERTY_CHANGE,
+        reinterpret_cast<const char *>(&event));
+    xcb_flush(m_client.connection());
+}
+
+bool X11Standing::isIconic(xcb_window_t window) const
+{
+    constexpr std::uint32_t iconic = 3;
+    const auto told = m_client.numbers(window, m_iconState, m_iconState, 1);
+    return told.size() == 1 && told.front() == iconic;
+}
+
+bool X11Standing::isSaidToBeHidden(xcb_window_t window) const
+{
+    const auto states = m_client.numbers(window, m_state, XCB_ATOM_ATOM, moreStatesThanThereAre);
+    return std::ranges::find(states, m_hidden) != states.end();
+}
+
+} // namespace penwick::platform
