@@ -12,6 +12,14 @@ namespace {
 class CandidatesTest : public InputMethodTest
 {
 protected:
+    void dragBoard()
+    {
+        const QPoint before = canvas().topLeft();
+        const QPoint title = before + QPoint(400, -10);
+        desktop().pointer().drag({ title, title + QPoint(40, 25), title + QPoint(80, 50) });
+        require([&] { return canvas().topLeft() != before; }, "the board to move");
+    }
+
     /// Whether the list stands right above or below the caret that it is for.
     testing::AssertionResult stands(const QRect &list)
     {
@@ -106,15 +114,30 @@ TEST_P(CandidatesTest, standBesideTheCaretAfterTheBoardWasMoved)
     type("a");
     press("Return");
     ASSERT_TRUE(comesToHold("あ", ""));
-    const QPoint before = canvas().topLeft();
-    const QPoint title = before + QPoint(400, -10);
-    desktop().pointer().drag({ title, title + QPoint(40, 25), title + QPoint(80, 50) });
-    require([&] { return canvas().topLeft() != before; }, "the board to move");
+    dragBoard();
 
     type("kanji");
     ASSERT_TRUE(comesToHold("あ", "かんじ"));
 
     EXPECT_TRUE(stands(askForCandidates()));
+}
+
+TEST_P(CandidatesTest, goWithTheBoardWhenItIsMoved)
+{
+    makeBoxToCompose();
+    type("kanji");
+    ASSERT_TRUE(comesToHold("", "かんじ"));
+    static_cast<void>(askForCandidates());
+
+    dragBoard();
+    if (GetParam() == InputMethodKind::Ibus)
+        press("space"); // it shows the list at the new place with the next key
+
+    EXPECT_TRUE(waitUntil([&] {
+        const std::vector<QRect> areas = desktop().windows().unmanaged();
+        return areas.size() == 1 && stands(areas.front());
+    }));
+    EXPECT_FALSE(host().writing().composed.isEmpty());
 }
 
 TEST_P(CandidatesTest, standAboveTheLayer)

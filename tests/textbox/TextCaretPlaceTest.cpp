@@ -4,6 +4,7 @@
 
 #include <QInputMethod>
 #include <QInputMethodEvent>
+#include <QMoveEvent>
 #include <QScrollBar>
 
 namespace penwick::test {
@@ -40,6 +41,27 @@ TEST_F(TextCaretPlaceTest, isInTheBox)
     QTest::keyClicks(box.get(), QStringLiteral("mm"));
     EXPECT_GT(told().x(), 50);
     EXPECT_EQ(told(), painted(*box));
+}
+
+TEST_F(TextCaretPlaceTest, isToldAgainWhenTheWindowHasMoved)
+{
+    const auto box = newBox();
+    int changes = 0;
+    const QObject context; // goes before what it counts in
+    QObject::connect(QGuiApplication::inputMethod(), &QInputMethod::cursorRectangleChanged,
+        &context, [&changes] { ++changes; });
+    QMoveEvent move(window.pos(), window.pos() - QPoint(40, 20));
+
+    QCoreApplication::sendEvent(&window, &move);
+    EXPECT_EQ(changes, 1);
+
+    QWidget other; // gets the keyboard
+    other.show();
+    other.activateWindow();
+    ASSERT_TRUE(QTest::qWaitFor([this] { return !window.isActiveWindow(); }));
+    changes = 0;
+    QCoreApplication::sendEvent(&window, &move);
+    EXPECT_EQ(changes, 0);
 }
 
 TEST_F(TextCaretPlaceTest, goesWithABoxThatMovesAwayFromAnEdgeAsItIsComposedIn)

@@ -8,6 +8,8 @@
 
 #include <QCloseEvent>
 #include <QCoreApplication>
+#include <QGuiApplication>
+#include <QInputMethod>
 #include <QPainter>
 
 #include <utility>
@@ -16,6 +18,9 @@ namespace penwick::platform {
 
 bool Window::event(QEvent *event)
 {
+    // An input method counts on the screen, and shows beside the caret what may be meant.
+    if (event->type() == QEvent::Move && isActiveWindow())
+        QGuiApplication::inputMethod()->update(Qt::ImCursorRectangle);
     const bool changesLook = isAboutLook(*event);
     const bool isHandled = QWidget::event(event);
     if (changesLook && keepOwnLook(*this)) // any other event may have destroyed the window
