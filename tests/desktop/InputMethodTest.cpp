@@ -67,21 +67,24 @@ TEST_P(InputMethodTest, keysThatChooseToolsChooseNoneWhileComposing)
 
 TEST_P(InputMethodTest, keysThatChooseToolsChooseThemBesideTheBox)
 {
-    constexpr QPoint ofItsBackground(-14, -14);
     const QPoint corner = makeBoxToCompose();
     type("be");
     press("Return");
     press("Return");
     ASSERT_TRUE(comesToBePlaced(corner));
     const QMap<QString, QPoint> buttons = toolBar().buttons;
-    desktop().pointer().click(buttons.value(QStringLiteral("brush")));
+    const auto comesToBeSelected = [&](const char *tool) {
+        const QPoint ofTheBackground(-14, -14);
+        const QPoint pixel = buttons.value(QLatin1String(tool)) + ofTheBackground;
+        return waitUntil([&] { return desktop().screen().pixel(pixel) == QColor(18, 168, 241); });
+    };
+    desktop().pointer().click(buttons.value(QStringLiteral("eraser")));
     desktop().pointer().moveTo(onScreen(farAway));
+    ASSERT_TRUE(comesToBeSelected("eraser"));
 
-    type("e");
+    type("b");
 
-    const QPoint eraser = buttons.value(QStringLiteral("eraser")) + ofItsBackground;
-    EXPECT_TRUE(
-        waitUntil([&] { return desktop().screen().pixel(eraser) == QColor(18, 168, 241); }));
+    EXPECT_TRUE(comesToBeSelected("brush"));
 }
 
 TEST_P(InputMethodTest, undoAndRedoTakeBackAndBringWhatWasComposed)
@@ -107,11 +110,9 @@ TEST_P(InputMethodTest, compositionIsTextOnceSomethingElseIsPressed)
 
     click(elsewhere);
     ASSERT_TRUE(comesToBePlaced(corner));
-    doubleClick(corner + QPoint(100, 15));
-    ASSERT_TRUE(comesToBeEdited(corner));
+    editAtTheBeginning(corner);
 
     EXPECT_TRUE(comesToHold("さくら", ""));
-    press("End");
     type("momo");
     EXPECT_TRUE(comesToHold("さくら", "もも")) << "nothing of the former one is left";
 }
@@ -136,15 +137,18 @@ TEST_P(InputMethodTest, conversionIsTextAsItIsShownOnceTheBoxIsLeft)
     const QPoint corner = makeBoxToCompose();
     type("kanji");
     ASSERT_TRUE(comesToHold("", "かんじ"));
-    static_cast<void>(askForCandidates());
-    const QString shown = host().writing().composed;
+    askForCandidates();
 
     click(elsewhere);
     ASSERT_TRUE(comesToBePlaced(corner));
     EXPECT_TRUE(areCandidatesGone());
     doubleClick(corner + QPoint(100, 15));
 
-    EXPECT_TRUE(comesToHold(qUtf8Printable(shown), ""));
+    ASSERT_TRUE(comesToBeEdited(corner));
+    const Writing writing = host().writing();
+    EXPECT_TRUE(writing.text == QStringLiteral("漢字") || writing.text == QStringLiteral("感じ"))
+        << writing.text.toStdString();
+    EXPECT_EQ(writing.composed, QString());
 }
 
 TEST_P(InputMethodTest, compositionStaysWhileAToolIsChosenWithThePointer)
@@ -224,7 +228,7 @@ TEST_P(InputMethodTest, sessionEndsInTheMiddleOfAComposition)
     makeBoxToCompose();
     type("kanji");
     ASSERT_TRUE(comesToHold("", "かんじ"));
-    static_cast<void>(askForCandidates());
+    askForCandidates();
 
     desktop().windows().close(window());
 

@@ -37,6 +37,16 @@ QPoint InputMethodTest::makeBoxToCompose(QPoint clicked)
     return corner;
 }
 
+void InputMethodTest::editAtTheBeginning(QPoint corner)
+{
+    constexpr QPoint ofTheText(5, newBoxSize.height() / 2);
+    doubleClick(corner + ofTheText + QPoint(60, 0));
+    require([&] { return isEdited(corner); }, "the box to be edited");
+    click(corner + ofTheText);
+    require([&] { return host().writing().caret.left() == onScreen(corner + ofTheText).x(); },
+        "the caret to stand before the text");
+}
+
 testing::AssertionResult InputMethodTest::comesToHold(const char *text, const char *composed)
 {
     Writing seen;
@@ -49,20 +59,18 @@ testing::AssertionResult InputMethodTest::comesToHold(const char *text, const ch
                                               << "\" and \"" << seen.composed.toStdString() << '"';
 }
 
-QRect InputMethodTest::askForCandidates()
+void InputMethodTest::askForCandidates()
+{
+    press("space");
+    press("space");
+    require([&] { return !candidates().isNull(); }, "a list of what may be meant");
+}
+
+QRect InputMethodTest::candidates()
 {
     constexpr int leastHeight = 100; // of some lines; the panel may show a mark before
-    press("space");
-    press("space");
-    QRect list;
-    require(
-        [&] {
-            const std::vector<QRect> areas = desktop().windows().unmanaged();
-            list = areas.size() == 1 ? areas.front() : QRect();
-            return list.height() > leastHeight;
-        },
-        "a list of what may be meant");
-    return list;
+    const std::vector<QRect> areas = desktop().windows().unmanaged();
+    return areas.size() == 1 && areas.front().height() > leastHeight ? areas.front() : QRect();
 }
 
 bool InputMethodTest::areCandidatesGone()

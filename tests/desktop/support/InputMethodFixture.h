@@ -18,13 +18,21 @@ protected:
 
     /// A box in which the next letter is composed; returns its corner.
     QPoint makeBoxToCompose(QPoint clicked = place);
+    /// Edits the box at `corner` once more, before the text that is in it.
+    ///
+    /// What is waited for is the caret: a window manager may hold a press back that keys overtake.
+    /// And a key would not do: fcitx5 hands back one that it does not want, and what is typed right
+    /// after it may be composed before.
+    void editAtTheBeginning(QPoint corner);
     void type(const char *letters) { desktop().keyboard().type(letters); }
     void press(const char *key) { desktop().keyboard().press(key); }
 
     /// Whether the box with the keyboard comes to have this text, and this composed in it.
     testing::AssertionResult comesToHold(const char *text, const char *composed);
-    /// Asks what may be meant, and returns where the list of it stands on the screen.
-    QRect askForCandidates();
+    /// Asks what may be meant, and returns once there is a list of it.
+    void askForCandidates();
+    /// Where the list stands on the screen; null if there is none.
+    [[nodiscard]] QRect candidates();
     [[nodiscard]] bool areCandidatesGone();
 
     /// Keeps a picture of the screen if the environment's PENWICK_PICTURES names a folder for it.
