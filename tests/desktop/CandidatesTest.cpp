@@ -147,7 +147,7 @@ TEST_P(CandidatesTest, goWithTheBoardWhenItIsMoved)
 TEST_P(CandidatesTest, standAboveTheLayer)
 {
     const OtherProgram sheet(desktop(), { 200, 100, 900, 600 }, Qt::white);
-    const QPoint onTheSheet = sheet.area().topLeft() + QPoint(200, 100);
+    constexpr QPoint onTheSheet(400, 250);
     desktop().startCompositor();
     host().steer(QStringLiteral("open annotation"));
     host().selectTool(QStringLiteral("text"));
