@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "desktop/support/InputMethodFixture.h"
 
+#include <algorithm>
+
 namespace penwick::desktop {
 
 namespace {
@@ -69,13 +71,19 @@ void InputMethodTest::askForCandidates()
 QRect InputMethodTest::candidates()
 {
     constexpr int leastHeight = 100; // of some lines; the panel may show a mark before
-    const std::vector<QRect> areas = desktop().windows().unmanaged();
-    return areas.size() == 1 && areas.front().height() > leastHeight ? areas.front() : QRect();
+    const std::vector<WindowId> own = desktop().windows().ofProcess(host().processId());
+    QRect found;
+    for (const WindowId list : desktop().windows().lists()) {
+        const QRect area = desktop().windows().clientArea(list);
+        if (std::find(own.begin(), own.end(), list) == own.end() && area.height() > leastHeight)
+            found = area;
+    }
+    return found;
 }
 
 bool InputMethodTest::areCandidatesGone()
 {
-    return waitUntil([&] { return desktop().windows().unmanaged().empty(); });
+    return waitUntil([this] { return candidates().isNull(); });
 }
 
 void InputMethodTest::keepPicture(const char *name)

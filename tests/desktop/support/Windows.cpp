@@ -134,19 +134,19 @@ std::vector<WindowId> Windows::stackingOrder() const
     return windows;
 }
 
-std::vector<QRect> Windows::unmanaged() const
+std::vector<WindowId> Windows::lists() const
 {
     constexpr int seenFrom = 20; // pixels; programs have smaller ones for their own ends
-    const std::vector<WindowId> managed = stackingOrder();
-    std::vector<QRect> areas;
+    std::vector<WindowId> found;
     for (const Window window : familyOf(m_connection, root()).children) {
-        const QRect area = rectangleOf(m_connection, window);
-        const bool isManaged = std::find(managed.begin(), managed.end(), window) != managed.end();
-        if (!isManaged && text(window, "WM_CLASS") && isShown(window) && area.width() >= seenFrom
-            && area.height() >= seenFrom)
-            areas.push_back(area);
+        XWindowAttributes attributes {};
+        if (XGetWindowAttributes(m_connection.display(), window, &attributes)
+            && attributes.override_redirect && attributes.map_state == IsViewable
+            && attributes.width >= seenFrom && attributes.height >= seenFrom
+            && text(window, "WM_CLASS"))
+            found.push_back(window);
     }
-    return areas;
+    return found;
 }
 
 QRect Windows::inFrontAt(QPoint place) const

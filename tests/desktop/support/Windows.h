@@ -33,9 +33,9 @@ public:
     /// Windows that the window manager manages, and those that a program shows without it, the
     /// undermost first; without a window manager all that are shown.
     [[nodiscard]] std::vector<WindowId> stackingOrder() const;
-    /// What programs show without the window manager, such as menus; screen pixels from the top
-    /// left. The manager's own windows have no class.
-    [[nodiscard]] std::vector<QRect> unmanaged() const;
+    /// Menus, lists and the like: what programs show without the window manager, whose own windows
+    /// have no class. Also those that tell no process.
+    [[nodiscard]] std::vector<WindowId> lists() const;
     /// The area of what is in front at a place of the screen, with its title bar.
     [[nodiscard]] QRect inFrontAt(QPoint place) const;
     /// Those of process `processId`, the undermost first.
