@@ -6,8 +6,6 @@
 #include <QMenu>
 #include <QTextEdit>
 
-#include <utility>
-
 namespace penwick {
 
 EditorHiding::EditorHiding(QTextEdit &editor)
@@ -32,7 +30,7 @@ bool EditorHiding::eventFilter(QObject *watched, QEvent *event)
     if (type == QEvent::Hide) {
         closeMenu();
         // Whatever else the drag is over would be told, if it were not over this.
-        if (std::exchange(m_isDraggedOver, false)) {
+        if (m_isDraggedOver) {
             QDragLeaveEvent leave;
             QCoreApplication::sendEvent(watched, &leave);
         }

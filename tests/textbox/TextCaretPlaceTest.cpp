@@ -43,6 +43,22 @@ TEST_F(TextCaretPlaceTest, isInTheBox)
     EXPECT_EQ(told(), painted(*box));
 }
 
+TEST_F(TextCaretPlaceTest, isToldBesideTheOtherEndOfASelectionAndTheText)
+{
+    const auto box = newBox();
+    QTest::keyClicks(box.get(), QStringLiteral("one two"));
+    QTest::keyClick(box.get(), Qt::Key_Home, Qt::ShiftModifier);
+    const QInputMethod &method = *QGuiApplication::inputMethod();
+
+    EXPECT_EQ(told(), painted(*box));
+    EXPECT_GT(method.anchorRectangle().left(), told().left() + 50);
+    EXPECT_EQ(method.anchorRectangle().top(), told().top());
+    EXPECT_EQ(method.anchorRectangle().width(), 2.0);
+    EXPECT_EQ(box->inputMethodQuery(Qt::ImSurroundingText), QVariant(QStringLiteral("one two")));
+    EXPECT_EQ(box->inputMethodQuery(Qt::ImCursorPosition), QVariant(0));
+    EXPECT_EQ(box->inputMethodQuery(Qt::ImAnchorPosition), QVariant(7));
+}
+
 TEST_F(TextCaretPlaceTest, isToldAgainWhenTheWindowHasMoved)
 {
     const auto box = newBox();
