@@ -307,7 +307,7 @@ void TextEditor::insertFromMimeData(const QMimeData *source)
 // editor's coordinates to the window's: the candidates stood in the corner of the window.
 QVariant TextEditor::inputMethodQuery(Qt::InputMethodQuery query) const
 {
-    const QVariant answer = ViewOf::inputMethodQuery(query);
+    QVariant answer = ViewOf::inputMethodQuery(query);
     if (query != Qt::ImCursorRectangle && query != Qt::ImAnchorRectangle)
         return answer;
     QRectF place = answer.toRectF();
