@@ -43,6 +43,14 @@ protected:
     }
 };
 
+class SilentManager : public FaultOfEachKind
+{
+protected:
+    SilentManager()
+        : FaultOfEachKind(WindowManager::Silent)
+    { }
+};
+
 class CompositorLost : public FaultTest
 {
 protected:
@@ -96,6 +104,26 @@ TEST_P(WindowManagerRestart, leavesEverythingInItsPlace)
 INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, WindowManagerRestart,
     testing::Combine(testing::ValuesIn(eachManager()), testing::ValuesIn(allKinds())),
     managerAndKindName);
+
+// The toolkit believes that it was granted what it has asked for.
+TEST_P(SilentManager, whatIsOnTheScreenIsToldInTheEnd)
+{
+    startKind(GetParam());
+    expectPlacesKnown();
+    const QRect before = toolBar().frame;
+    const auto told = [this] { return host().window(QStringLiteral("toolPanel")).frame; };
+
+    const QPoint handle(before.center().x(), before.top() + 8);
+    desktop().pointer().drag({ handle, handle + QPoint(100, 60) });
+
+    EXPECT_TRUE(waitUntil([&] { return told() != before; }));
+    EXPECT_TRUE(waitUntil([&] { return told() == before; }));
+    EXPECT_EQ(toolBar().frame, before);
+    expectNothingSaid();
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Boards, SilentManager, testing::Values("whiteboard", "imageAnnotation"), kindName);
 
 TEST_F(CompositorLost, underAnOpenOverlayItIsBlackMeanwhileAndShowsWhatIsBelowAgainAfterwards)
 {

@@ -71,6 +71,14 @@ public:
         look();
     }
 
+    /// The desktop says by its own word that the window is at `frame`.
+    void learns(const QRect &frame)
+    {
+        m_seen.frame = frame;
+        m_seen.content = frame.marginsRemoved(m_seen.margins);
+        keep(m_negotiation.learn(m_seen, m_now));
+    }
+
     void setOff(const QRect &target) { keep(m_negotiation.setOff(target, m_now)); }
     void step(const QRect &frame) { keep({ m_negotiation.step(frame) }); }
 

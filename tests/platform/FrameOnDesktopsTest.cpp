@@ -175,6 +175,30 @@ const std::vector<FrameRow> rows {
         "place 300,400 200x100; confirmed; settled; place 301,420 198x75; rescaled; "
         "place 301,410 198x87; rescaled; confirmed; settled",
         asked, Phase::Granted },
+    { "requestThatWasNotGrantedWithoutAWordIsLearned",
+        [](Desk &desk) {
+            desk.settle(asked, none);
+            desk.ask({ 20, 30, 200, 100 });
+            desk.sees({ 20, 30, 200, 100 }, none); // so the toolkit believes
+            desk.wait(1000);
+            desk.learns({ 300, 400, 220, 100 });
+        },
+        "place 20,30 200x100; confirmed; shifted -280,-370; moved; settled; resized; moved; "
+        "settled",
+        { 300, 400, 220, 100 }, Phase::Settled },
+    { "requestThatWasGrantedWithoutAWordIsNoNews",
+        [](Desk &desk) {
+            desk.settle(asked, none);
+            desk.learns(asked);
+        },
+        "", asked, Phase::Settled },
+    { "requestThatIsStillOpenIsNotLearnedOf",
+        [](Desk &desk) {
+            desk.settle(asked, borders);
+            desk.ask({ 20, 30, 200, 100 });
+            desk.learns(asked);
+        },
+        "place 21,50 198x75", { 20, 30, 200, 100 }, Phase::Asked },
     { "halfAPointOfABorderMovesNothing",
         [](Desk &desk) {
             desk.settle(asked, borders, 2.0);

@@ -28,6 +28,11 @@ std::optional<QMargins> NativeDesktop::frameMarginsBeforeShow(QWindow &)
 // NOLINTNEXTLINE(performance-unnecessary-value-param): a desktop that can follow keeps it
 void NativeDesktop::followFrame(QWindow &, FrameListener) { }
 
+std::optional<QRect> NativeDesktop::contentOnScreen(QWindow &) const
+{
+    return std::nullopt;
+}
+
 void NativeDesktop::prepareToShow(QWindow &, const WindowStanding &) { }
 
 void NativeDesktop::forget(WId) { }

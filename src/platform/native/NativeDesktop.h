@@ -9,6 +9,7 @@
 
 #include <QMargins>
 #include <QPoint>
+#include <QRect>
 #include <QWindow>
 
 #include <functional>
@@ -42,6 +43,10 @@ public:
     /// active. Replaces an earlier listener of the same window. Does nothing where the desktop, or
     /// the host, leaves no way to know.
     virtual void followFrame(QWindow &window, FrameListener listener);
+    /// Where the content of `window` is, in device pixels of the desktop: the toolkit takes what it
+    /// has asked for as granted until it hears otherwise, and some desktops say nothing. Nothing
+    /// where the desktop tells by itself, or not at all. Waits for the answer.
+    [[nodiscard]] virtual std::optional<QRect> contentOnScreen(QWindow &window) const;
     /// Tells the desktop how `window`, which exists but has not been shown, is to stand among other
     /// windows. To be told anew before each showing.
     virtual void prepareToShow(QWindow &window, const WindowStanding &standing);

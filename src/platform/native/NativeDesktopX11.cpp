@@ -61,6 +61,11 @@ public:
         m_frames.follow(static_cast<xcb_window_t>(window.winId()), std::move(listener));
     }
 
+    [[nodiscard]] std::optional<QRect> contentOnScreen(QWindow &window) const override
+    {
+        return m_frames.unframedContent(static_cast<xcb_window_t>(window.winId()));
+    }
+
     [[nodiscard]] bool isCompositing() const override
     {
         const auto cookie = xcb_get_selection_owner(m_client.connection(), m_compositor);

@@ -5,7 +5,9 @@
 
 #include <xcb/xcb.h>
 
+#include <array>
 #include <cstdint>
+#include <cstring>
 #include <string_view>
 #include <vector>
 
@@ -33,6 +35,16 @@ public:
     [[nodiscard]] xcb_window_t childOfRootAround(xcb_window_t window) const;
     /// Sends a request to the root, which is where a window manager listens.
     void askManager(xcb_window_t window, xcb_atom_t what, std::uint32_t value = 0) const;
+    /// Sends an event of `window` to the program that has made it, which is this one.
+    template <class Event>
+    void sendToOwnProgram(xcb_window_t window, const Event &event) const
+    {
+        static_assert(sizeof(Event) <= 32);
+        std::array<char, 32> bytes {}; // the server reads as many of each event
+        std::memcpy(bytes.data(), &event, sizeof event);
+        xcb_send_event(m_connection, 0, window, XCB_EVENT_MASK_NO_EVENT, bytes.data());
+        xcb_flush(m_connection);
+    }
 
 private:
     xcb_connection_t *const m_connection;

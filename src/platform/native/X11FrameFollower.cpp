@@ -47,11 +47,15 @@ void X11FrameFollower::forget(xcb_window_t window)
     std::erase_if(m_followed, [window](const Followed &each) { return each.window == window; });
 }
 
+const X11FrameFollower::Followed *X11FrameFollower::find(xcb_window_t window) const
+{
+    const auto place = std::ranges::find(m_followed, window, &Followed::window);
+    return place == m_followed.end() ? nullptr : &*place;
+}
+
 X11FrameFollower::Followed *X11FrameFollower::find(xcb_window_t window)
 {
-    const auto place = std::find_if(m_followed.begin(), m_followed.end(),
-        [window](const Followed &each) { return each.window == window; });
-    return place == m_followed.end() ? nullptr : &*place;
+    return const_cast<Followed *>(std::as_const(*this).find(window));
 }
 
 bool X11FrameFollower::nativeEventFilter(const QByteArray &eventType, void *message, qintptr *)
@@ -132,6 +136,22 @@ void X11FrameFollower::tellCorner(const Followed &followed) const
     const auto reply = owned(xcb_get_geometry_reply(m_client.connection(), cookie, nullptr));
     if (reply)
         followed.listener(QPoint(reply->x, reply->y) + followed.inset);
+}
+
+std::optional<QRect> X11FrameFollower::unframedContent(xcb_window_t window) const
+{
+    const Followed *const followed = find(window);
+    if (!followed || followed->frame != XCB_NONE)
+        return std::nullopt;
+    const auto sizeAsked = xcb_get_geometry(m_client.connection(), window);
+    const auto placeAsked
+        = xcb_translate_coordinates(m_client.connection(), window, m_client.root(), 0, 0);
+    const auto size = owned(xcb_get_geometry_reply(m_client.connection(), sizeAsked, nullptr));
+    const auto place
+        = owned(xcb_translate_coordinates_reply(m_client.connection(), placeAsked, nullptr));
+    if (!size || !place)
+        return std::nullopt;
+    return QRect(place->dst_x, place->dst_y, size->width, size->height);
 }
 
 void X11FrameFollower::onConfigured(const xcb_configure_notify_event_t &event)

@@ -10,8 +10,10 @@
 #include "platform/native/X11Client.h"
 
 #include <QAbstractNativeEventFilter>
+#include <QRect>
 #include <QSize>
 
+#include <optional>
 #include <vector>
 
 namespace penwick::platform {
@@ -27,6 +29,9 @@ public:
 
     void follow(xcb_window_t window, NativeDesktop::FrameListener listener);
     void forget(xcb_window_t window);
+    /// Where the content of `window` is, in device pixels of the desktop, as the server says;
+    /// nothing if it has a frame, which tells by itself.
+    [[nodiscard]] std::optional<QRect> unframedContent(xcb_window_t window) const;
     /// Writes the shape that the content of `window` keeps into the window's hints, and again
     /// whenever the toolkit writes them without it; an empty `content` takes it out. Only for a
     /// followed window.
@@ -46,6 +51,7 @@ private:
     };
 
     [[nodiscard]] Followed *find(xcb_window_t window);
+    [[nodiscard]] const Followed *find(xcb_window_t window) const;
     void onBordersChanged(Followed &followed);
     void listenTo(const Followed &followed) const;
     void measure(Followed &followed) const;

@@ -167,9 +167,7 @@ void X11Standing::letToolkitLook(xcb_window_t window) const
     event.window = window;
     event.atom = m_iconState;
     event.state = XCB_PROPERTY_NEW_VALUE;
-    xcb_send_event(m_client.connection(), 0, window, XCB_EVENT_MASK_PROPERTY_CHANGE,
-        reinterpret_cast<const char *>(&event));
-    xcb_flush(m_client.connection());
+    m_client.sendToOwnProgram(window, event);
 }
 
 bool X11Standing::isIconic(xcb_window_t window) const

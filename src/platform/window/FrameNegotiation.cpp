@@ -137,6 +137,17 @@ FrameEffects FrameNegotiation::look(const FrameObservation &seen, Time now)
     return effects;
 }
 
+// It is not told as what the desktop has chosen, which would be answered by another request: this
+// is the answer to one.
+FrameEffects FrameNegotiation::learn(const FrameObservation &seen, Time now)
+{
+    FrameEffects effects;
+    const QRect outer = outerFrame(seen);
+    if (isAtRest() && !isWhereItBelongs(outer))
+        believe(outer, seen, Cause::Program, now, effects);
+    return effects;
+}
+
 void FrameNegotiation::grant(
     const FrameObservation &seen, bool wasAsked, Time now, FrameEffects &effects)
 {
@@ -235,10 +246,8 @@ QRect FrameNegotiation::outerFrame(const FrameObservation &seen) const
         outer = seen.content;
     else if (m_framing == Framing::Lost) // the next window manager frames the content where it is
         outer = seen.content.marginsAdded(m_margins);
-    if (m_corner) {
-        // The toolkit keeps a screen's corner in device pixels and scales what lies inside it.
-        outer.moveTopLeft(seen.screen + (QPointF(*m_corner - seen.screen) / seen.scale).toPoint());
-    }
+    if (m_corner)
+        outer.moveTopLeft(fromPixels(*m_corner, seen.screen, seen.scale));
     return outer;
 }
 

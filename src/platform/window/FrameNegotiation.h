@@ -126,6 +126,9 @@ public:
     /// The desktop says that the frame around the window on the screen has its top left corner at
     /// `corner`, in device pixels; nothing: it has no frame.
     void hearCorner(std::optional<QPoint> corner, Time now);
+    /// Says what follows where the window is seen at rest as `seen` by the desktop's own word, and
+    /// the toolkit had taken another request for granted.
+    [[nodiscard]] FrameEffects learn(const FrameObservation &seen, Time now);
     /// Says what follows from what is seen of the window on the screen.
     [[nodiscard]] FrameEffects look(const FrameObservation &seen, Time now);
 

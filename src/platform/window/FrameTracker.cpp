@@ -15,13 +15,22 @@
 
 namespace penwick::platform {
 
+namespace {
+
+// After this a desktop that has not granted a request is not just slow.
+constexpr Clock::Time goodWhile { 1000 };
+
+} // namespace
+
 FrameTracker::FrameTracker(QWidget &window)
     : QObject(&window)
     , m_window(window)
     , m_negotiation(window.geometry(), originInDesktop())
     , m_alarm(Clock::ofTheDesktop(), this)
+    , m_doubt(Clock::ofTheDesktop(), this)
 {
     connect(&m_alarm, &Alarm::rang, this, &FrameTracker::look);
+    connect(&m_doubt, &Alarm::rang, this, &FrameTracker::doubt);
     m_window.installEventFilter(this);
     connect(
         qGuiApp, &QGuiApplication::primaryScreenChanged, this, &FrameTracker::followPrimaryScreen);
@@ -181,6 +190,25 @@ void FrameTracker::place(const FramePlacing &placing)
 {
     Q_EMIT asking(placing.content);
     m_window.setGeometry(placing.content);
+    m_doubt.set(Clock::ofTheDesktop().now() + goodWhile);
+}
+
+// The toolkit is told the truth in the only way that it can be: by asking for what is there.
+void FrameTracker::doubt()
+{
+    if (!m_window.isVisible() || m_window.isMinimized())
+        return;
+    const QWindow &native = *m_window.windowHandle();
+    const auto pixels = NativeDesktop::instance().contentOnScreen(*m_window.windowHandle());
+    if (!pixels)
+        return;
+    const double scale = native.devicePixelRatio();
+    const QRect content(fromPixels(pixels->topLeft(), native.screen()->geometry().topLeft(), scale),
+        (QSizeF(pixels->size()) / scale).toSize());
+    if (content == native.geometry())
+        return;
+    m_window.setGeometry(content);
+    carryOut(m_negotiation.learn(observation(), Clock::ofTheDesktop().now()));
 }
 
 void FrameTracker::tell(const FrameNews &news)

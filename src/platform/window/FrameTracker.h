@@ -81,6 +81,7 @@ private:
     void followFrame();
     void lookSoon();
     void look();
+    void doubt();
     void awaitNextLook();
     void carryOut(const FrameEffects &effects);
     void place(const FramePlacing &placing);
@@ -91,6 +92,7 @@ private:
     FrameNegotiation m_negotiation;
     WId m_followed = 0;
     Alarm m_alarm; // for the next look
+    Alarm m_doubt; // when it may be doubted that the desktop has done what it was asked last
 };
 
 } // namespace penwick::platform

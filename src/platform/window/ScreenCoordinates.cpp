@@ -20,6 +20,11 @@ QPoint originInDesktop()
     return { area.x(), area.y() + area.height() };
 }
 
+QPoint fromPixels(QPoint pixels, QPoint screen, double scale)
+{
+    return screen + (QPointF(pixels - screen) / scale).toPoint();
+}
+
 Rect fromDesktop(const QRectF &rect)
 {
     const QPoint origin = originInDesktop();

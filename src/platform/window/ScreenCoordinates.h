@@ -11,6 +11,10 @@ namespace penwick::platform {
 /// The primary screen's bottom left corner in Qt's desktop. It changes when screens come and go.
 [[nodiscard]] QPoint originInDesktop();
 
+/// A place in device pixels, on a screen of `scale` whose corner is `screen`, in Qt's desktop,
+/// which keeps a screen's corner in device pixels and scales what lies inside it.
+[[nodiscard]] QPoint fromPixels(QPoint pixels, QPoint screen, double scale);
+
 /// `rect` of Qt's desktop as a rectangle with y up.
 [[nodiscard]] Rect fromDesktop(const QRectF &rect);
 /// `rect` with y up as a rectangle of Qt's desktop.

@@ -17,9 +17,9 @@ const char *chosenName()
 }
 
 // In the enumeration's order.
-const std::array<ManagerTraits, 5> &allTraits()
+const std::array<ManagerTraits, 6> &allTraits()
 {
-    static const std::array<ManagerTraits, 5> traits {
+    static const std::array<ManagerTraits, 6> traits {
         ManagerTraits { .name = "none" },
         ManagerTraits { .name = "openbox",
             .command = { "openbox", "--sm-disable" },
@@ -43,6 +43,7 @@ const std::array<ManagerTraits, 5> &allTraits()
             .grips = { 3, 0, 3, 3 },
             .environment = { "KWIN_COMPOSE=N", "LIBGL_ALWAYS_SOFTWARE=1" },
             .serverArguments = { "+extension", "GLX", "+extension", "RANDR" } },
+        ManagerTraits { .name = "silent", .command = { PENWICK_SILENT_MANAGER } },
     };
     return traits;
 }

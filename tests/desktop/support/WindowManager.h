@@ -15,7 +15,8 @@ enum class WindowManager
     Openbox,
     Xfwm4,
     Mutter, ///< of the first large desktop
-    Kwin ///< of the second
+    Kwin, ///< of the second
+    Silent ///< the tests' own, which grants nothing and says nothing of it
 };
 
 /// How one is started, and in what it differs from the others.
