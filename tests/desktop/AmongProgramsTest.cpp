@@ -31,8 +31,8 @@ protected:
     [[nodiscard]] bool isAbove(WindowId upper, WindowId lower)
     {
         const std::vector<WindowId> order = desktop().windows().stackingOrder();
-        return std::find(order.begin(), order.end(), lower)
-            < std::find(order.begin(), order.end(), upper);
+        const auto above = std::find(order.begin(), order.end(), upper);
+        return above != order.end() && std::find(order.begin(), above, lower) != above;
     }
 
     [[nodiscard]] std::vector<unsigned long> desktopsOf(WindowId window)
@@ -126,6 +126,12 @@ TEST_P(WindowAmongPrograms, staysOnItsVirtualDesktopWhileItsToolBarIsOnAll)
     EXPECT_FALSE(waitUntil([&] { return !desktop().windows().isShown(bar); }, longerThanAnyAnswer));
     EXPECT_EQ(desktopsOf(bar), std::vector { everyDesktop });
     EXPECT_EQ(desktopsOf(board), std::vector { 0UL });
+    EXPECT_FALSE(desktop().windows().isShown(board));
+
+    desktop().windows().switchToDesktop(0);
+    EXPECT_TRUE(waitUntil([&] { return desktop().windows().isShown(board); }));
+    EXPECT_TRUE(desktop().windows().isShown(bar));
+    expectInk();
 }
 
 INSTANTIATE_TEST_SUITE_P(ManagersAndKinds, WindowAmongPrograms,

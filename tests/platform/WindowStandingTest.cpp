@@ -21,7 +21,17 @@ WindowAttributes board()
 WindowAttributes layer()
 {
     WindowAttributes attributes;
+    attributes.styleMask |= StyleMask::fullSizeContentView;
+    attributes.titlebarAppearsTransparent = true;
+    attributes.titleVisibility = TitleVisibility::hidden;
     attributes.collectionBehavior = everywhere;
+    attributes.level = WindowLevel::mainMenu;
+    return attributes;
+}
+
+WindowAttributes boardAboveAll()
+{
+    WindowAttributes attributes;
     attributes.level = WindowLevel::mainMenu;
     return attributes;
 }
@@ -44,7 +54,7 @@ struct Case
 {
     const char *name;
     WindowAttributes attributes;
-    std::optional<WindowAttributes> outermost;
+    std::optional<WindowAttributes> below;
     WindowStanding standing;
 };
 
@@ -67,7 +77,7 @@ TEST_P(Standing, followsFromTheAttributesAndFromWhatIsBelow)
 {
     const Case &row = GetParam();
 
-    EXPECT_EQ(standingOf(row.attributes, row.outermost ? &*row.outermost : nullptr), row.standing);
+    EXPECT_EQ(standingOf(row.attributes, row.below ? &*row.below : nullptr), row.standing);
 }
 
 INSTANTIATE_TEST_SUITE_P(Table, Standing,
@@ -81,6 +91,9 @@ INSTANTIATE_TEST_SUITE_P(Table, Standing,
             { .isOnAllDesktops = true, .isPanel = true, .isUnmanaged = true } },
         Case { "PopoverOfABoard", popover(), board(), { .isPanel = true } },
         Case { "PopoverOfALayer", popover(), layer(), { .isPanel = true, .isUnmanaged = true } },
+        Case { "BoardOfAHostAboveAll", boardAboveAll(), std::nullopt, {} },
+        Case { "BarOfABoardAboveAll", bar(), boardAboveAll(),
+            { .isOnAllDesktops = true, .isPanel = true } },
         Case { "BoardAboveALayer", board(), layer(), {} }),
     caseName);
 

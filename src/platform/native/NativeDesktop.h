@@ -47,8 +47,8 @@ public:
     /// has asked for as granted until it hears otherwise, and some desktops say nothing. Nothing
     /// where the desktop tells by itself, or not at all. Waits for the answer.
     [[nodiscard]] virtual std::optional<QRect> contentOnScreen(QWindow &window) const;
-    /// Tells the desktop how `window`, which exists but has not been shown, is to stand among other
-    /// windows. To be told anew before each showing.
+    /// Tells the desktop how `window`, which exists but is not on the screen, is to stand among
+    /// other windows. To be told anew before each showing.
     virtual void prepareToShow(QWindow &window, const WindowStanding &standing);
     /// Ends what the two above have begun for `window`, which may be gone.
     virtual void forget(WId window);
@@ -68,7 +68,7 @@ public:
     /// is empty. Is lost when the native window is created anew.
     virtual void keepContentRatio(QWindow &window, const QSize &content);
     /// Says that `content` is the only size of `window`, so that nobody else resizes it; any size
-    /// again where that is empty.
+    /// again where that is empty. Is lost when the native window is created anew.
     virtual void keepContentSize(QWindow &window, const QSize &content);
     /// Applies what the desktop can do of `attributes` once `window` is on the screen, such as
     /// keeping it out of captures.

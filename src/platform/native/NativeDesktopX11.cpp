@@ -97,7 +97,6 @@ public:
         window.setMaximumSize(content.isEmpty() ? largest : content);
     }
 
-    // Nothing on this desktop keeps a window out of a capture; the host has to leave it out.
     void prepareToShow(QWindow &window, const WindowStanding &standing) override
     {
         m_standing.prepare(static_cast<xcb_window_t>(window.winId()), standing);

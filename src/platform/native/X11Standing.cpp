@@ -4,6 +4,7 @@
 #include <QCoreApplication>
 
 #include <algorithm>
+#include <array>
 #include <utility>
 
 namespace penwick::platform {
@@ -37,6 +38,8 @@ void X11Standing::prepare(xcb_window_t window, const WindowStanding &standing)
         m_client.connection(), window, XCB_CW_OVERRIDE_REDIRECT, &overrideRedirect);
     if (standing.isPanel || standing.isLayer)
         writeTypes(window, standing);
+    if (standing.isPanel)
+        refuseKeys(window);
     // Openbox takes a panel's parent along when the panel is asked to be on all desktops, so the
     // panel has to be so from the beginning.
     if (standing.isOnAllDesktops)
@@ -57,6 +60,17 @@ void X11Standing::writeTypes(xcb_window_t window, const WindowStanding &standing
     const xcb_atom_t withoutBorders = m_client.atom("_KDE_NET_WM_WINDOW_TYPE_OVERRIDE");
     m_client.setNumbers(window, m_type, XCB_ATOM_ATOM,
         { own, withoutBorders, m_client.atom("_NET_WM_WINDOW_TYPE_NORMAL") });
+}
+
+// The toolkit says of every window that it takes the keys when it is given them. Window managers
+// would offer such a dialog to whoever goes from window to window by keys.
+void X11Standing::refuseKeys(xcb_window_t window) const
+{
+    constexpr std::uint32_t moreThanThereAre = 64;
+    const xcb_atom_t protocols = m_client.atom("WM_PROTOCOLS");
+    auto known = m_client.numbers(window, protocols, XCB_ATOM_ATOM, moreThanThereAre);
+    if (std::erase(known, m_client.atom("WM_TAKE_FOCUS")) > 0)
+        m_client.setNumbers(window, protocols, XCB_ATOM_ATOM, known);
 }
 
 void X11Standing::forget(xcb_window_t window)
@@ -97,7 +111,7 @@ bool X11Standing::onPropertyChanged(const xcb_property_notify_event_t &event)
     if (event.atom == m_desktop && prepared->awaitsDesktop)
         onDesktopTold(*prepared);
     if (event.atom == m_iconState || event.atom == m_state)
-        return onStateTold(*prepared, event.atom);
+        return onStateTold(*prepared, event);
     return false;
 }
 
@@ -121,14 +135,20 @@ void X11Standing::onReparented(const xcb_reparent_notify_event_t &event)
     raisePanels();
 }
 
-// From those that were shown first to those that were shown over them.
+// Only those that a layer covers: a panel is not to come above a menu or a tool tip. An error means
+// that the layer is just being framed anew, of which there will be another event.
 void X11Standing::raisePanels() const
 {
-    constexpr std::uint32_t above = XCB_STACK_MODE_ABOVE;
-    for (const Prepared &each : m_prepared) {
-        if (each.standing.isUnmanaged)
-            xcb_configure_window(
-                m_client.connection(), each.window, XCB_CONFIG_WINDOW_STACK_MODE, &above);
+    for (const Prepared &panel : m_prepared) {
+        for (const Prepared &layer : m_prepared) {
+            if (!panel.standing.isUnmanaged || !layer.standing.isLayer)
+                continue;
+            const std::array<std::uint32_t, 2> values { layer.frame ? layer.frame : layer.window,
+                XCB_STACK_MODE_TOP_IF };
+            const auto request = xcb_configure_window_checked(m_client.connection(), panel.window,
+                XCB_CONFIG_WINDOW_SIBLING | XCB_CONFIG_WINDOW_STACK_MODE, values.data());
+            xcb_discard_reply(m_client.connection(), request.sequence);
+        }
     }
     xcb_flush(m_client.connection());
 }
@@ -139,8 +159,12 @@ void X11Standing::raisePanels() const
 void X11Standing::onDesktopTold(Prepared &prepared) const
 {
     const auto told = m_client.numbers(prepared.window, m_desktop, XCB_ATOM_CARDINAL, 1);
-    if (told.size() != 1 || told.front() == allDesktops)
+    if (told.size() != 1)
         return;
+    if (told.front() == allDesktops) {
+        prepared.awaitsDesktop = !isManaged(prepared.window); // it is what was written here
+        return;
+    }
     prepared.awaitsDesktop = false;
     for (const std::uint32_t wanted : { told.front(), allDesktops })
         m_client.askManager(prepared.window, m_desktop, wanted);
@@ -150,24 +174,28 @@ void X11Standing::onDesktopTold(Prepared &prepared) const
 // would take it for minimised, and the panels that are on all desktops would go with it. A
 // minimised one is said to be hidden as well, be it before or after. Returns whether the toolkit is
 // not to hear of it.
-bool X11Standing::onStateTold(Prepared &prepared, xcb_atom_t property) const
+bool X11Standing::onStateTold(Prepared &prepared, const xcb_property_notify_event_t &event) const
 {
     const bool isElsewhere = isIconic(prepared.window) && !isSaidToBeHidden(prepared.window)
         && m_client.managerSupports(m_hidden);
-    if (std::exchange(prepared.isElsewhere, isElsewhere) && !isElsewhere && property == m_state)
-        letToolkitLook(prepared.window);
-    return isElsewhere && property == m_iconState;
+    if (std::exchange(prepared.isElsewhere, isElsewhere) && !isElsewhere && event.atom == m_state)
+        letToolkitLook(event);
+    return isElsewhere && event.atom == m_iconState;
 }
 
 // The toolkit looks at a property when it is told that it has changed.
-void X11Standing::letToolkitLook(xcb_window_t window) const
+void X11Standing::letToolkitLook(const xcb_property_notify_event_t &event) const
 {
-    xcb_property_notify_event_t event {};
-    event.response_type = XCB_PROPERTY_NOTIFY;
-    event.window = window;
-    event.atom = m_iconState;
-    event.state = XCB_PROPERTY_NEW_VALUE;
-    m_client.sendToOwnProgram(window, event);
+    xcb_property_notify_event_t told = event;
+    told.atom = m_iconState;
+    m_client.sendToOwnProgram(event.window, told);
+}
+
+bool X11Standing::isManaged(xcb_window_t window) const
+{
+    constexpr std::uint32_t withdrawn = 0;
+    const auto told = m_client.numbers(window, m_iconState, m_iconState, 1);
+    return told.size() == 1 && told.front() != withdrawn;
 }
 
 bool X11Standing::isIconic(xcb_window_t window) const

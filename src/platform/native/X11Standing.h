@@ -12,7 +12,9 @@
 namespace penwick::platform {
 
 /// Writes what window managers read when a window comes to the screen, and sees to it that they do
-/// what was meant. Listens on the application's own connection.
+/// what was meant. Listens on the application's own connection, also to what X11FrameFollower has
+/// asked to hear of frames. In a host whose event loop calls no native event filters it only
+/// writes.
 class X11Standing final : public QAbstractNativeEventFilter
 {
 public:
@@ -42,9 +44,12 @@ private:
     [[nodiscard]] Prepared *find(xcb_window_t window);
     void raisePanels() const;
     void writeTypes(xcb_window_t window, const WindowStanding &standing) const;
+    void refuseKeys(xcb_window_t window) const;
     void onDesktopTold(Prepared &prepared) const;
-    [[nodiscard]] bool onStateTold(Prepared &prepared, xcb_atom_t property) const;
-    void letToolkitLook(xcb_window_t window) const;
+    [[nodiscard]] bool onStateTold(
+        Prepared &prepared, const xcb_property_notify_event_t &event) const;
+    void letToolkitLook(const xcb_property_notify_event_t &event) const;
+    [[nodiscard]] bool isManaged(xcb_window_t window) const;
     [[nodiscard]] bool isIconic(xcb_window_t window) const;
     [[nodiscard]] bool isSaidToBeHidden(xcb_window_t window) const;
 

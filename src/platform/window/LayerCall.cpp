@@ -2,28 +2,30 @@
 #include "platform/window/LayerCall.h"
 
 #include <QEvent>
-#include <QWidget>
 #include <QWindow>
 
 namespace penwick::platform {
 
-void LayerCall::listen(QWindow &panel, QWidget *layer)
+void LayerCall::listen(QWindow *panel)
 {
     if (m_panel)
         m_panel->removeEventFilter(this);
-    m_panel = layer ? &panel : nullptr;
-    m_layer = layer;
+    m_panel = panel;
     if (m_panel)
         m_panel->installEventFilter(this);
 }
 
+// The layer is called for be it active already: the toolkit hears late that it no longer is.
 bool LayerCall::eventFilter(QObject *watched, QEvent *event)
 {
-    const bool isPress = event->type() == QEvent::MouseButtonPress
-        || event->type() == QEvent::TouchBegin || event->type() == QEvent::TabletPress;
-    if (isPress && m_layer) { // be it active already: the toolkit hears late that it no longer is
-        m_layer->raise();
-        m_layer->activateWindow();
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::TabletPress:
+    case QEvent::TouchBegin:
+        Q_EMIT called();
+        break;
+    default:
+        break;
     }
     return QObject::eventFilter(watched, event);
 }

@@ -1,11 +1,10 @@
 // SPDX-License-Identifier: MIT
-// A press on a panel of a layer brings the layer forth.
+// A press on a panel calls for the layer that it belongs to.
 #pragma once
 
 #include <QObject>
 #include <QPointer>
 
-class QWidget;
 class QWindow;
 
 namespace penwick::platform {
@@ -15,16 +14,19 @@ namespace penwick::platform {
 /// have its keys.
 class LayerCall final : public QObject
 {
+    Q_OBJECT
+
 public:
-    /// From now on a press on `panel` calls for `layer`; for nothing if that is null. Ends what was
-    /// asked for before. Each may go at any time.
-    void listen(QWindow &panel, QWidget *layer);
+    /// From now on presses on `panel` call; none do if that is null. The panel may go at any time.
+    void listen(QWindow *panel);
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 
+Q_SIGNALS:
+    void called();
+
 private:
     QPointer<QWindow> m_panel;
-    QPointer<QWidget> m_layer;
 };
 
 } // namespace penwick::platform

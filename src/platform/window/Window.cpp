@@ -37,13 +37,13 @@ std::optional<Size> keptRatio(const WindowAttributes &attributes)
     return isResizable ? attributes.aspectRatio : std::nullopt;
 }
 
-// What `window` stands above in the end; null if it stands above nothing.
-Window *outermostBelow(const Window &window)
+// The nearest of the windows below `window` that may have the keys; null if there is none.
+Window *keyWindowBelow(const Window &window)
 {
-    Window *outermost = window.parentWindow();
-    while (outermost && outermost->parentWindow())
-        outermost = outermost->parentWindow();
-    return outermost;
+    Window *below = window.parentWindow();
+    while (below && !canBecomeKey(below->attributes()))
+        below = below->parentWindow();
+    return below;
 }
 
 } // namespace
@@ -68,6 +68,12 @@ Window::Window(QWidget *parent)
     connect(tracker, &FrameTracker::settled, this, &Window::frameSettled);
     connect(
         d->shape, &WindowShape::corrected, this, [this](const Rect &frame) { setFrame(frame); });
+    connect(&d->layerCall, &LayerCall::called, this, [this] {
+        if (Window *const layer = keyWindowBelow(*this)) {
+            layer->orderFront();
+            layer->activateWindow();
+        }
+    });
     connect(&d->captures, &CaptureExclusion::changed, this,
         &Window::windowsToLeaveOutOfCapturesChanged);
     applyAttributes();
@@ -152,11 +158,11 @@ void Window::applyAttributes()
 
 void Window::standAmongOthers()
 {
-    Window *const outermost = outermostBelow(*this);
+    const Window *const below = keyWindowBelow(*this);
     const WindowStanding standing
-        = standingOf(m_attributes, outermost ? &outermost->m_attributes : nullptr);
+        = standingOf(m_attributes, below ? &below->m_attributes : nullptr);
     NativeDesktop::instance().prepareToShow(*windowHandle(), standing);
-    d->layerCall.listen(*windowHandle(), standing.isUnmanaged ? outermost : nullptr);
+    d->layerCall.listen(standing.isUnmanaged ? windowHandle() : nullptr);
 }
 
 bool Window::showsWhatIsBelow() const

@@ -17,7 +17,8 @@ bool hasVisibleTitleBar(const WindowAttributes &attributes)
 
 bool isLayer(const WindowAttributes &attributes)
 {
-    return canBecomeKey(attributes) && attributes.level > WindowLevel::normal;
+    return canBecomeKey(attributes) && !hasVisibleTitleBar(attributes)
+        && attributes.level > WindowLevel::normal;
 }
 
 } // namespace
@@ -50,14 +51,14 @@ Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes)
     return flags;
 }
 
-WindowStanding standingOf(const WindowAttributes &attributes, const WindowAttributes *outermost)
+WindowStanding standingOf(const WindowAttributes &attributes, const WindowAttributes *below)
 {
     WindowStanding standing;
     standing.isOnAllDesktops
         = attributes.collectionBehavior.testFlag(CollectionBehavior::canJoinAllSpaces);
     standing.isPanel = !canBecomeKey(attributes);
     standing.isLayer = isLayer(attributes);
-    standing.isUnmanaged = standing.isPanel && outermost && isLayer(*outermost);
+    standing.isUnmanaged = standing.isPanel && below && isLayer(*below);
     return standing;
 }
 

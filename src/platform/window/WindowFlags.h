@@ -20,10 +20,9 @@ constexpr CollectionBehaviors everywhere
 /// The window flags, its type included, that `attributes` ask for.
 [[nodiscard]] Qt::WindowFlags windowFlagsFor(const WindowAttributes &attributes);
 
-/// How a window with `attributes` stands among others. `outermost` is what the last one is like
-/// below it, going from each window to the one that it stands above; null where it stands above
-/// none.
+/// How a window with `attributes` stands among others. `below` is what the nearest window that may
+/// have the keys is like, of those that it stands above; null where there is none.
 [[nodiscard]] WindowStanding standingOf(
-    const WindowAttributes &attributes, const WindowAttributes *outermost);
+    const WindowAttributes &attributes, const WindowAttributes *below);
 
 } // namespace penwick::platform
