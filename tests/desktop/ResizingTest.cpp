@@ -83,13 +83,16 @@ protected:
         ASSERT_EQ(frameOnScreen().size(), size);
     }
 
-    [[nodiscard]] static const Pull &pull() { return std::get<Pull>(GetParam()); }
+    [[nodiscard]] static const Pull &edges() { return std::get<Pull>(GetParam()); }
     [[nodiscard]] QRect frameOnScreen() { return desktop().windows().outerFrame(m_window); }
 
     /// Where the mouse takes hold of the frame.
-    [[nodiscard]] QPoint grip() { return gripOf(frameOnScreen(), { pull().x, pull().y }); }
+    [[nodiscard]] QPoint grip() { return gripOf(frameOnScreen(), { edges().x, edges().y }); }
 
-    [[nodiscard]] static QPoint way(int length) { return { pull().x * length, pull().y * length }; }
+    [[nodiscard]] static QPoint way(int length)
+    {
+        return { edges().x * length, edges().y * length };
+    }
 
     /// Whether the window comes to rest 16:9.
     [[nodiscard]] bool comesToRest()
@@ -106,11 +109,11 @@ protected:
     {
         const QRect after = frameOnScreen();
         const int sideways
-            = pull().x < 0 ? after.right() - before.right() : after.left() - before.left();
+            = edges().x < 0 ? after.right() - before.right() : after.left() - before.left();
         const int upright
-            = pull().y < 0 ? after.bottom() - before.bottom() : after.top() - before.top();
-        EXPECT_LE(std::abs(sideways), pull().x ? rounding : wherever);
-        EXPECT_LE(std::abs(upright), pull().y ? rounding : wherever);
+            = edges().y < 0 ? after.bottom() - before.bottom() : after.top() - before.top();
+        EXPECT_LE(std::abs(sideways), edges().x ? rounding : wherever);
+        EXPECT_LE(std::abs(upright), edges().y ? rounding : wherever);
     }
 
 private:
@@ -148,15 +151,14 @@ TEST_P(Resizing, contentKeepsItsShapeUnderTheHandAndTheFrameIsSixteenToNineAfter
     const QSize content = windows.clientArea(board).size();
 
     Pointer &pointer = desktop().pointer();
-    pointer.moveTo(place());
-    pointer.press();
+    pointer.takeHold(place());
     pointer.glideTo(place() + grip().way / 2);
     require([&] { return windows.clientArea(board).size() != content; }, "the first half");
     const QSize halfway = windows.clientArea(board).size();
     pointer.glideTo(place() + grip().way);
     require([&] { return windows.clientArea(board).size() != halfway; }, "the second half");
     const QSize atEnd = windows.clientArea(board).size();
-    pointer.release();
+    pointer.letGo();
 
     EXPECT_LE(offShape(halfway, content), rounding);
     EXPECT_LE(offShape(atEnd, content), rounding);
@@ -176,7 +178,7 @@ TEST_P(Resizing, toolBarKeepsItsPlaceFromTheBottomLeftCornerOrIsPulledInside)
     const Windows &windows = desktop().windows();
     const QPoint before = toolBar().frame.bottomLeft() - boardFrame.bottomLeft();
 
-    desktop().pointer().drag({ place(), place() + grip().way });
+    pull(place(), grip().way);
     require(
         [&] {
             const QSize frame = windows.outerFrame(board).size();
@@ -206,17 +208,17 @@ INSTANTIATE_TEST_SUITE_P(Grips, Resizing,
 
 TEST_P(PulledImage, outwardIsNeverSmallerAndHoldsWhatWasPulled)
 {
-    constexpr int length = 12;
+    constexpr int length = 14; // some begin after as much as a click may tremble
     startOn({ 560, 420 });
     const QRect before = frameOnScreen();
 
-    desktop().pointer().drag({ grip(), grip() + way(length) });
+    pull(grip(), way(length));
 
     require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
     EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
     const QRect after = frameOnScreen();
-    EXPECT_GE(after.width(), before.width() + std::abs(pull().x) * (length - rounding));
-    EXPECT_GE(after.height(), before.height() + std::abs(pull().y) * (length - rounding));
+    EXPECT_GE(after.width(), before.width() + std::abs(edges().x) * (length - rounding));
+    EXPECT_GE(after.height(), before.height() + std::abs(edges().y) * (length - rounding));
     expectOtherEdgesKept(before);
 }
 
@@ -227,7 +229,7 @@ TEST_P(PulledImage, outwardIsNeverSmallerWhereItHasTheShapeAlready)
     startOn({ 640, 360 });
     const QRect before = frameOnScreen();
 
-    desktop().pointer().drag({ grip(), grip() + way(12) });
+    pull(grip(), way(14));
 
     require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
     EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
@@ -241,13 +243,13 @@ TEST_P(PulledImage, inwardFitsIntoWhatWasPulled)
     startOn({ 560, 420 });
     const QRect before = frameOnScreen();
 
-    desktop().pointer().drag({ grip(), grip() - way(length) });
+    pull(grip(), -way(length));
 
     require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
     EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
     const QRect after = frameOnScreen();
-    EXPECT_LE(after.width(), before.width() - std::abs(pull().x) * (length - rounding));
-    EXPECT_LE(after.height(), before.height() - std::abs(pull().y) * (length - rounding));
+    EXPECT_LE(after.width(), before.width() - std::abs(edges().x) * (length - rounding));
+    EXPECT_LE(after.height(), before.height() - std::abs(edges().y) * (length - rounding));
     expectOtherEdgesKept(before);
 }
 
@@ -258,8 +260,7 @@ TEST_P(PulledImage, isNotCorrectedUnderARestingHandAndCountsFromTheFirstFrame)
     const QRect before = frameOnScreen();
     Pointer &pointer = desktop().pointer();
     const QPoint place = grip();
-    pointer.moveTo(place);
-    pointer.press();
+    pointer.takeHold(place);
     pointer.glideTo(place + way(24));
     require([&] { return frameOnScreen().size() != before.size(); }, "the edge to follow");
     const QRect pulled = frameOnScreen();
@@ -271,7 +272,7 @@ TEST_P(PulledImage, isNotCorrectedUnderARestingHandAndCountsFromTheFirstFrame)
         },
         longerThanARest));
     pointer.glideTo(place + way(12));
-    pointer.release();
+    pointer.letGo();
 
     EXPECT_TRUE(comesToRest()) << testing::PrintToString(frameOnScreen());
     EXPECT_GE(frameOnScreen().width(), before.width());
@@ -299,8 +300,7 @@ TEST_P(MovedBoard, takesItsToolBarAlongWhileItIsDragged)
     };
     const QPoint title(900, boardFrame.top() + 10);
     Pointer &pointer = desktop().pointer();
-    pointer.moveTo(title);
-    pointer.press();
+    pointer.takeHold(title);
 
     pointer.glideTo(title + QPoint(-120, 80));
 
@@ -309,7 +309,7 @@ TEST_P(MovedBoard, takesItsToolBarAlongWhileItIsDragged)
     EXPECT_TRUE(barFollows()) << "while the button is held";
     pointer.glideTo(title + QPoint(150, -60));
     EXPECT_TRUE(barFollows()) << "while the button is held";
-    pointer.release();
+    pointer.letGo();
     EXPECT_TRUE(
         waitUntil([&] { return windows.outerFrame(board) == boardFrame.translated(150, -60); }));
     EXPECT_TRUE(barFollows());

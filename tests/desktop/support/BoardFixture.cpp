@@ -97,6 +97,13 @@ QPoint BoardTest::gripOf(const QRect &frame, QPoint side) const
     return place;
 }
 
+void BoardTest::pull(QPoint grip, QPoint way)
+{
+    m_desktop.pointer().takeHold(grip);
+    m_desktop.pointer().glideTo(grip + way);
+    m_desktop.pointer().letGo();
+}
+
 void BoardTest::drag(const std::vector<QPoint> &places, MouseButton button)
 {
     std::vector<QPoint> screenPlaces;

@@ -55,6 +55,9 @@ protected:
     /// edge and 1 for the right one, y -1 for the top edge and 1 for the bottom one, 0 for neither.
     [[nodiscard]] QPoint gripOf(const QRect &frame, QPoint side) const;
 
+    /// Pulls at a frame, so much further right and down.
+    void pull(QPoint grip, QPoint way);
+
     /// Draws, or erases, along `places` on the board.
     void drag(const std::vector<QPoint> &places, MouseButton button = MouseButton::Left);
     void click(QPoint place, MouseButton button = MouseButton::Left);

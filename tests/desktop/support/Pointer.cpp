@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "desktop/support/Pointer.h"
 
+#include "desktop/support/WaitUntil.h"
 #include "desktop/support/XConnection.h"
 
 #include <X11/Xlib.h>
@@ -20,6 +21,7 @@ namespace {
 
 constexpr int stepLength = 4; // pixels between two reports of a mouse moved at a normal speed
 constexpr unsigned long stepTime = 4; // milliseconds; the server keeps the time
+constexpr unsigned long restTime = 100; // likewise
 
 } // namespace
 
@@ -69,6 +71,26 @@ void Pointer::glideTo(QPoint place)
     m_connection.finish();
 }
 
+void Pointer::takeHold(QPoint place)
+{
+    moveTo(place);
+    press();
+    rest();
+}
+
+void Pointer::letGo()
+{
+    rest();
+    release();
+}
+
+void Pointer::rest()
+{
+    const QPoint here = place();
+    XTestFakeMotionEvent(m_connection.display(), -1, here.x(), here.y(), restTime);
+    m_connection.finish();
+}
+
 void Pointer::drag(const std::vector<QPoint> &places, MouseButton button)
 {
     moveTo(places.front());
@@ -79,6 +101,11 @@ void Pointer::drag(const std::vector<QPoint> &places, MouseButton button)
 
 QPoint Pointer::place() const
 {
+    return state().place;
+}
+
+Pointer::State Pointer::state() const
+{
     Window root = 0;
     Window child = 0;
     int x = 0;
@@ -87,7 +114,7 @@ QPoint Pointer::place() const
     unsigned int buttons = 0;
     XQueryPointer(m_connection.display(), m_connection.root(), &root, &child, &x, &y, &ignored,
         &ignored, &buttons);
-    return { x, y };
+    return { { x, y }, buttons };
 }
 
 CursorLook Pointer::look() const
@@ -111,6 +138,16 @@ void Pointer::setButton(MouseButton button, bool isDown)
     XTestFakeButtonEvent(m_connection.display(), static_cast<unsigned int>(button),
         isDown ? True : False, CurrentTime);
     m_connection.finishWithWindowManager();
+    // A window manager that holds the pointer at the press may answer before it lets go. Until then
+    // the server keeps the release, and would tell it with the place to which the pointer is moved
+    // next.
+    if (!isDown)
+        require([&] { return !isPressed(button); }, "the button to be let go");
+}
+
+bool Pointer::isPressed(MouseButton button) const
+{
+    return (state().buttons & (Button1Mask << (static_cast<unsigned int>(button) - 1))) != 0;
 }
 
 } // namespace penwick::desktop

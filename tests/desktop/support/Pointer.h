@@ -44,6 +44,12 @@ public:
     /// Moves from where the pointer is straight to `place`, in the small steps of a hand.
     void glideTo(QPoint place);
 
+    /// Takes hold of a window's frame at `place`: presses there, and rests as a hand does before it
+    /// pulls. A window manager may begin only then, and counts from where the pointer is by then.
+    void takeHold(QPoint place);
+    /// Lets go of it after a rest, so that the window manager is where the hand is.
+    void letGo();
+
     /// Presses at the first of `places`, glides through the others and releases at the last.
     void drag(const std::vector<QPoint> &places, MouseButton button = MouseButton::Left);
 
@@ -51,6 +57,15 @@ public:
     [[nodiscard]] CursorLook look() const;
 
 private:
+    struct State
+    {
+        QPoint place;
+        unsigned int buttons; ///< as the server has them
+    };
+
+    [[nodiscard]] State state() const;
+    [[nodiscard]] bool isPressed(MouseButton button) const;
+    void rest();
     void setButton(MouseButton button, bool isDown);
 
     const XConnection &m_connection;
