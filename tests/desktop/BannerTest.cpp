@@ -95,8 +95,7 @@ TEST_P(Banner, staysWhereItIsWhenTheBoardIsResizedAndIsCentredWhenAskedForAgain)
     announce();
     ASSERT_TRUE(waitUntil([this] { return banner() != 0; }));
 
-    desktop().pointer().drag(
-        { boardFrame.bottomRight() - QPoint(2, 2), boardFrame.bottomRight() - QPoint(162, 92) });
+    pull(gripOf(boardFrame, { 1, 1 }), { -160, -90 });
     require([this] { return canvas().width() < 1200; }, "a smaller board");
     ASSERT_NE(banner(), 0U) << "the drag took longer than the banner is shown";
     EXPECT_EQ(bannerOnScreen(), bannerFrame);
@@ -119,7 +118,7 @@ TEST_P(Banner, followsTheBoardWhenItIsMoved)
     ASSERT_TRUE(waitUntil([this] { return banner() != 0; }));
 
     const QPoint title(boardFrame.center().x() - 200, boardFrame.top() + 10);
-    desktop().pointer().drag({ title, title + QPoint(60, -40) });
+    pull(title, { 60, -40 });
 
     EXPECT_TRUE(
         waitUntil([this] { return bannerOnScreen() == bannerFrame.translated(QPoint(60, -40)); }));

@@ -152,8 +152,7 @@ TEST_P(ImageWindow, keepsTheImageInItsCornerWhenTheUserMakesItLargerAndShowsTheP
     const QImage image = shown(whole);
     const QRect before = desktop().windows().outerFrame(window());
 
-    desktop().pointer().drag(
-        { before.bottomRight() - QPoint(2, 2), before.bottomRight() + QPoint(158, 88) });
+    pull(gripOf(before, { 1, 1 }), { 160, 90 });
 
     ASSERT_TRUE(waitUntil([&] { return canvas().width() > 600; }));
     const auto frame

@@ -24,9 +24,17 @@ protected:
     {
         const QRect wanted = frame().translated(distance, 0);
         const QPoint title(frame().center().x(), frame().top() + 10);
-        desktop().pointer().drag({ title, title + QPoint(distance, 0) });
-        EXPECT_TRUE(waitUntil([&] { return frame() == wanted; }))
+        pull(title, { distance, 0 });
+        EXPECT_TRUE(waitUntil([&] { return isTheSame(frame(), wanted); }))
             << testing::PrintToString(frame());
+    }
+
+    /// Content of an odd number of pixels is no whole number of points where a point is two of
+    /// them: it may then be a pixel smaller.
+    [[nodiscard]] bool isTheSame(const QRect &one, const QRect &wanted)
+    {
+        const QSize lost(m_content.width() % 2, m_content.height() % 2);
+        return one == wanted || one == QRect(wanted.topLeft(), wanted.size() - lost);
     }
 
     [[nodiscard]] QRect frame() { return desktop().windows().outerFrame(m_window); }
@@ -36,6 +44,7 @@ protected:
     {
         m_window = window();
         m_bar = toolBarWindow();
+        m_content = canvas().size();
         const WindowState bar = toolBar();
         m_size = bar.frame.size();
         m_beforeEnd = bar.buttons.value(QStringLiteral("state")) - bar.frame.topLeft()
@@ -64,6 +73,7 @@ private:
     WindowId m_window = 0;
     WindowId m_bar = 0;
     QSize m_size;
+    QSize m_content; // when it was opened
     QPoint m_beforeEnd; // from the tool bar's corner
 };
 
@@ -79,12 +89,12 @@ TEST_P(ScaleChange, leavesAWindowOfTheSamePixelsThatIsDrawnOnAndItsToolBarWhole)
     dragBy(fine.x());
     expectWholeToolBar(2);
     expectInk();
-    EXPECT_EQ(frame(), before.translated(fine.x(), 0));
+    EXPECT_TRUE(isTheSame(frame(), before.translated(fine.x(), 0)));
 
     dragBy(-fine.x());
     expectWholeToolBar(1);
     expectInk();
-    EXPECT_EQ(frame(), before);
+    EXPECT_TRUE(isTheSame(frame(), before));
     expectNothingSaid();
     expectEndByTool();
 }

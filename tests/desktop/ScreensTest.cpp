@@ -136,7 +136,7 @@ TEST_P(Screens, toolBarFollowsTheBoardToTheOtherScreen)
     const QPoint title(layout().board.center().x(), layout().board.top() + 10);
     const QPoint way = layout().monitors.front().center() - layout().board.center();
 
-    desktop().pointer().drag({ title, title + way });
+    pull(title, way);
 
     expectFrame(layout().board.translated(way));
     EXPECT_TRUE(waitUntil([&] {

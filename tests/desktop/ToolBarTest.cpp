@@ -200,7 +200,7 @@ TEST_F(ToolBar, endClosesEverything)
     desktop().pointer().click(centre("state"));
 
     EXPECT_EQ(host().waitForExit(), 0);
-    EXPECT_TRUE(desktop().windows().stackingOrder().empty());
+    EXPECT_TRUE(waitUntil([this] { return desktop().windows().stackingOrder().empty(); }));
     for (const char *const name : { "drawing", "toolPanel", "popover" })
         EXPECT_FALSE(host().window(QLatin1String(name)).isVisible) << name;
     ASSERT_FALSE(host().notifications().empty());

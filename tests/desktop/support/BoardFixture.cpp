@@ -27,6 +27,35 @@ void BoardTest::start(const std::vector<std::string> &arguments, HostProgram pro
 {
     m_host = std::make_unique<HostProcess>(m_desktop, arguments, program, variables);
     m_host->waitForWindow(QStringLiteral("drawing"));
+    if (m_desktop.manager().composes)
+        awaitPainted();
+}
+
+void BoardTest::awaitPainted()
+{
+    constexpr std::chrono::milliseconds longEnough { 2000 };
+    constexpr int strength = 30; // of the border's green, per cent
+    constexpr int near = 10; // of 255 levels
+    constexpr int visible = 20; // likewise
+    constexpr int inside = 8; // pixels, beyond the border also of a fine screen
+    const QRect content = canvas();
+    if (content == m_desktop.windows().outerFrame(window()))
+        return; // a layer, which has no border
+    const QRect corner(content.left(), content.bottom() - inside, inside, inside);
+    if (!QRect(QPoint(), m_desktop.screen().size()).contains(corner))
+        return;
+    // A picture that is not of one colour there does not tell; then the bound is time enough.
+    static_cast<void>(waitUntil(
+        [&] {
+            const QImage seen = m_desktop.screen().picture(corner);
+            const QColor border = seen.pixelColor(1, 0);
+            const QColor within = seen.pixelColor(inside - 1, 0);
+            const int red = within.red() * (100 - strength) / 100;
+            const int green = (within.green() * (100 - strength) + 255 * strength) / 100;
+            return std::abs(border.red() - red) < near && std::abs(border.green() - green) < near
+                && (within.red() - red > visible || green - within.green() > visible);
+        },
+        longEnough));
 }
 
 void BoardTest::open(HostProgram program, const std::vector<std::string> &arguments,

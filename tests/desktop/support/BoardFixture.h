@@ -80,6 +80,10 @@ protected:
     [[nodiscard]] static int darkest(const QImage &image);
 
 private:
+    /// A window manager that composes shows a window later than the server has it, and may let it
+    /// come by and by; until then it takes no press on the frame.
+    void awaitPainted();
+
     Desktop m_desktop;
     std::unique_ptr<HostProcess> m_host;
     int m_settlingStrokes = 0;
