@@ -23,6 +23,21 @@ import time
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 TIME_LIMIT = 120  # seconds for one test; one that waits in vain gives up much earlier
 INPUT_METHODS = 'ibus', 'fcitx5'
+# What a person does with a window, and the tests that do it under each manager, kind by kind.
+KINDS = {'whiteboard': 'board', 'annotation': 'layer', 'imageAnnotation': 'image'}
+WALK = {
+    'opened ten times at the asked frame, to the pixel': 'Opening.tenTimesEndsAtTheAskedFrameEachTime',
+    'drawn on, and ended by END': 'Walk.drawnOnAndEnded',
+    'a colour chosen in the popover': 'Walk.popoverChoosesAColour',
+    'text written': 'Walk.textIsWritten',
+    'the tool bar dragged, and brought back inside': 'Walk.barIsDraggedAndBroughtBackInside',
+    'moved, its tool bar with it': 'FramedWalk.movedWithItsBar',
+    'resized at every edge': 'FramedWalk.resizedAtEveryEdge',
+    'minimised and restored': 'FramedWalk.minimisedAndRestored',
+    'another program activated, the tool bar stays': 'Walk.anotherProgramIsActivatedAndTheBarStays',
+}
+# This one has no kind in its name: it is of the layer.
+FULL_SCREEN = 'LayerAmongPrograms.isEndedWhileAFullScreenProgramIsActive'
 PASSED, KNOWN, FAILED, ABSENT = 'passed', 'known', '**failed**', ''
 
 
@@ -116,6 +131,30 @@ def table(managers, outcomes):
         yield f'| {row} | ' + ' | '.join(cells) + ' |'
 
 
+def walk_cell(test, column):
+    """The kinds for which the test passed, and those for which it did not."""
+    outcomes = {word: next((outcome for row, outcome in column.items()
+                            if row.endswith(f'/{test}/{kind}')), ABSENT)
+                for kind, word in KINDS.items()}
+    passed = [word for word, outcome in outcomes.items() if outcome == PASSED]
+    missing = [word for word, outcome in outcomes.items() if outcome in (KNOWN, FAILED)]
+    return ', '.join(passed + [f'**not {word}**' for word in missing])
+
+
+def walk_table(managers, outcomes):
+    """The table of kinds and doings by manager."""
+    yield '| | ' + ' | '.join(managers) + ' |'
+    yield '|---|' + '---|' * len(managers)
+    for doing, test in WALK.items():
+        yield f'| {doing} | ' + ' | '.join(walk_cell(test, outcomes[m]) for m in managers) + ' |'
+    cells = []
+    for manager in managers:
+        found = next((outcome for row, outcome in outcomes[manager].items()
+                      if row.endswith(f'/{FULL_SCREEN}')), ABSENT)
+        cells.append('layer' if found == PASSED else '**not layer**' if found else '')
+    yield '| a full-screen program beside the layer, END | ' + ' | '.join(cells) + ' |'
+
+
 def main():
     parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
     parser.add_argument('--only', default='', metavar='REGEX')
@@ -129,6 +168,10 @@ def main():
     if not any(outcomes.values()):
         sys.exit('error: no test has such a name')
     lines = list(table(arguments.managers, outcomes))
+    managers = [manager for manager in arguments.managers if manager not in INPUT_METHODS]
+    if any(f'/{test}/' in row for manager in managers for row in outcomes[manager]
+           for test in WALK.values()):
+        lines = [*walk_table(managers, outcomes), '', *lines]
     (arguments.build / 'desktops/table.md').write_text('\n'.join(lines) + '\n')
     print('\n' + '\n'.join(lines))
     sys.exit(any(FAILED in column.values() for column in outcomes.values()))
