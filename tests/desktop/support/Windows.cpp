@@ -188,7 +188,13 @@ bool Windows::isUnmanaged(WindowId window) const
         return false;
     const std::vector<unsigned long> check = numbers(root(), "_NET_SUPPORTING_WM_CHECK");
     const std::vector<unsigned long> process = numbers(window, "_NET_WM_PID");
-    return !process.empty() && (check.empty() || numbers(check.front(), "_NET_WM_PID") != process);
+    // Not every window manager tells its process, but the numbers of all windows of one connection
+    // begin alike.
+    constexpr int ownDigits = 21; // bits, of up to 256 connections
+    const bool isManagers = !check.empty()
+        && (numbers(check.front(), "_NET_WM_PID") == process
+            || check.front() >> ownDigits == window >> ownDigits);
+    return !process.empty() && !isManagers;
 }
 
 bool Windows::canTellFrames() const
