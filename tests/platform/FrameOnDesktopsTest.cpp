@@ -56,6 +56,42 @@ const std::vector<FrameRow> rows {
         "place 301,420 198x75; place 301,420 198x75; moveBegan; shifted -300,-400; moved; settled; "
         "confirmed; shifted 300,400; moved; settled",
         asked, Phase::Granted },
+    { "cornerThatWasToldWithInvisibleBordersAndIsMendedMovesNothing",
+        [](Desk &desk) {
+            desk.show(asked, borders);
+            desk.sees(asked, borders);
+            desk.hears(asked.topLeft() - QPoint(10, 10)); // mutter, before it tells its borders
+            desk.wait(100);
+            desk.hears(asked.topLeft());
+            desk.wait(5000);
+        },
+        "place 301,420 198x75; confirmed; settled; confirmed; settled", asked, Phase::Settled },
+    { "frameThatIsBuiltAroundTheContentTakesItsTitleBarFromIt",
+        [](Desk &desk) {
+            desk.show(asked, none); // KWin does not say what its borders will be
+            desk.sees(asked, none);
+            desk.hears(asked.topLeft() - QPoint(0, 37));
+            desk.sees({ 300, 363, 200, 137 }, { 0, 37, 0, 0 });
+            desk.wait(20);
+            desk.hears(asked.topLeft());
+            desk.sees(asked, { 0, 37, 0, 0 });
+            desk.wait(5000);
+        },
+        "place 300,400 200x100; confirmed; settled; place 300,437 200x63; confirmed; settled",
+        asked, Phase::Settled },
+    { "tiledWindowIsAskedForOnceMoreAndThenLeftToItsDesktop",
+        [](Desk &desk) {
+            desk.show(asked, borders);
+            desk.sees({ 0, 0, 640, 800 }, borders);
+            desk.hears(QPoint(0, 0));
+            desk.wait(5000);
+            desk.sees({ 0, 0, 640, 745 }, borders); // another program has opened
+            desk.wait(5000);
+        },
+        "place 301,420 198x75; place 301,420 198x75; resized; resizedByDesktop 300,400 200x100; "
+        "moved; "
+        "settled; resized; resizedByUser; settled",
+        { 0, 0, 640, 745 }, Phase::Settled },
     { "windowManagerThatEndsMovesNothing",
         [](Desk &desk) {
             desk.settle(asked, borders);
