@@ -50,7 +50,7 @@ protected:
     /// What is nearly `color` within `area`, in the board's places.
     [[nodiscard]] QRect extentOf(const QColor &color, const QRect &area);
 
-    static constexpr QPoint farAway { 850, 60 };
+    static constexpr QPoint farAway { 830, 60 };
 };
 
 } // namespace penwick::desktop
