@@ -50,7 +50,7 @@ public:
     /// Tells the desktop how `window`, which exists but is not on the screen, is to stand among
     /// other windows. To be told anew before each showing.
     virtual void prepareToShow(QWindow &window, const WindowStanding &standing);
-    /// Ends what the two above have begun for `window`, which may be gone.
+    /// Ends what followFrame() and prepareToShow() have begun for `window`, which may be gone.
     virtual void forget(WId window);
 
     /// Whether the desktop itself can keep a window out of captures of the screen.

@@ -14,7 +14,11 @@ namespace {
 constexpr std::uint32_t allDesktops = 0xFFFFFFFF;
 
 constexpr std::uint8_t sentByAnotherClient = 0x80;
-constexpr std::uint32_t moreStatesThanThereAre = 64;
+constexpr std::uint32_t moreThanThereAre = 64; // states of a window, and protocols
+
+// What a window manager says of a window.
+constexpr std::uint32_t withdrawn = 0;
+constexpr std::uint32_t iconic = 3;
 
 } // namespace
 
@@ -66,7 +70,6 @@ void X11Standing::writeTypes(xcb_window_t window, const WindowStanding &standing
 // would offer such a dialog to whoever goes from window to window by keys.
 void X11Standing::refuseKeys(xcb_window_t window) const
 {
-    constexpr std::uint32_t moreThanThereAre = 64;
     const xcb_atom_t protocols = m_client.atom("WM_PROTOCOLS");
     auto known = m_client.numbers(window, protocols, XCB_ATOM_ATOM, moreThanThereAre);
     if (std::erase(known, m_client.atom("WM_TAKE_FOCUS")) > 0)
@@ -162,7 +165,8 @@ void X11Standing::onDesktopTold(Prepared &prepared) const
     if (told.size() != 1)
         return;
     if (told.front() == allDesktops) {
-        prepared.awaitsDesktop = !isManaged(prepared.window); // it is what was written here
+        prepared.awaitsDesktop
+            = managedState(prepared.window) == withdrawn; // it is what was written here
         return;
     }
     prepared.awaitsDesktop = false;
@@ -176,8 +180,8 @@ void X11Standing::onDesktopTold(Prepared &prepared) const
 // not to hear of it.
 bool X11Standing::onStateTold(Prepared &prepared, const xcb_property_notify_event_t &event) const
 {
-    const bool isElsewhere = isIconic(prepared.window) && !isSaidToBeHidden(prepared.window)
-        && m_client.managerSupports(m_hidden);
+    const bool isElsewhere = managedState(prepared.window) == iconic
+        && !isSaidToBeHidden(prepared.window) && m_client.managerSupports(m_hidden);
     if (std::exchange(prepared.isElsewhere, isElsewhere) && !isElsewhere && event.atom == m_state)
         letToolkitLook(event);
     return isElsewhere && event.atom == m_iconState;
@@ -191,23 +195,15 @@ void X11Standing::letToolkitLook(const xcb_property_notify_event_t &event) const
     m_client.sendToOwnProgram(event.window, told);
 }
 
-bool X11Standing::isManaged(xcb_window_t window) const
+std::uint32_t X11Standing::managedState(xcb_window_t window) const
 {
-    constexpr std::uint32_t withdrawn = 0;
     const auto told = m_client.numbers(window, m_iconState, m_iconState, 1);
-    return told.size() == 1 && told.front() != withdrawn;
-}
-
-bool X11Standing::isIconic(xcb_window_t window) const
-{
-    constexpr std::uint32_t iconic = 3;
-    const auto told = m_client.numbers(window, m_iconState, m_iconState, 1);
-    return told.size() == 1 && told.front() == iconic;
+    return told.empty() ? withdrawn : told.front();
 }
 
 bool X11Standing::isSaidToBeHidden(xcb_window_t window) const
 {
-    const auto states = m_client.numbers(window, m_state, XCB_ATOM_ATOM, moreStatesThanThereAre);
+    const auto states = m_client.numbers(window, m_state, XCB_ATOM_ATOM, moreThanThereAre);
     return std::ranges::find(states, m_hidden) != states.end();
 }
 

@@ -49,8 +49,7 @@ private:
     [[nodiscard]] bool onStateTold(
         Prepared &prepared, const xcb_property_notify_event_t &event) const;
     void letToolkitLook(const xcb_property_notify_event_t &event) const;
-    [[nodiscard]] bool isManaged(xcb_window_t window) const;
-    [[nodiscard]] bool isIconic(xcb_window_t window) const;
+    [[nodiscard]] std::uint32_t managedState(xcb_window_t window) const;
     [[nodiscard]] bool isSaidToBeHidden(xcb_window_t window) const;
 
     const X11Client &m_client;
